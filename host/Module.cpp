@@ -1,0 +1,176 @@
+#include <dlfcn.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <climits>
+#include <filesystem>
+#include <utility>
+
+#include "host/Plumbing.h"
+#include "host/ZORSolver.h"
+
+namespace {
+
+constexpr char kNumbers[] = "ZORVadNumbers";
+constexpr char kEntry[] = "InitModule";
+
+using Entry = int (*)(ZORVaDoModule* module, ZORVaDoModuleManager* manager);
+
+constinit ZORVaDoModule* sInUse = nullptr;            // the module that is being taken into use
+constinit ZORVaDoModuleManager* sManagers = nullptr;  // those that are alive
+
+// While it lives, new descriptors belong to module, or to nobody when that is null.
+class TakingIntoUse {
+ public:
+  explicit TakingIntoUse(ZORVaDoModule* module) : mBefore(std::exchange(sInUse, module)) {}
+  ~TakingIntoUse() { sInUse = mBefore; }
+  TakingIntoUse(const TakingIntoUse&) = delete;
+  TakingIntoUse& operator=(const TakingIntoUse&) = delete;
+
+ private:
+  ZORVaDoModule* mBefore;
+};
+
+std::string ProgramFolder() {
+  std::error_code error;
+  return std::filesystem::read_symlink("/proc/self/exe", error).parent_path().string();
+}
+
+// Descriptors among the static objects of a library are the library's own.
+void* OpenLibrary(const std::string& file) {
+  const TakingIntoUse nobody(nullptr);
+  return dlopen(file.c_str(), RTLD_NOW | RTLD_LOCAL);
+}
+
+// The loader's last complaint about file, which it often opens with the name of the file.
+std::string LoaderReason(const std::string& file) {
+  const char* text = dlerror();
+  std::string reason = text != nullptr ? text : "unknown reason";
+  if (reason.starts_with(file + ": ")) reason.erase(0, file.size() + 2);
+  return reason;
+}
+
+std::string TextOf(const ZORString& string) {
+  return std::string(string.CastToCharPtr(), static_cast<std::size_t>(string.GetLengthInChar()));
+}
+
+}  // namespace
+
+ZORVaDoModule::ZORVaDoModule(const ZORString& name) : mName(name) {}
+
+ZORVaDoModule::~ZORVaDoModule() {
+  while (!mMade.empty()) delete mMade.back();
+}
+
+void ZORVaDoModule::AddLoadedModule(ZORVaDoModule* module) {
+  if (module != nullptr) mLoadedModules.push_back(module);
+}
+
+void ZORVaDoModule::AddObjectDescriptor(const ZORVaDoObjectDescriptor* descriptor) {
+  if (descriptor != nullptr) mDescriptors.push_back(descriptor);
+}
+
+const ZORVaDoObjectDescriptor* ZORVaDoModule::FindDescriptor(const ZORString& displayName) const {
+  const auto found = std::find_if(mDescriptors.begin(), mDescriptors.end(),
+                                  [&](const auto* descriptor) { return descriptor->GetName() == displayName; });
+  return found != mDescriptors.end() ? *found : nullptr;
+}
+
+void ZORVaDoModule::Adopt(ZORVaDoObjectDescriptor& descriptor) {
+  if (sInUse == nullptr) return;
+  descriptor.mOwner = sInUse;
+  sInUse->mMade.push_back(&descriptor);
+}
+
+void ZORVaDoModule::Forget(const ZORVaDoObjectDescriptor& descriptor) {
+  std::erase(mMade, &descriptor);
+  std::erase(mDescriptors, &descriptor);
+}
+
+void ZORVaDoModule::Bequeath(ZORVaDoModule& heir) {
+  for (ZORVaDoObjectDescriptor* descriptor : mMade) descriptor->mOwner = &heir;
+  heir.mMade.insert(heir.mMade.end(), mMade.begin(), mMade.end());
+  mMade.clear();
+}
+
+ZORVaDoModuleManager::ZORVaDoModuleManager() : mSearchPath{ProgramFolder()}, mNext(std::exchange(sManagers, this)) {}
+
+ZORVaDoModuleManager::~ZORVaDoModuleManager() {
+  ZORVaDoModuleManager** link = &sManagers;
+  while (*link != this) link = &(*link)->mNext;
+  *link = mNext;
+  while (!mOpened.empty()) {
+    const Opened last = mOpened.back();
+    mOpened.pop_back();
+    Unload(last);
+  }
+}
+
+void ZORVaDoModuleManager::AddSearchPath(const ZORString& folder) { mSearchPath.push_back(TextOf(folder)); }
+
+ZORVaDoModule* ZORVaDoModuleManager::OpenModule(const ZORString& name) {
+  mFailure = ZORString();
+  for (const Opened& opened : mOpened) {
+    if (opened.module->GetName() == name) return opened.module;
+  }
+  if (name == kNumbers) return OpenNumbers(name);
+  const std::string file = "lib" + TextOf(name) + ".so";
+  if (name == "" || file.find('/') != std::string::npos) return Fail(file, "not the name of a module");
+  for (const std::string& folder : mSearchPath) {
+    const std::string path = folder + "/" + file;
+    if (access(path.c_str(), F_OK) == 0) return Load(name, path);
+  }
+  return Fail(file, "not found in the search path");
+}
+
+ZORVaDoModule* ZORVaDoModuleManager::OpenNumbers(const ZORString& name) {
+  auto* module = new ZORVaDoModule(name);
+  zorhost::AddNumberDescriptors(*module);
+  mOpened.push_back({module, nullptr});
+  return module;
+}
+
+ZORVaDoModule* ZORVaDoModuleManager::Load(const ZORString& name, const std::string& file) {
+  void* library = OpenLibrary(file);
+  if (library == nullptr) return Fail(file, LoaderReason(file));
+  const Opened opened{new ZORVaDoModule(name), library};
+  mOpened.push_back(opened);  // already now: what it needs may need it in turn
+  std::string reason = TakeIntoUse(*opened.module, library);
+  const auto place =
+      std::find_if(mOpened.begin(), mOpened.end(), [&](const Opened& other) { return other.module == opened.module; });
+  if (reason.empty()) {
+    std::rotate(place, place + 1, mOpened.end());  // behind what it needs, so that it goes first
+    return opened.module;
+  }
+  mOpened.erase(place);
+  for (const Opened& other : mOpened) std::erase(other.module->mLoadedModules, opened.module);
+  Unload(opened);
+  return Fail(file, reason);
+}
+
+// Answers why it cannot be used.
+std::string ZORVaDoModuleManager::TakeIntoUse(ZORVaDoModule& module, void* library) {
+  const auto entry = reinterpret_cast<Entry>(dlsym(library, kEntry));
+  if (entry == nullptr) return std::string("has no ") + kEntry;
+  const TakingIntoUse scope(&module);
+  if (entry(&module, this) != 0) return "";
+  const std::string cause = mFailure == "" ? "" : " (" + TextOf(mFailure) + ")";
+  return std::string(kEntry) + " answered 0" + cause;
+}
+
+// A library stays loaded while another manager uses it, and so must the descriptors made from it.
+void ZORVaDoModuleManager::Unload(const Opened& opened) {
+  for (const auto* manager = sManagers; manager != nullptr && opened.library != nullptr; manager = manager->mNext) {
+    for (const Opened& other : manager->mOpened) {
+      if (other.library == opened.library) opened.module->Bequeath(*other.module);
+    }
+  }
+  delete opened.module;
+  if (opened.library != nullptr) dlclose(opened.library);
+}
+
+ZORVaDoModule* ZORVaDoModuleManager::Fail(const std::string& file, const std::string& reason) {
+  const std::string text = file + ": " + reason;
+  mFailure = ZORString(text.data(), text.size());
+  return nullptr;
+}

@@ -1,0 +1,262 @@
+// The Boolean and the integer domains, the types of the built-in module "ZORVadNumbers": "single boolean",
+// "single integer", "interval integer" and "enum integer".
+//
+// Every operation narrows by intersection, keeping each number or truth value that the relation still allows as far
+// as the class can tell. A Nil operand makes the target Nil; one of another kind (no integer, no Boolean) leaves it
+// as it is and gives the answer 0, but makes the target of Assign, Intersect and Unite Nil. The relations into a
+// Boolean leave it alone while they are open.
+//
+// Text forms: Nil, Any, true, false, 7, 2..9, { 1, 5 }. Whatever else is read gives Nil.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <vector>
+
+#include "host/ZORSolver.h"
+
+class ZORIntegerSet;
+
+// DynamicCast answers null for a null pointer and for an object of another class.
+#define ZOR_DECLARE_TYPE_TEST(Class)                          \
+ public:                                                      \
+  static const char* const sIdent;                            \
+  static Class* DynamicCast(ZORVaDoBase* object);             \
+  static const Class* DynamicCast(const ZORVaDoBase* object); \
+                                                              \
+ protected:                                                   \
+  int IsDerivedFrom(const char* ident) const override
+
+// A class that values can have. sDescriptor is never null.
+#define ZOR_DECLARE_NUMBER_CLASS(Class)                    \
+  ZOR_DECLARE_TYPE_TEST(Class);                            \
+                                                           \
+ public:                                                   \
+  static const ZORVaDoObjectDescriptor* const sDescriptor; \
+  const char* CastableID() const override;                 \
+  const ZORVaDoObjectDescriptor* GetDescriptor() const override
+
+// A truth value. False is less than true.
+class ZOR_EXPORT ZORVaDoBoolean : public ZORVaDoAny {
+  ZOR_DECLARE_TYPE_TEST(ZORVaDoBoolean);
+
+ public:
+  virtual int CalcFalseValue() = 0;
+  virtual int CalcTrueValue() = 0;
+
+  // Takes in the truth of a relation: open when it can be either, a contradiction when it can be neither.
+  int CalcOutcome(bool canBeFalse, bool canBeTrue);
+};
+
+class ZOR_EXPORT ZORVadSingleBoolean : public ZORVaDoBoolean {
+  ZOR_DECLARE_NUMBER_CLASS(ZORVadSingleBoolean);
+
+ public:
+  ZORVadSingleBoolean() = default;
+  explicit ZORVadSingleBoolean(ZORStreamableInit) {}
+
+  void Write(ZORopstream& out) const override;
+  void Read(ZORipstream& in) override;
+  void PrintOn(ZORostrstream& out) const override;
+  void InputValue(ZORistrstream& in) override;
+
+  // clang-format off
+  void          Assign           (const ZORVaDoAny& other) override;
+  void          SetNilValue      () override;
+  void          SetUndefinedValue() override;
+  int           IsNil            () const override;
+  int           IsUndefined      () const override;
+  int           IsIntersected    (const ZORVaDoAny& other) const override;
+  void          Intersect        (const ZORVaDoAny& other) override;
+  void          Unite            (const ZORVaDoAny& other) override;
+  unsigned long GetCardinality   () const override;
+  void          Bisect           (ZORVaDoObject& other, ValueSelection selection) override;
+
+  int CalcMinValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) override;
+  int CalcMinValue                     () override;
+  int CalcMaxValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) override;
+  int CalcMaxValue                     () override;
+  int CalcEqualValue                   (const ZORVaDoAny& other) override;
+  int CalcInverseEqualValue            (ZORVaDoAny& target) const override;
+  int CalcUnequalValue                 (const ZORVaDoAny& other) override;
+  int CalcInverseUnequalValue          (ZORVaDoAny& target) const override;
+  int CalcIsEqual                      (const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
+  int CalcLessOrEqualValue             (const ZORVaDoAny& other) override;
+  int CalcInverseLessOrEqualValue      (ZORVaDoAny& target) const override;
+  int CalcNotLessAndUnequalValue       (const ZORVaDoAny& other) override;
+  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;
+  int CalcIsLessOrEqual                (const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
+  int CalcFirstInverseMinValue         (ZORVaDoAny& target, const ZORVaDoAny& second) const override;
+  int CalcFirstInverseMaxValue         (ZORVaDoAny& target, const ZORVaDoAny& second) const override;
+  int CalcFalseValue                   () override;
+  int CalcTrueValue                    () override;
+  // clang-format on
+
+ private:
+  static constexpr unsigned kNone = 0, kFalse = 1, kTrue = 2, kEither = kFalse | kTrue;
+
+  int Keep(unsigned truths);
+
+  unsigned mTruths = kEither;
+};
+
+// An integer of 32 bits. Nil: no number is possible; Undefined: every number is. An order relation learns nothing
+// from an Undefined operand: it would only shave the ends off the range of all numbers, one by one.
+class ZOR_EXPORT ZORVaDoInteger : public ZORVaDoScalar {
+  ZOR_DECLARE_TYPE_TEST(ZORVaDoInteger);
+
+ public:
+  void Write(ZORopstream& out) const override;
+  void Read(ZORipstream& in) override;
+  void PrintOn(ZORostrstream& out) const override;
+  void InputValue(ZORistrstream& in) override;
+
+  // clang-format off
+  void Assign       (const ZORVaDoAny& other) override;  // as close as the class can hold it, never less
+  int  IsIntersected(const ZORVaDoAny& other) const override;
+  void Intersect    (const ZORVaDoAny& other) override;
+  void Unite        (const ZORVaDoAny& other) override;
+  void Bisect       (ZORVaDoObject& other, ValueSelection selection) override;  // other takes what goes
+
+  int CalcMinValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) override;
+  int CalcMinValue                     () override;  // the least of all numbers
+  int CalcMaxValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) override;
+  int CalcMaxValue                     () override;  // the greatest
+  int CalcEqualValue                   (const ZORVaDoAny& other) override;
+  int CalcInverseEqualValue            (ZORVaDoAny& target) const override;
+  int CalcUnequalValue                 (const ZORVaDoAny& other) override;
+  int CalcInverseUnequalValue          (ZORVaDoAny& target) const override;
+  int CalcIsEqual                      (const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
+  int CalcLessOrEqualValue             (const ZORVaDoAny& other) override;
+  int CalcInverseLessOrEqualValue      (ZORVaDoAny& target) const override;
+  int CalcNotLessAndUnequalValue       (const ZORVaDoAny& other) override;
+  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;
+  int CalcIsLessOrEqual                (const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
+  int CalcFirstInverseMinValue         (ZORVaDoAny& target, const ZORVaDoAny& second) const override;
+  int CalcFirstInverseMaxValue         (ZORVaDoAny& target, const ZORVaDoAny& second) const override;
+
+  int CalcLessValue          (const ZORVaDoScalar& other) override;
+  int CalcInverseLessValue   (ZORVaDoScalar& target) const override;
+  int CalcNotLessValue       (const ZORVaDoScalar& other) override;
+  int CalcInverseNotLessValue(ZORVaDoScalar& target) const override;
+  int CalcIsLess             (const ZORVaDoScalar& other, ZORVaDoBoolean& result) const override;
+  int CalcNextValue          (const ZORVaDoScalar& other) override;
+  int CalcInverseNextValue   (ZORVaDoScalar& target) const override;
+  // clang-format on
+
+  virtual void SetExactValue(ZORLong value);
+  virtual ZORLong GetExactValue() const;  // of several the greatest, so that below 0 means that all are
+
+  // The next possible number from a value on, upwards or downwards; where there is none, one above or below all
+  // numbers.
+  virtual std::int64_t FindAtLeast(std::int64_t value) const = 0;
+  virtual std::int64_t FindAtMost(std::int64_t value) const = 0;
+
+ protected:
+  // The rest of what a class of integers is made of. Keep drops what is not allowed, as far as the class can tell;
+  // allowed may be a view of *this. Join adds the numbers of other, where both have some but not all. The forms are
+  // those of a value that is neither Nil nor Undefined; those that read find the value Nil.
+  virtual int Keep(const ZORIntegerSet& allowed) = 0;
+  virtual void Join(const ZORVaDoInteger& other) = 0;
+  virtual void PrintKnown(ZORostrstream& out) const = 0;
+  virtual void InputKnown(ZORistrstream& in) = 0;
+  virtual void WriteKnown(ZORopstream& out) const = 0;
+  virtual void ReadKnown(ZORipstream& in) = 0;
+
+ private:
+  int KeepEqual(const ZORVaDoInteger& other);
+};
+
+// Overrides of what a class of integers is made of.
+#define ZOR_DECLARE_INTEGER_CLASS(Class)                       \
+  ZOR_DECLARE_NUMBER_CLASS(Class);                             \
+                                                               \
+ public:                                                       \
+  Class();                                                     \
+  explicit Class(ZORStreamableInit);                           \
+  void SetNilValue() override;                                 \
+  void SetUndefinedValue() override;                           \
+  int IsNil() const override;                                  \
+  int IsUndefined() const override;                            \
+  unsigned long GetCardinality() const override;               \
+  std::int64_t FindAtLeast(std::int64_t value) const override; \
+  std::int64_t FindAtMost(std::int64_t value) const override;  \
+                                                               \
+ protected:                                                    \
+  int Keep(const ZORIntegerSet& allowed) override;             \
+  void Join(const ZORVaDoInteger& other) override;             \
+  void PrintKnown(ZORostrstream& out) const override;          \
+  void InputKnown(ZORistrstream& in) override;                 \
+  void WriteKnown(ZORopstream& out) const override;            \
+  void ReadKnown(ZORipstream& in) override
+
+// No number, one, or all.
+class ZOR_EXPORT ZORVadSingleInteger : public ZORVaDoInteger {
+  ZOR_DECLARE_INTEGER_CLASS(ZORVadSingleInteger);
+
+ public:
+  static const ZORLong sNC_INT_ANY;  // the least number, and what an integer without a number holds
+
+  ZORLong GetValue() const { return mValue; }
+  void SetExactValue(ZORLong value) override;  // whatever was held
+
+ private:
+  enum State { kExact, kAny, kNil };
+
+  void Become(State state, ZORLong value);
+
+  State mState = kAny;
+  ZORLong mValue = sNC_INT_ANY;
+};
+
+// All numbers from a lower to an upper end.
+class ZOR_EXPORT ZORVadIntervalInteger : public ZORVaDoInteger {
+  ZOR_DECLARE_INTEGER_CLASS(ZORVadIntervalInteger);
+
+ public:
+  ZORVadIntervalInteger(ZORLong lower, ZORLong upper);  // Nil when lower is above upper
+
+  ZORLong GetLower() const { return mLower; }
+  ZORLong GetUpper() const { return mUpper; }
+
+ private:
+  void Become(std::int64_t lower, std::int64_t upper);
+
+  ZORLong mLower = INT32_MIN;
+  ZORLong mUpper = INT32_MAX;
+};
+
+// Numbers in ascending order, each once.
+class ZOR_EXPORT ZORSVectorImp_SubIntBase {
+ public:
+  std::size_t Count() const { return mValues.size(); }
+  std::vector<ZORLong>::const_iterator begin() const { return mValues.begin(); }
+  std::vector<ZORLong>::const_iterator end() const { return mValues.end(); }
+  std::vector<ZORLong>::const_iterator FindLowerBound(std::int64_t value) const;  // first number not below value
+  void Insert(ZORLong value);
+  void Flush() { mValues.clear(); }
+
+ private:
+  std::vector<ZORLong> mValues;
+};
+
+// Any numbers, up to kListLimit of them; one more makes it Undefined.
+class ZOR_EXPORT ZORVadEnumInteger : public ZORVaDoInteger {
+  ZOR_DECLARE_INTEGER_CLASS(ZORVadEnumInteger);
+
+ public:
+  static constexpr std::size_t kListLimit = 4096;
+
+  using ZORVaDoInteger::Intersect;
+  void Insert(ZORLong value);
+  int Intersect(const ZORVadEnumInteger& other);
+  int IntersectInverse(ZORVadSingleInteger& target) const;
+  int IntersectInverse(ZORVadIntervalInteger& target) const;
+  const ZORSVectorImp_SubIntBase& GetValues() const { return mValues; }  // none when Undefined
+
+ private:
+  int List(const ZORIntegerSet& allowed);
+
+  bool mAny = true;
+  ZORSVectorImp_SubIntBase mValues;
+};

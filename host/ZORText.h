@@ -1,0 +1,235 @@
+// Texts and streams: characters, strings, the registry of streamable classes, binary streams for stored
+// networks and text streams for people. No class here throws; lengths and positions count characters from 0.
+#pragma once
+
+#include <compare>
+#include <cstddef>
+#include <cstdint>
+#include <cstring>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <vector>
+
+#include "host/ZORExport.h"
+
+// The solver's integer: 32 bits, signed, on every machine.
+using ZORLong = std::int32_t;
+
+// One character.
+class ZOR_EXPORT ZORChar {
+ public:
+  ZORChar(char code) : mCode(code) {}  // NOLINT(google-explicit-constructor): a character is its code
+  ZORChar(const ZORChar& other);
+  ZORChar& operator=(const ZORChar& other);
+  virtual ~ZORChar();
+
+  operator char() const { return mCode; }  // NOLINT(google-explicit-constructor)
+
+ private:
+  char mCode;
+};
+
+ZOR_EXPORT bool operator==(const ZORChar& a, const ZORChar& b);
+
+// A text with value semantics. Up to kInline characters live inside the object; longer ones on the heap, but for
+// the runs of 'z' that stand for "greatest" and "unknown" all over a network: those share one block of constants.
+// The order is lexicographic by unsigned character code, a prefix before its extensions.
+// Memory that cannot be had ends the process with a message, since a lost text would be a wrong answer.
+class ZOR_EXPORT ZORString {
+ public:
+  ZORString() noexcept;
+  ZORString(const ZORString& other);
+  ZORString(ZORString&& other) noexcept;  // other is empty afterwards
+  ZORString(const char* text);            // NOLINT(google-explicit-constructor): zero-ended, copied; null is empty
+  ZORString(const ZORChar& c, std::size_t count);
+  ZORString(const char* text, std::size_t length);
+  ~ZORString();
+  ZORString& operator=(const ZORString& other);
+  ZORString& operator=(ZORString&& other) noexcept;
+
+  static void* operator new(std::size_t size);  // never answers null
+  static void* operator new(std::size_t, void* place) noexcept { return place; }
+  static void operator delete(void* memory) noexcept;
+
+  bool operator==(const ZORString& other) const;
+  bool operator==(const char* text) const;
+  std::strong_ordering operator<=>(const ZORString& other) const;
+
+  const ZORChar operator[](int position) const;  // the zero character outside the text
+  int GetLengthInChar() const { return static_cast<int>(mLength); }
+  const char* CastToCharPtr() const { return mCapacity == kInside ? mInside : mOutside; }  // zero-ended, stays ours
+
+  ZORString& Append(const ZORString& tail);  // tail may be *this
+  // Empty when start lies outside the text or length was negative before it was widened; cut at the end.
+  ZORString SubString(std::size_t start, std::size_t length) const;
+  // First position at or after start where pattern stands, -1 when nowhere; the empty pattern stands at start.
+  int FindPosition(const ZORString& pattern, int start) const;
+  void ReplaceSubString(int start, int length, const ZORString& text);
+  void ToLower();  // changes the 26 letters alone, whatever the locale
+  void ToUpper();
+
+ private:
+  static constexpr std::size_t kRoom = 32;
+  static constexpr int kInline = kRoom - 1;
+  static constexpr std::uint32_t kInside = 0, kShared = UINT32_MAX;  // else mCapacity is the size of our own block
+
+  std::string_view View() const { return {CastToCharPtr(), mLength}; }
+  bool IsOwner() const { return mCapacity != kInside && mCapacity != kShared; }
+  void Extend(std::string_view text);
+  void FlipCase(char first, char last);
+  char* Reserve(std::size_t length);
+  void SetLength(std::size_t length);
+  void Mirror(const ZORString& other) noexcept;
+  void Take(ZORString& other) noexcept;
+  void Release() noexcept;
+
+  union {
+    char mInside[kRoom];
+    char* mOutside;
+  };
+  std::uint32_t mLength = 0;
+  std::uint32_t mCapacity = kInside;
+};
+
+inline bool ZORString::operator==(const ZORString& other) const {
+  return mLength == other.mLength && std::memcmp(CastToCharPtr(), other.CastToCharPtr(), mLength) == 0;
+}
+
+inline std::strong_ordering ZORString::operator<=>(const ZORString& other) const {
+  const int common =
+      std::memcmp(CastToCharPtr(), other.CastToCharPtr(), mLength < other.mLength ? mLength : other.mLength);
+  return common != 0 ? common <=> 0 : mLength <=> other.mLength;
+}
+
+class ZORipstream;
+class ZORopstream;
+
+// Tag of the constructors that make an object for Read.
+enum ZORStreamableInit { ZorStreamableInit = 0 };
+
+// An object that can be stored.
+class ZOR_EXPORT ZORStreamable {
+ public:
+  virtual ~ZORStreamable();
+  virtual const char* CastableID() const = 0;  // the text under which the class is registered
+  virtual void Write(ZORopstream& out) const;
+  virtual void Read(ZORipstream& in);
+};
+
+// One record for each streamable class, a static object of the library that defines the class. The registry is
+// the list of the records that are alive; of two with the same text the later one is found.
+class ZOR_EXPORT ZORStreamableClass {
+ public:
+  using Factory = ZORStreamable* (*)(ZORStreamable* object);  // a null object asks for a new one
+  using Watcher = void (*)(const ZORStreamableClass& record, bool added);
+  static constexpr int kSolverClass = 1;  // kind of the classes below ZORVaDoBase
+
+  ZORStreamableClass(const char* text, Factory factory, int kind);  // text is kept, not copied
+  ~ZORStreamableClass();
+  ZORStreamableClass(const ZORStreamableClass&) = delete;
+  ZORStreamableClass& operator=(const ZORStreamableClass&) = delete;
+
+  const char* Text() const { return mText; }
+  int Kind() const { return mKind; }
+  ZORStreamable* Build() const { return mFactory(nullptr); }
+
+  static const ZORStreamableClass* Find(const char* text);  // null when no such class is loaded
+  static void Watch(Watcher watcher);                       // told of each record that comes or goes; null ends it
+
+ private:
+  const char* mText;
+  Factory mFactory;
+  int mKind;
+  ZORStreamableClass* mNext;
+};
+
+// Binary output, in memory: integers in little-endian order, texts behind their length.
+class ZOR_EXPORT ZORopstream {
+ public:
+  ZORopstream();
+  ~ZORopstream();
+
+  ZORopstream& operator<<(ZORLong value);
+  void WriteString(const char* text);                    // zero-ended
+  void WriteObject(const ZORStreamable* object);         // class text and content
+  void WriteObjectPointer(const ZORStreamable* object);  // null, a new object, or one that was written before
+  const std::string& Bytes() const { return mBytes; }
+
+ private:
+  std::string mBytes;
+  std::unordered_map<const ZORStreamable*, ZORLong> mObjects;
+};
+
+// Binary input from bytes that nobody vouches for. Whatever is missing or broken reads as 0 or null and is told by
+// Fail, and so is all that follows; nothing is read or allocated beyond what the bytes hold.
+class ZOR_EXPORT ZORipstream {
+ public:
+  explicit ZORipstream(std::string bytes);
+  ~ZORipstream();
+
+  ZORipstream& operator>>(ZORLong& value);
+  char* ReadString();                       // the caller's, freed with delete[]
+  void ReadObject(ZORStreamable*& object);  // fills the object given; makes one where the pointer is null
+  ZORStreamable* ReadObjectPointer();       // a new object is the caller's; null for an unknown class
+  bool Fail() const { return mFail; }
+  void SetFail() { mFail = true; }  // for a Read that finds its content broken
+  std::size_t Left() const { return mBytes.size() - mPosition; }
+  // What ReadObjectPointer has made so far, with null for what it could not make: all that a reader who gives up
+  // has to delete.
+  const std::vector<ZORStreamable*>& Objects() const { return mObjects; }
+
+ private:
+  ZORStreamable* Build(const char* text);
+  void ReadContent(ZORStreamable& object);
+
+  std::string mBytes;
+  std::size_t mPosition = 0;
+  bool mFail = false;
+  int mNesting = 0;
+  std::vector<ZORStreamable*> mObjects;
+};
+
+// The buffer of a text output stream.
+class ZOR_EXPORT ZORpstream {
+ public:
+  char* Str(int);      // the buffer, as far as it was written; it is zero-ended when a zero was written last
+  void Freeze(int) {}  // the buffer always stays the stream's
+  std::string_view View() const { return mBuffer; }
+
+ protected:
+  std::string mBuffer;
+};
+
+// Text output, a growing buffer.
+class ZOR_EXPORT ZORostrstream : public ZORpstream {
+ public:
+  ZORostrstream();
+  ~ZORostrstream();
+  ZORostrstream& operator<<(const char* text);
+  ZORostrstream& operator<<(char c);
+};
+
+// Text input over characters that the caller keeps alive and unchanged while it reads.
+class ZOR_EXPORT ZORistrstream {
+ public:
+  static constexpr int kNoCharacter = -1;
+
+  ZORistrstream(const char* text, int size);  // size characters, or up to the zero when size is 0
+  ~ZORistrstream();
+
+  ZORistrstream& operator>>(ZORistrstream& (*manipulator)(ZORistrstream&)) { return manipulator(*this); }
+  ZORistrstream& operator>>(char& c);  // the zero character at the end
+  int Peek() const;                    // the code of the next character, 0 to 255, or kNoCharacter at the end
+  void Ignore();
+  // Stores at most limit characters and a zero behind them, so that room for limit + 1 is needed; with limit 0
+  // nothing. Stops at the delimiter and takes it, also when it comes right behind the last character stored.
+  void GetLine(char* line, unsigned int limit, char delimiter);
+  std::size_t Left() const { return static_cast<std::size_t>(mEnd - mNext); }
+
+ private:
+  const char* mNext;
+  const char* mEnd;
+};
+
+ZOR_EXPORT ZORistrstream& ws(ZORistrstream& in);  // skips space, \t, \n, \v, \f and \r

@@ -1,0 +1,134 @@
+// Set operations of sets of texts: intersection, equality and union.
+#include "enum/dispatch.h"
+
+int ZORVadEnumString::Intersect(const ZORVadEnumString& other) {
+  if (IsNil()) return 0;
+  if (other.IsNil()) return Nil();
+  if (other.IsUndefined()) return 0;
+  if (IsFull() && other.mState == ZorStringMax) return 0;
+  if (IsFull()) return Nil();
+  if (IsUndefined()) return Copy(other), 1;
+  return Keep(other.mVector);
+}
+
+int ZORVadEnumString::Intersect(const ZORISVectorImp_String& texts) {
+  if (IsNil()) return 0;
+  if (!IsUndefined()) return Keep(texts);
+  Append(texts);
+  mState = Count() > 0 ? ZorStringExact : ZorStringNil;
+  return 1;
+}
+
+// Keeps the texts that stand in both, in one walk over both. Nothing is built: a text that is lost is deleted on the
+// spot, and those behind it move up. The state stays unless nothing does.
+int ZORVadEnumString::Keep(const ZORISVectorImp_String& texts) {
+  const unsigned int count = mVector.Count(), others = texts.Count();
+  ZORString** const places = &mVector[0];
+  unsigned int kept = 0;
+  for (unsigned int i = 0, j = 0; i < count; ++i) {
+    std::strong_ordering order = std::strong_ordering::less;
+    while (j < others && (order = *places[i] <=> *texts[j]) > 0) ++j;
+    if (j < others && order == 0) {
+      places[kept++] = places[i];
+      ++j;
+    } else {
+      delete places[i];
+    }
+  }
+  if (kept == count) return 0;
+  mVector.SetTop(kept, count);
+  return kept > 0 ? 1 : Nil();
+}
+
+// The end of the operations that build candidates: candidates are used up.
+int ZORVadEnumString::Narrow(ZORVadEnumString& candidates) {
+  return IsUndefined() && !candidates.IsUndefined() ? Take(candidates) : Intersect(candidates);
+}
+
+// Both tests of the single value's extremes stand before every look at the target's content.
+int ZORVadEnumString::Intersect(const ZORVadSingleString& other) {
+  if (IsNil()) return 0;
+  if (other.IsNil()) return Nil();
+  if (other.IsUndefined()) return 0;
+  if (other.IsFull()) return 0;
+  if (IsFull()) return Nil();
+  if (IsUndefined()) return Copy(other);
+  if (Contains(other.GetLowerBound()) == 0) return Nil();
+  return Copy(other);
+}
+
+int ZORVadEnumString::IntersectInverse(ZORVadSingleString& target) const {
+  if (target.IsNil()) return 0;
+  if (IsUndefined()) return 0;
+  if (IsNil()) return target.Nil();
+  if (target.IsUndefined() && Count() == 1) return target.Copy(First());
+  if (target.IsUndefined()) return 0;
+  if (Contains(target.GetLowerBound()) != 0) return 0;
+  return target.Nil();
+}
+
+int ZORVadEnumString::CalcEqualValue(const ZORVadEnumString& other) { return Intersect(other); }
+int ZORVadEnumString::CalcEqualValue(const ZORVadSingleString& other) { return Intersect(other); }
+int ZORVadEnumString::CalcInverseEqualValue(ZORVadEnumString& target) const { return target.Intersect(*this); }
+int ZORVadEnumString::CalcInverseEqualValue(ZORVadSingleString& target) const { return IntersectInverse(target); }
+
+void ZORVadEnumString::Unite(const ZORVadEnumString& other) {
+  if (IsUndefined()) return;
+  if (other.IsUndefined()) return SetUndefinedValue();
+  if (other.IsNil()) return;
+  if (IsNil()) {
+    Copy(other);
+  } else {
+    Append(other);
+  }
+}
+
+void ZORVadEnumString::Unite(const ZORVadSingleString& other) {
+  if (IsUndefined()) return;
+  if (other.IsUndefined()) return SetUndefinedValue();
+  if (other.IsNil()) return;
+  if (IsNil()) {
+    Copy(other);
+  } else {
+    Insert(other.GetLowerBound());
+  }
+}
+
+int ZORVadEnumString::IsIntersected(const ZORVaDoAny& other) const {
+  if (IsNil() || zor::IsNil(other)) return 0;
+  if (IsUndefined() || zor::IsUndefined(other)) return 1;
+  if (const auto* const single = Single::DynamicCast(&other)) {
+    if (IsFull()) return single->IsFull();
+    return Contains(single->GetLowerBound()) != 0;
+  }
+  if (const auto* const set = Enum::DynamicCast(&other)) {
+    if (IsFull()) return set->mState == ZorStringMax;
+    for (ZORISVectorIteratorImp_String text(set->mVector); text; ++text) {
+      if (Contains(text.Current()) != 0) return 1;
+    }
+  }
+  return 0;
+}
+
+void ZORVadEnumString::Intersect(const ZORVaDoAny& other) {
+  zor::GuardedStringElse(
+      other, [&](auto& string) { return Intersect(string); }, [&] { return Nil(); });
+}
+
+void ZORVadEnumString::Unite(const ZORVaDoAny& other) {
+  zor::GuardedStringElse(
+      other, [&](auto& string) { return Unite(string), 0; }, [&] { return Nil(); });
+}
+
+int ZORVadEnumString::CalcEqualValue(const ZORVaDoAny& other) {
+  return zor::GuardedString(other, [&](auto& string) { return CalcEqualValue(string); });
+}
+
+int ZORVadEnumString::CalcInverseEqualValue(ZORVaDoAny& target) const {
+  return zor::GuardedString(target, [&](auto& string) { return CalcInverseEqualValue(string); });
+}
+
+void ZORVadEnumString::Bisect(ZORVaDoObject& other, ValueSelection selection) {
+  const auto leaveWhole = [&](auto&) { return selection >= 0 && selection <= 3 ? 0 : Nil(); };
+  zor::GuardedElse<Enum>(other, leaveWhole, [&] { return Nil(); });
+}

@@ -1,0 +1,28 @@
+// Lengths of sets of texts, in characters.
+#include "enum/ZORVadEnumString.h"
+
+int ZORVadEnumString::CalcLength(ZORVaDoInteger& n) const {
+  if (IsNil()) return n.SetNilValue(), 1;
+  if (IsUndefined()) return n.SetUndefinedValue(), 1;
+  ZORVadEnumInteger lengths;
+  lengths.SetNilValue();
+  for (ZORISVectorIteratorImp_String text(mVector); text; ++text) lengths.Insert(text.Current()->GetLengthInChar());
+  if (auto* const single = ZORVadSingleInteger::DynamicCast(&n)) return lengths.IntersectInverse(*single);
+  if (auto* const interval = ZORVadIntervalInteger::DynamicCast(&n)) return lengths.IntersectInverse(*interval);
+  if (auto* const set = ZORVadEnumInteger::DynamicCast(&n)) return set->Intersect(lengths);
+  return 0;
+}
+
+// Answers 1 also when no text is dropped. The Max of the state goes.
+int ZORVadEnumString::CalcInverseLength(const ZORVaDoInteger& n) {
+  if (n.IsNil()) return Nil();
+  if (n.IsUndefined() || IsNil() || IsUndefined()) return 0;
+  if (n.GetExactValue() < 0) return Nil();
+  ZORVadEnumString kept(ZorStringNil);
+  ZORVadSingleInteger length;
+  for (ZORISVectorIteratorImp_String text(mVector); text; ++text) {
+    length.SetExactValue(text.Current()->GetLengthInChar());
+    if (n.IsIntersected(length)) kept.InsertExactValue(*text.Current());
+  }
+  return Take(kept);
+}

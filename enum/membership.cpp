@@ -1,0 +1,131 @@
+// The listed texts: what is among them, what is added and what is dropped.
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+
+#include "enum/ZORVadEnumString.h"
+
+namespace {
+
+// A set that silently lost a text would be a wrong answer.
+void Require(int stored) {
+  if (stored) return;
+  std::fputs("ZORVadStrings: no memory for a set of texts\n", stderr);
+  std::abort();
+}
+
+}  // namespace
+
+// Bisections over the listed texts, which are always in order.
+unsigned int ZORVadEnumString::CountBelow(const ZORString& text) const {
+  ZORString* const* const places = &mVector[0];
+  const auto below = [](const ZORString* listed, const ZORString& bound) { return *listed < bound; };
+  return static_cast<unsigned int>(std::lower_bound(places, places + mVector.Count(), text, below) - places);
+}
+
+unsigned int ZORVadEnumString::CountUpTo(const ZORString& text) const {
+  ZORString* const* const places = &mVector[0];
+  const auto above = [](const ZORString& bound, const ZORString* listed) { return bound < *listed; };
+  return static_cast<unsigned int>(std::upper_bound(places, places + mVector.Count(), text, above) - places);
+}
+
+void ZORVadEnumString::Reserve(unsigned int places) {
+  if (places > mVector.Limit()) Require(mVector.Resize(places));
+}
+
+// Takes over text; the places grow by half so that building a large set stays linear.
+void ZORVadEnumString::Store(ZORString* text, unsigned int position) {
+  const unsigned int count = mVector.Count();
+  if (count == mVector.Limit()) Reserve(count + count / 2 + 1);
+  Require(mVector.AddAt(text, position));
+}
+
+void ZORVadEnumString::StoreLast(const ZORString& text) { Store(new ZORString(text), mVector.Count()); }
+
+void ZORVadEnumString::Remove(unsigned int position, unsigned int count) {
+  if (count > 0) mVector.DetachAt(position, count, 1);
+}
+
+int ZORVadEnumString::Contains(const ZORString& text) const { return Contains(&text); }
+
+int ZORVadEnumString::Contains(const ZORString* text) const {
+  if (IsUndefined()) return 0;
+  if (IsNil()) return 0;
+  if (IsFull()) return -1;
+  const unsigned int position = mVector.Find(text);
+  return position <= mVector.Count() ? static_cast<int>(position + 1) : 0;
+}
+
+// The answers of Contains and the place of a new text come from one bisection; texts mostly arrive in order.
+int ZORVadEnumString::Insert(const ZORString& text) {
+  const unsigned int count = mVector.Count();
+  const unsigned int position = count == 0 || Last() < text ? count : CountUpTo(text);
+  const bool known = !IsUndefined() && !IsNil();
+  if (known && position > 0 && *mVector[position - 1] == text) return 0;
+  Store(new ZORString(text), position);
+  return 1;
+}
+
+int ZORVadEnumString::Append(const ZORVadEnumString& other) {
+  if (other.Count() == 0) return 0;
+  if (&other == this) return Append(ZORVadEnumString(other));
+  return Merge(other.mVector);
+}
+
+int ZORVadEnumString::Append(const ZORISVectorImp_String& texts) {
+  int allNew = 1;
+  for (ZORISVectorIteratorImp_String text(texts); text; ++text) allNew &= Insert(*text.Current());
+  return allNew;
+}
+
+// What Insert of each text would do, for texts in order, in one merge: our places move to the end of an array with
+// room for all, and both runs are read from there into its front, which never overtakes them.
+int ZORVadEnumString::Merge(const ZORISVectorImp_String& texts) {
+  const unsigned int own = mVector.Count(), more = texts.Count();
+  const bool known = !IsUndefined() && !IsNil();
+  Reserve(own + more);
+  ZORString** const places = &mVector[0];
+  ZORString** next = places + more;
+  ZORString** const end = next + own;
+  std::copy_backward(places, places + own, end);
+
+  ZORString** out = places;
+  for (unsigned int i = 0; i < more; ++i) {
+    const ZORString& text = *texts[i];
+    while (next != end && **next <= text) *out++ = *next++;
+    if (known && out != places && *out[-1] == text) continue;
+    *out++ = new ZORString(text);
+  }
+  while (next != end) *out++ = *next++;
+  const auto count = static_cast<unsigned int>(out - places);
+  mVector.SetTop(count, own + more);
+  return count == own + more ? 1 : 0;
+}
+
+int ZORVadEnumString::Count() const { return static_cast<int>(mVector.Count()); }
+
+ZORString& ZORVadEnumString::GetValue(int position) const { return *mVector[static_cast<unsigned int>(position)]; }
+
+int ZORVadEnumString::CutLower(const ZORString& bound) {
+  Remove(0, CountBelow(bound));
+  if (mState == ZorStringExact && Count() == 0) mState = ZorStringNil;
+  return Count();
+}
+
+int ZORVadEnumString::CutUpper(const ZORString& bound) {
+  if (bound < ZorVaDoStringMax) mState = ZorStringExact;
+  const unsigned int kept = CountUpTo(bound);
+  Remove(kept, mVector.Count() - kept);
+  if (mState == ZorStringExact && Count() == 0) mState = ZorStringNil;
+  return Count();
+}
+
+int ZORVadEnumString::CalcMinValue() {
+  if (IsEmpty()) return 0;
+  return Become(ZorStringExact, "");
+}
+
+int ZORVadEnumString::CalcMaxValue() {
+  if (IsFull()) return 0;
+  return Become(ZorStringMax);
+}

@@ -1,0 +1,19 @@
+#include "module/InitModule.h"
+
+#include "enum/ZORVadEnumString.h"
+#include "module/ZORVaDoString.h"
+#include "single/ZORVadSingleString.h"
+
+int InitModule(ZORVaDoModule* module, ZORVaDoModuleManager* manager) {
+  if (module == nullptr || manager == nullptr) return 0;
+  ZORVaDoModule* const numbers = manager->OpenModule(ZORString("ZORVadNumbers"));
+  if (numbers == nullptr) return 0;
+  module->AddLoadedModule(numbers);
+  ZORVaDoString::MakeDescriptor();  // the parent of the two concrete types, not a type to be had by itself
+  module->AddObjectDescriptor(ZORVadSingleString::MakeDescriptor());
+  module->AddObjectDescriptor(ZORVadEnumString::MakeDescriptor());
+  InitStrings();
+  return 1;
+}
+
+int TARVOS_WORKSHOP_BDK2_INTERNAL_ZORVadStrings() { return 1; }

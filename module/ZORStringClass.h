@@ -1,0 +1,111 @@
+// What every string class has alike: identity, casts, stream pointers, descriptor. Declared and defined once here.
+#pragma once
+
+#include "host/ZORSolver.h"
+
+// Members of a string class. sIdent is its identity, compared by address; CastableIdent is the same text for others.
+// DynamicCast answers null for a null pointer and for an object of another class, StaticCast tests nothing.
+// sDescriptor is null until MakeDescriptor has run, which answers null when there is no memory; a second call makes
+// a second descriptor. No descriptor is ever freed by the class. readPtr gives null, and the stream fails, for an
+// object of another class.
+#define ZOR_DECLARE_STRING_CLASS(Class)                                                                   \
+ public:                                                                                                  \
+  class ZOR_EXPORT Descriptor : public ZORVaDoObjectDescriptor {                                          \
+   public:                                                                                                \
+    using ZORVaDoObjectDescriptor::ZORVaDoObjectDescriptor;                                               \
+    ~Descriptor() override;                                                                               \
+    const char* CastableID() const override;                                                              \
+    ZORVaDoObject* CreateObject(void* place, const void* text) const override;                            \
+    ZORVaDoObject* CreateObject(void* place) const override;                                              \
+    std::size_t GetObjectSize() const override;                                                           \
+  };                                                                                                      \
+  static const char* const CastableIdent;                                                                 \
+  static const Descriptor* sDescriptor;                                                                   \
+  static const Descriptor* MakeDescriptor();                                                              \
+  static Class* DynamicCast(ZORVaDoBase* object);                                                         \
+  static const Class* DynamicCast(const ZORVaDoBase* object);                                             \
+  static Class* StaticCast(ZORVaDoBase* object) { return static_cast<Class*>(object); }                   \
+  static const Class* StaticCast(const ZORVaDoBase* object) { return static_cast<const Class*>(object); } \
+  static ZORipstream& readPtr(ZORipstream& in, Class*& object);                                           \
+  static ZORipstream& readRef(ZORipstream& in, Class& object);                                            \
+  static ZORopstream& writePtr(ZORopstream& out, const Class* object);                                    \
+  static ZORopstream& writeRef(ZORopstream& out, const Class& object);                                    \
+  const char* CastableID() const override;                                                                \
+  const ZORVaDoObjectDescriptor* GetDescriptor() const override;                                          \
+                                                                                                          \
+ protected:                                                                                               \
+  int IsDerivedFrom(const char* ident) const override;                                                    \
+                                                                                                          \
+ private:                                                                                                 \
+  static const char* const sIdent;                                                                        \
+                                                                                                          \
+ public:                                                                                                  \
+  static_assert(true)
+
+// The operations that each concrete class answers on its own, as the solver calls them through the table. Their
+// contracts stand with the base classes. Both bounds come new at the end of the table.
+#define ZOR_DECLARE_STRING_OPERATIONS()                                                                       \
+  void Write(ZORopstream& out) const override;                                                                \
+  void Read(ZORipstream& in) override;                                                                        \
+  void PrintOn(ZORostrstream& out) const override;                                                            \
+  void InputValue(ZORistrstream& in) override;                                                                \
+  void Assign(const ZORVaDoAny& other) override;                                                              \
+  void SetNilValue() override;                                                                                \
+  void SetUndefinedValue() override;                                                                          \
+  int IsNil() const final { return mState == ZorStringNil; }                                                  \
+  int IsUndefined() const final { return mState == ZorStringAny; }                                            \
+  int CheckNil() const { return IsNil(); }                                                                    \
+  int CheckAny() const { return IsUndefined(); }                                                              \
+  int IsIntersected(const ZORVaDoAny& other) const override;                                                  \
+  void Intersect(const ZORVaDoAny& other) override;                                                           \
+  void Unite(const ZORVaDoAny& other) override;                                                               \
+  unsigned long GetCardinality() const override;                                                              \
+  void Bisect(ZORVaDoObject& other, ValueSelection selection) override;                                       \
+  int CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                                        \
+  int CalcMinValue() override;                                                                                \
+  int CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                                        \
+  int CalcMaxValue() override;                                                                                \
+  int CalcEqualValue(const ZORVaDoAny& other) override;                                                       \
+  int CalcInverseEqualValue(ZORVaDoAny& target) const override;                                               \
+  int CalcLessOrEqualValue(const ZORVaDoAny& other) override;                                                 \
+  int CalcInverseLessOrEqualValue(ZORVaDoAny& target) const override;                                         \
+  int CalcNotLessAndUnequalValue(const ZORVaDoAny& other) override;                                           \
+  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;                                   \
+  int CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override;                  \
+  int CalcFirstInverseMaxValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override;                  \
+  int CalcLessValue(const ZORVaDoScalar& other) override;                                                     \
+  int CalcInverseLessValue(ZORVaDoScalar& target) const override;                                             \
+  int CalcNotLessValue(const ZORVaDoScalar& other) override;                                                  \
+  int CalcInverseNotLessValue(ZORVaDoScalar& target) const override;                                          \
+  int CalcNextValue(const ZORVaDoScalar& other) override;                                                     \
+  int CalcInverseNextValue(ZORVaDoScalar& target) const override;                                             \
+  int IsEmpty() const final;                                                                                  \
+  int IsFull() const final;                                                                                   \
+  void SetExactValue(const ZORString& text) override;                                                         \
+  void InsertExactValue(const ZORString& text) override;                                                      \
+  int RemoveExactValue(const ZORString& text) override;                                                       \
+  ZORString GetLowerBound() const override;                                                                   \
+  ZORString GetUpperBound() const override;                                                                   \
+  ZORString GetNextExactValue(const ZORString& text) const override;                                          \
+  ZORString GetPrevExactValue(const ZORString& text) const override;                                          \
+  int CalcLength(ZORVaDoInteger& n) const override;                                                           \
+  int CalcInverseLength(const ZORVaDoInteger& n) override;                                                    \
+  int CalcStringRepresentation(const ZORVaDoAny& x) override;                                                 \
+  int CalcInverseStringRepresentation(ZORVaDoAny& x) const override;                                          \
+  int CalcLowerValue(const ZORVaDoString& x) override;                                                        \
+  int CalcInverseLowerValue(ZORVaDoString& x) const override;                                                 \
+  int CalcUpperValue(const ZORVaDoString& x) override;                                                        \
+  int CalcInverseUpperValue(ZORVaDoString& x) const override;                                                 \
+  int CalcConcatenation(const ZORVaDoString& x, const ZORVaDoString& y) override;                             \
+  int CalcFirstInverseConcatenation(ZORVaDoString& x, const ZORVaDoString& y) const override;                 \
+  int CalcSecondInverseConcatenation(const ZORVaDoString& x, ZORVaDoString& y) const override;                \
+  int CalcSubString(const ZORVaDoString& x, const ZORVaDoInteger& start, const ZORVaDoInteger& end) override; \
+  int CalcFirstInverseSubString(ZORVaDoString& x, const ZORVaDoInteger& start, const ZORVaDoInteger& end)     \
+      const override;                                                                                         \
+  int CalcSecondInverseSubString(const ZORVaDoString& x, ZORVaDoInteger& start, const ZORVaDoInteger& end)    \
+      const override;                                                                                         \
+  int CalcThirdInverseSubString(const ZORVaDoString& x, const ZORVaDoInteger& start, ZORVaDoInteger& end)     \
+      const override;                                                                                         \
+  virtual void SetLowerBound(const ZORString& text);                                                          \
+  virtual void SetUpperBound(const ZORString& text);                                                          \
+  static_assert(true)

@@ -1,0 +1,8 @@
+// The ends of the alphabet. Each source file that includes this has a pair of its own, built before the rest of its
+// static objects, so that none of them depends on the order in which files come to life.
+#pragma once
+
+#include "host/ZORText.h"
+
+static const ZORChar ZorVaDoCharMin(' ');
+static const ZORChar ZorVaDoCharMax('z');

@@ -1,0 +1,44 @@
+#include "module/textform.h"
+
+namespace {
+
+constexpr unsigned int kWordLength = 3;
+constexpr unsigned int kInputLimit = 254;
+
+// At most limit characters up to the delimiter.
+template <unsigned int kLimit>
+ZORString InputLine(ZORistrstream& in, char delimiter) {
+  char line[kLimit + 1];
+  line[0] = '\0';
+  in.GetLine(line, kLimit, delimiter);
+  return line;
+}
+
+}  // namespace
+
+bool zor::PrintWord(const ZORVaDoString& value, ZORostrstream& out) {
+  const char* const word = value.IsNil()         ? "Nil"
+                           : value.IsUndefined() ? "Any"
+                           : value.IsFull()      ? "Max"
+                           : value.IsEmpty()     ? "Min"
+                                                 : nullptr;
+  if (word != nullptr) out << word;
+  return word != nullptr;
+}
+
+bool zor::BeginsWord(int character) { return character == 'M' || character == 'N' || character == 'A'; }
+
+void zor::InputWord(ZORVaDoString& value, ZORistrstream& in) {
+  const ZORString word = InputLine<kWordLength>(in, '\n');
+  if (word == "Min") {
+    value.CalcMinValue();
+  } else if (word == "Max") {
+    value.CalcMaxValue();
+  } else if (word == "Any") {
+    value.SetUndefinedValue();
+  } else {
+    value.SetNilValue();
+  }
+}
+
+ZORString zor::InputQuoted(ZORistrstream& in) { return InputLine<kInputLimit>(in, '"'); }

@@ -1,0 +1,64 @@
+// Set operations of single strings: intersection, equality, union, and texts one at a time.
+#include "module/guard.h"
+#include "single/ZORVadSingleString.h"
+
+int ZORVadSingleString::Intersect(const ZORVadSingleString& other) {
+  if (IsNil()) return 0;
+  if (other.IsUndefined()) return 0;
+  if (other.IsNil()) return Nil();
+  if (other.IsEmpty()) return CalcMinValue();
+  if (other.IsFull()) return CalcMaxValue();
+  return Settle(other.mText);
+}
+
+int ZORVadSingleString::CalcEqualValue(const ZORVadSingleString& other) { return Intersect(other); }
+
+void ZORVadSingleString::Unite(const ZORVadSingleString& other) {
+  if (IsUndefined()) return;
+  if (other.IsUndefined()) return SetUndefinedValue();
+  if (other.IsNil()) return;
+  if ((IsEmpty() && other.IsEmpty()) || (IsFull() && other.IsFull())) return;
+  if (IsEmpty() || IsFull() || other.IsEmpty() || other.IsFull()) return SetUndefinedValue();
+  if (IsNil()) return SetExactValue(other.mText);
+  if (mText == other.mText) return;
+  SetUndefinedValue();
+}
+
+void ZORVadSingleString::InsertExactValue(const ZORString& text) {
+  if (IsUndefined()) return;
+  if (IsNil()) return SetExactValue(text);
+  if (mText == text) return;
+  SetUndefinedValue();
+}
+
+int ZORVadSingleString::RemoveExactValue(const ZORString& text) {
+  if (IsUndefined() || IsNil()) return 0;
+  if (!(mText == text)) return 0;
+  return Nil();
+}
+
+int ZORVadSingleString::IsIntersected(const ZORVaDoAny& other) const {
+  if (IsNil() || zor::IsNil(other)) return 0;
+  if (IsUndefined() || zor::IsUndefined(other)) return 1;
+  return zor::Guarded<ZORVadSingleString>(other, [&](auto& single) { return mText == single.mText ? 1 : 0; });
+}
+
+void ZORVadSingleString::Intersect(const ZORVaDoAny& other) {
+  zor::GuardedElse<ZORVadSingleString>(
+      other, [&](auto& single) { return Intersect(single); }, [&] { return Nil(); });
+}
+
+int ZORVadSingleString::CalcEqualValue(const ZORVaDoAny& other) {
+  return zor::Guarded<ZORVadSingleString>(other, [&](auto& single) { return CalcEqualValue(single); });
+}
+
+int ZORVadSingleString::CalcInverseEqualValue(ZORVaDoAny& target) const {
+  return zor::Guarded<ZORVadSingleString>(target, [&](auto& single) { return single.Intersect(*this); });
+}
+
+void ZORVadSingleString::Unite(const ZORVaDoAny& other) {
+  zor::GuardedElse<ZORVadSingleString>(
+      other, [&](auto& single) { return Unite(single), 0; }, [&] { return Nil(); });
+}
+
+void ZORVadSingleString::Bisect(ZORVaDoObject&, ValueSelection) { Nil(); }

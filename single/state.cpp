@@ -1,0 +1,81 @@
+// What a single string is: its statics, construction, copies and states.
+#include "module/characters.h"
+#include "module/guard.h"
+#include "module/plumbing.h"
+#include "single/ZORVadSingleString.h"
+
+ZOR_DEFINE_STRING_CLASS(ZORVadSingleString, ZORVaDoString, "single string", ZORVaDoString::sDescriptor, 0);
+
+ZORVadSingleString* ZORVadSingleString::Build(ZORStreamable* object) {
+  return static_cast<ZORVadSingleString*>(zor::BuildForRead<ZORVadSingleString>(object));
+}
+
+ZORVadSingleString::ZORVadSingleString() : mText(ZorVaDoStringAny) { mState = ZorStringAny; }
+
+ZORVadSingleString::ZORVadSingleString(const ZORString& text) : mText(text) { mState = ZorStringExact; }
+
+ZORVadSingleString::ZORVadSingleString(const void* text) : mText(static_cast<const char*>(text)) {
+  mState = ZorStringExact;
+}
+
+ZORVadSingleString::ZORVadSingleString(const ZORVadSingleString& other) : ZORVaDoString(other) { Copy(other); }
+
+ZORVadSingleString::ZORVadSingleString(ZORStreamableInit) : ZORVaDoString(ZorStreamableInit) {}
+
+ZORVadSingleString::~ZORVadSingleString() = default;
+
+ZORVadSingleString& ZORVadSingleString::operator=(const ZORVadSingleString& other) {
+  Copy(other);
+  return *this;
+}
+
+ZORVadSingleString& ZORVadSingleString::operator=(const char* text) {
+  Become(ZorStringExact, text);
+  return *this;
+}
+
+int ZORVadSingleString::Assign(const ZORVadSingleString& other) {
+  Copy(other);
+  return 1;
+}
+
+int ZORVadSingleString::Copy(const ZORVadSingleString& other) {
+  mState = other.mState;
+  if (other.IsUndefined() || other.IsNil()) return 0;
+  mText = other.mText;
+  return 1;
+}
+
+int ZORVadSingleString::Copy(const ZORString& text) { return Become(ZorStringExact, text); }
+
+int ZORVadSingleString::Become(ZORStringStateTag state, const ZORString& text) {
+  mText = text;
+  mState = state;
+  return 1;
+}
+
+void ZORVadSingleString::SetNilValue() { Become(ZorStringNil, ZorVaDoStringNil); }
+void ZORVadSingleString::SetUndefinedValue() { Become(ZorStringAny, ZorVaDoStringAny); }
+
+int ZORVadSingleString::IsEmpty() const { return mState == ZorStringExact && mText == ZorVaDoStringMin; }
+int ZORVadSingleString::IsFull() const { return mState == ZorStringMax; }
+
+unsigned long ZORVadSingleString::GetCardinality() const {
+  if (IsNil()) return 0;
+  if (IsUndefined()) return 255;
+  return 1;
+}
+
+void ZORVadSingleString::SetExactValue(const ZORString& text) { Become(ZorStringExact, text); }
+void ZORVadSingleString::SetLowerBound(const ZORString& text) { SetExactValue(text); }
+void ZORVadSingleString::SetUpperBound(const ZORString& text) { SetExactValue(text); }
+
+ZORString ZORVadSingleString::GetLowerBound() const { return mText; }
+ZORString ZORVadSingleString::GetUpperBound() const { return mText; }
+ZORString ZORVadSingleString::GetNextExactValue(const ZORString&) const { return mText; }
+ZORString ZORVadSingleString::GetPrevExactValue(const ZORString&) const { return mText; }
+
+void ZORVadSingleString::Assign(const ZORVaDoAny& other) {
+  zor::GuardedElse<ZORVadSingleString>(
+      other, [&](auto& single) { return Copy(single); }, [&] { return Nil(); });
+}

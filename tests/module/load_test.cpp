@@ -1,0 +1,144 @@
+// The module as the solver gets it: loaded, taken into use, unloaded.
+#include <dlfcn.h>
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <array>
+#include <cstdio>
+#include <regex>
+#include <string>
+#include <vector>
+
+#include "host/ZORSolver.h"
+
+namespace {
+
+using Log = std::vector<std::string>;
+Log sLog;
+
+std::string Plain(const ZORString& text) { return text.CastToCharPtr(); }
+
+struct Library {
+  ~Library() { dlclose(handle); }
+
+  template <class Symbol>
+  Symbol* Find(const char* name) {
+    void* const symbol = dlsym(handle, name);
+    EXPECT_NE(symbol, nullptr) << name;
+    return reinterpret_cast<Symbol*>(symbol);
+  }
+  const ZORVaDoObjectDescriptor* Descriptor(const std::string& name) {
+    return *Find<const ZORVaDoObjectDescriptor*>(("_ZN" + name + "11sDescriptorE").c_str());
+  }
+  std::array<int, 4> Lengths() {
+    std::array<int, 4> lengths{};
+    std::transform(std::begin(kTexts), std::end(kTexts), lengths.begin(),
+                   [&](const char* name) { return Find<ZORString>(name)->GetLengthInChar(); });
+    return lengths;
+  }
+
+  static constexpr const char* kTexts[] = {
+      "_ZN13ZORVaDoString16ZorVaDoStringMinE", "_ZN13ZORVaDoString16ZorVaDoStringMaxE",
+      "_ZN13ZORVaDoString16ZorVaDoStringAnyE", "_ZN13ZORVaDoString16ZorVaDoStringNilE"};
+  void* const handle = dlopen(ZOR_MODULE_FILE, RTLD_NOW | RTLD_LOCAL);
+};
+
+constexpr char kString[] = "13ZORVaDoString", kSingle[] = "18ZORVadSingleString", kEnum[] = "16ZORVadEnumString";
+using InitModule = int(ZORVaDoModule*, ZORVaDoModuleManager*);
+
+// A module object and a manager that tell what they are asked.
+struct Module : ZORVaDoModule {
+  Module() : ZORVaDoModule("ZORVadStrings") {}
+  void AddLoadedModule(ZORVaDoModule* module) override { sLog.push_back("needs " + Plain(module->GetName())); }
+  void AddObjectDescriptor(const ZORVaDoObjectDescriptor* made) override { sLog.push_back(Plain(made->GetName())); }
+};
+struct Manager : ZORVaDoModuleManager {
+  explicit Manager(ZORVaDoModule* module) : answer(module) {}
+  ZORVaDoModule* OpenModule(const ZORString& name) override { return sLog.push_back("open " + Plain(name)), answer; }
+  ZORVaDoModule* answer;
+};
+
+struct ModuleLoad : testing::Test {
+  ModuleLoad() { sLog.clear(); }
+  Module module;
+  ZORVaDoModule numbers{ZORString("ZORVadNumbers")};
+};
+
+TEST_F(ModuleLoad, ClassesComeAndGoInOrder) {
+  ZORStreamableClass::Watch([](const ZORStreamableClass& record, bool added) {
+    sLog.emplace_back(1, added ? '+' : '-').append(record.Text()).append(" " + std::to_string(record.Kind()));
+  });
+  { const Library library; }
+  ZORStreamableClass::Watch(nullptr);
+  EXPECT_EQ(sLog, (Log{"+ZORVaDoString_Descriptor 1", "+ZORVaDoString 1", "+ZORVadEnumString_Descriptor 1",
+                       "+ZORVadEnumString 1", "+ZORVadSingleString_Descriptor 1", "+ZORVadSingleString 1",
+                       "-ZORVadSingleString 1", "-ZORVadSingleString_Descriptor 1", "-ZORVadEnumString 1",
+                       "-ZORVadEnumString_Descriptor 1", "-ZORVaDoString 1", "-ZORVaDoString_Descriptor 1"}));
+}
+
+TEST_F(ModuleLoad, RefusedWithoutTheSolverOrTheNumbers) {
+  Library library;
+  auto* const init = library.Find<InitModule>("InitModule");
+  Manager able(&numbers), unable(nullptr);
+  EXPECT_EQ(init(nullptr, &able), 0);
+  EXPECT_EQ(init(&module, nullptr), 0);
+  EXPECT_EQ(init(nullptr, nullptr), 0);
+  EXPECT_EQ(sLog, Log());
+  EXPECT_EQ(init(&module, &unable), 0);
+  EXPECT_EQ(sLog, Log{"open ZORVadNumbers"});
+  for (const char* name : {kString, kSingle, kEnum}) EXPECT_EQ(library.Descriptor(name), nullptr) << name;
+  EXPECT_EQ(library.Lengths(), (std::array{0, 0, 0, 0}));
+}
+
+TEST_F(ModuleLoad, TakenIntoUse) {
+  Library library;
+  Manager able(&numbers);
+  EXPECT_EQ(library.Find<InitModule>("InitModule")(&module, &able), 1);
+  EXPECT_EQ(sLog, (Log{"open ZORVadNumbers", "needs ZORVadNumbers", "single string", "enum string"}));
+  EXPECT_EQ(library.Lengths(), (std::array{1, 255, 256, 0}));
+  library.Find<void()>("_Z11InitStringsv")();
+  EXPECT_EQ(library.Lengths(), (std::array{1, 255, 256, 0}));
+  EXPECT_EQ(library.Find<int()>("TARVOS_WORKSHOP_BDK2_INTERNAL_ZORVadStrings")(), 1);
+  for (const char* name : {kSingle, kEnum})
+    EXPECT_EQ(library.Descriptor(name)->GetParent(), library.Descriptor(kString));
+  for (const char* name : {kSingle, kEnum, kString}) delete library.Descriptor(name);
+}
+
+// Through the manager, with a value made while the module is there; nothing of it is left afterwards.
+TEST_F(ModuleLoad, OpenedAndClosedByTheSolver) {
+  {
+    ZORVaDoModuleManager manager;
+    ZORVaDoModule* const opened = manager.OpenModule("ZORVadStrings");
+    ASSERT_NE(opened, nullptr) << manager.GetFailure().CastToCharPtr();
+    EXPECT_EQ(manager.OpenModule("ZORVadStrings"), opened);
+    EXPECT_EQ(opened->GetLoadedModules(), std::vector{manager.OpenModule("ZORVadNumbers")});
+    for (const char* name : {"single string", "enum string"}) {
+      const ZORVaDoObjectDescriptor* const type = opened->FindDescriptor(name);
+      ASSERT_NE(type, nullptr) << name;
+      std::vector<std::max_align_t> place(type->GetObjectSize() / sizeof(std::max_align_t) + 1);
+      ZORostrstream out;
+      ZORVaDoObject* value = type->CreateObject(place.data());
+      value->PrintOn(out);
+      type->DestroyObject(value);
+      EXPECT_EQ(out.View(), "Any") << name;
+    }
+    EXPECT_EQ(opened->FindDescriptor("string"), nullptr);
+  }
+  EXPECT_EQ(ZORStreamableClass::Find("ZORVadSingleString"), nullptr);
+}
+
+// What the module shows to others: its interface, and nothing of its own beside it.
+TEST(ModuleExports, InterfaceAlone) {
+  const std::regex entry(
+      "(InitModule|InitStrings\\(\\)|TARVOS_WORKSHOP_BDK2_INTERNAL_ZORVadStrings|(vtable for )?(ZORVaDoString"
+      "|ZORVadSingleString|ZORVadEnumString|ZORISVectorImp_String|ZORISVectorIteratorImp_String)(::.*)?) [A-Z] .*\n");
+  std::FILE* const names = popen("nm -D --defined-only --demangle --format=posix '" ZOR_MODULE_FILE "'", "r");
+  ASSERT_NE(names, nullptr);
+  char name[1000];
+  int count = 0;
+  for (; std::fgets(name, sizeof name, names) != nullptr; ++count) EXPECT_TRUE(std::regex_match(name, entry)) << name;
+  EXPECT_EQ(pclose(names), 0);
+  EXPECT_GT(count, 200);
+}
+
+}  // namespace

@@ -1,0 +1,74 @@
+// The order of the virtual operations, which other modules were compiled against.
+#include <gtest/gtest.h>
+
+#include "enum/ZORVadEnumString.h"
+#include "tests/support/vtable.h"
+
+namespace {
+
+struct Entry {
+  const char* name;
+  std::ptrdiff_t slot;
+};
+
+// An entry follows the other; both destructors of a class stand before all.
+template <std::size_t kCount>
+void ExpectInOrder(const Entry (&entries)[kCount], std::ptrdiff_t first = 2) {
+  for (std::size_t i = 0; i < kCount; ++i)
+    EXPECT_EQ(entries[i].slot, first + static_cast<std::ptrdiff_t>(i)) << entries[i].name;
+}
+
+struct String : ZORVaDoString {
+  using ZORVaDoString::IsDerivedFrom;
+};
+struct TypeOfSingles : ZORVadSingleString::Descriptor {
+  using ZORVadSingleString::Descriptor::IsDerivedFrom;
+};
+
+// clang-format off
+#define S(name) {#name, Slot(&String::name)}
+#define S_OF(name, Member) {#name " " #Member, Slot<Member>(&String::name)}
+#define D(name) {#name, Slot(&TypeOfSingles::name)}
+using Two = int (ZORVaDoAny::*)(const ZORVaDoAny&, const ZORVaDoAny&);
+using None = int (ZORVaDoAny::*)();
+
+const Entry kStrings[] = {
+  S(CastableID), S(Write), S(Read), S(IsDerivedFrom),
+  S(GetDescriptor), S(Activate), S(ActivateByArgument), S(Filter), S(PrintOn), S(InputValue),
+  S(Assign), S(SetNilValue), S(SetUndefinedValue), S(IsNil), S(IsUndefined), S(IsIntersected), S(Intersect), S(Unite),
+  S(GetCardinality), S(GetWidth), S(GetRelativeWidth), S(Bisect),
+  S_OF(CalcMinValue, Two), S_OF(CalcMinValue, None), S_OF(CalcMaxValue, Two), S_OF(CalcMaxValue, None),
+  S(CalcEqualValue), S(CalcInverseEqualValue), S(CalcUnequalValue), S(CalcInverseUnequalValue), S(CalcIsEqual),
+  S(CalcLessOrEqualValue), S(CalcInverseLessOrEqualValue), S(CalcNotLessAndUnequalValue),
+  S(CalcInverseNotLessAndUnequalValue), S(CalcIsLessOrEqual), S(CalcFirstInverseMinValue), S(CalcFirstInverseMaxValue),
+  S(CalcLessValue), S(CalcInverseLessValue), S(CalcNotLessValue), S(CalcInverseNotLessValue), S(CalcIsLess),
+  S(CalcNextValue), S(CalcInverseNextValue),
+  S(CalcEmptyValue), S(IsEmpty), S(CalcFullValue), S(IsFull),
+  S(SetExactValue), S(InsertExactValue), S(RemoveExactValue), S(GetLowerBound), S(GetUpperBound), S(GetNextExactValue),
+  S(GetPrevExactValue), S(CalcLength), S(CalcInverseLength), S(CalcStringRepresentation),
+  S(CalcInverseStringRepresentation), S(CalcLowerValue), S(CalcInverseLowerValue), S(CalcUpperValue),
+  S(CalcInverseUpperValue), S(CalcConcatenation), S(CalcFirstInverseConcatenation), S(CalcSecondInverseConcatenation),
+  S(CalcSubString), S(CalcFirstInverseSubString), S(CalcSecondInverseSubString), S(CalcThirdInverseSubString),
+};
+const Entry kSingles[] = {{"SetLowerBound", Slot(&ZORVadSingleString::SetLowerBound)},
+                          {"SetUpperBound", Slot(&ZORVadSingleString::SetUpperBound)}};
+const Entry kSets[] = {{"SetLowerBound", Slot(&ZORVadEnumString::SetLowerBound)},
+                       {"SetUpperBound", Slot(&ZORVadEnumString::SetUpperBound)}};
+using Known = ZORVaDoObject* (ZORVadSingleString::Descriptor::*)(void*, const void*) const;
+using Unknown = ZORVaDoObject* (ZORVadSingleString::Descriptor::*)(void*) const;
+const Entry kDescriptors[] = {
+  D(CastableID), D(Write), D(Read), D(IsDerivedFrom),
+  {"CreateObject of a text", Slot<Known>(&TypeOfSingles::CreateObject)},
+  {"CreateObject", Slot<Unknown>(&TypeOfSingles::CreateObject)},
+  D(DestroyObject), D(GetObjectSize), D(GetNumberOfArguments), D(GetArgumentsSize), D(IsMatched), D(PrintOn),
+};
+// clang-format on
+
+TEST(Tables, Order) {
+  ExpectInOrder(kStrings);
+  ExpectInOrder(kSingles, 2 + static_cast<std::ptrdiff_t>(std::size(kStrings)));
+  ExpectInOrder(kSets, 2 + static_cast<std::ptrdiff_t>(std::size(kStrings)));
+  ExpectInOrder(kDescriptors);
+}
+
+}  // namespace

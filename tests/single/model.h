@@ -1,0 +1,256 @@
+// A second, slow account of the operations on single strings: a state and a std::string, operands passed as copies,
+// texts compared and cut by the standard library. The target is the operand passed by reference.
+#pragma once
+
+#include <algorithm>
+#include <climits>
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+#include "tests/support/values.h"
+
+namespace zor::test::model {
+
+inline bool IsNil(const Str& v) { return v.tag == kNilTag; }
+inline bool IsAny(const Str& v) { return v.tag == kAnyTag; }
+inline bool IsMax(const Str& v) { return v.tag == kMaxTag; }
+inline bool IsMin(const Str& v) { return v == kMin; }
+inline int Set(Str& t, const Str& value) { return t = value, 1; }
+inline int ToNil(Str& t) { return IsNil(t) ? 0 : Set(t, kNil); }
+inline int ToAny(Str& t) { return IsAny(t) ? 0 : Set(t, kAny); }
+inline int ToMin(Str& t) { return IsMin(t) ? 0 : Set(t, kMin); }
+inline int ToMax(Str& t) { return IsMax(t) ? 0 : Set(t, kMax); }
+inline int Settle(Str& t, const std::string& c) {
+  if (IsAny(t)) return Set(t, Text(c));
+  return t.text == c ? 0 : ToNil(t);
+}
+
+// States and sets.
+inline int Assign(Str& z, Str x) { return IsNil(x) || IsAny(x) ? (z.tag = x.tag, 0) : (z = x, 0); }
+inline int IsIntersected(Str& z, Str x) {
+  if (IsNil(z) || IsNil(x)) return 0;
+  return IsAny(z) || IsAny(x) || z.text == x.text;
+}
+inline int CalcEqualValue(Str& z, Str x) {
+  if (IsNil(z) || IsAny(x)) return 0;
+  if (IsNil(x)) return ToNil(z);
+  if (IsMin(x)) return ToMin(z);
+  if (IsMax(x)) return ToMax(z);
+  return Settle(z, x.text);
+}
+inline int CalcInverseEqualValue(Str z, Str& x) { return CalcEqualValue(x, z); }
+inline int Intersect(Str& z, Str x) { return CalcEqualValue(z, x), 0; }
+inline int Unite(Str& z, Str x) {
+  if (IsAny(z)) return 0;
+  if (IsAny(x)) return ToAny(z), 0;
+  if (IsNil(x) || (IsMin(z) && IsMin(x)) || (IsMax(z) && IsMax(x))) return 0;
+  if (IsMin(z) || IsMax(z) || IsMin(x) || IsMax(x)) return ToAny(z), 0;
+  if (IsNil(z)) return z = Text(x.text), 0;
+  return z.text == x.text ? 0 : (ToAny(z), 0);
+}
+inline int CalcUnequalValue(Str& z, Str x) {
+  if (IsNil(z) || IsAny(x)) return 0;
+  if (IsNil(x)) return ToNil(z);
+  return IsAny(z) || z.text != x.text ? 0 : ToNil(z);
+}
+inline int CalcInverseUnequalValue(Str z, Str& x) { return CalcUnequalValue(x, z); }
+
+// Order. t is one of a and b, as it was.
+inline int Less(Str a, Str b, Str& t) {
+  if (IsNil(a) || IsNil(b)) return ToNil(t);
+  if (IsAny(a) || IsAny(b)) return 0;
+  if (IsMax(a) || IsMin(b)) return ToNil(t);
+  if (IsMin(a) || IsMax(b)) return 0;
+  return a.text < b.text ? 0 : ToNil(t);
+}
+inline int LessOrEqual(Str a, Str b, Str& t) {
+  if (IsNil(a) || IsNil(b)) return ToNil(t);
+  if (IsAny(a) || IsAny(b)) return 0;
+  if (IsMin(a) || IsMax(b)) return 0;
+  if (IsMax(a) || IsMin(b)) return ToNil(t);
+  return a.text <= b.text ? 0 : ToNil(t);
+}
+inline int CalcLessValue(Str& z, Str x) { return Less(z, x, z); }
+inline int CalcInverseLessValue(Str z, Str& x) { return Less(z, x, x); }
+inline int CalcLessOrEqualValue(Str& z, Str x) { return LessOrEqual(z, x, z); }
+inline int CalcInverseLessOrEqualValue(Str z, Str& x) { return LessOrEqual(z, x, x); }
+inline int CalcNotLessValue(Str& z, Str x) { return LessOrEqual(x, z, z); }
+inline int CalcInverseNotLessValue(Str z, Str& x) { return LessOrEqual(x, z, x); }
+inline int CalcNotLessAndUnequalValue(Str& z, Str x) { return Less(x, z, z); }
+inline int CalcInverseNotLessAndUnequalValue(Str z, Str& x) { return Less(x, z, x); }
+
+// Extremes.
+inline int CalcMaxValue(Str& z, Str x, Str y) {
+  if (IsNil(x) || IsNil(y)) return ToNil(z);
+  if (IsAny(x) || IsAny(y)) return ToAny(z);
+  if (IsMax(x) || IsMax(y)) return !IsMax(z) && !IsAny(z) ? ToNil(z) : ToMax(z);
+  return Settle(z, std::max(x.text, y.text));
+}
+inline int CalcMinValue(Str& z, Str x, Str y) {
+  if (IsNil(x) || IsNil(y)) return ToNil(z);
+  if (IsAny(x) || IsAny(y)) return ToAny(z);
+  if (IsMin(x) || IsMin(y)) return !IsMin(z) && !IsAny(z) ? ToNil(z) : ToMin(z);
+  if (IsMax(x) && IsMax(y)) return ToMax(z);
+  if (IsMax(x) || IsMax(y)) return Settle(z, IsMax(x) ? y.text : x.text);
+  return Settle(z, std::min(x.text, y.text));
+}
+inline int CalcFirstInverseMaxValue(Str z, Str& x, Str y) {
+  if ((IsAny(z) && IsAny(x)) || IsAny(y) || IsNil(x)) return 0;
+  if (IsNil(z) || IsNil(y)) return ToNil(x);
+  if (IsAny(z)) return ToAny(x);
+  if (IsAny(x)) {
+    if (IsMax(z)) return ToMax(x);
+    if (IsMin(z) || z.text < y.text) return ToNil(x);
+    return z.text == y.text ? 0 : Set(x, z);
+  }
+  if (y.text <= x.text && z.text == x.text) return 0;
+  return x.text < y.text && z.text == y.text ? 0 : ToNil(x);
+}
+inline int CalcFirstInverseMinValue(Str z, Str& x, Str y) {
+  if ((IsAny(z) && IsAny(x)) || IsAny(y) || IsNil(x)) return 0;
+  if (IsNil(z) || IsNil(y)) return ToNil(x);
+  if (IsAny(z)) return ToAny(x);
+  if (IsAny(x)) return IsMax(z) || z.text > y.text ? ToNil(x) : Set(x, z);
+  if (x.text <= y.text && z.text == x.text) return 0;
+  return y.text < x.text && z.text == y.text ? 0 : ToNil(x);
+}
+inline int CalcNextValue(Str& z, Str x) {
+  if (IsAny(x)) return 0;
+  if (IsMax(x) || IsNil(x)) return ToNil(z);
+  if (x.text.size() < 255) return Settle(z, x.text + ' ');
+  const std::size_t i = x.text.find_last_not_of('z');
+  if (i != std::string::npos) return Settle(z, x.text.substr(0, i) + static_cast<char>(x.text[i] + 1));
+  if (IsAny(z)) return ToMax(z);
+  return z.text == x.text ? 0 : ToNil(z);
+}
+inline int CalcInverseNextValue(Str z, Str& x) {
+  if (IsAny(z)) return 0;
+  if (IsMin(z) || IsNil(z) || z.text.empty()) return ToNil(x);
+  std::string u = z.text;
+  if (u.back() == ' ') {
+    u.pop_back();
+  } else {
+    --u.back();
+  }
+  return Settle(x, u.size() < 255 ? u + std::string(255 - u.size(), 'z') : u);
+}
+
+// Concatenation and substring.
+inline int CalcConcatenation(Str& z, Str x, Str y) {
+  if (IsNil(z) || IsNil(x) || IsNil(y)) return ToNil(z);
+  if (IsAny(x) || IsAny(y)) return ToAny(z);
+  if (IsMax(x) || IsMax(y) || (x.text + y.text).size() > 255) return ToMax(z);
+  return Settle(z, x.text + y.text);
+}
+inline int CalcFirstInverseConcatenation(Str z, Str& x, Str y) {
+  if (IsNil(x)) return 0;
+  if (IsNil(z) || IsNil(y)) return ToNil(x);
+  if (IsAny(z) || IsAny(y) || IsMax(y) || IsMax(z)) return ToAny(x);
+  const std::size_t p = z.text.find(y.text);
+  return p == std::string::npos ? ToNil(x) : Settle(x, z.text.substr(0, p));
+}
+inline int CalcSecondInverseConcatenation(Str z, Str x, Str& y) {
+  if (IsNil(y)) return 0;
+  if (IsNil(z) || IsNil(x)) return ToNil(y);
+  if (IsAny(z) || IsAny(x) || IsMax(x) || IsMax(z)) return ToAny(y);
+  return z.text.find(x.text) == std::string::npos ? ToNil(y) : Settle(y, z.text.substr(x.text.size()));
+}
+inline ZORLong Wrap(std::int64_t n) { return static_cast<ZORLong>(static_cast<std::uint32_t>(n)); }
+inline std::string Sub(const std::string& t, ZORLong start, ZORLong count) {
+  if (start < 0 || start >= static_cast<ZORLong>(t.size()) || count < 0) return "";
+  return t.substr(start, count);
+}
+inline std::string Slice(const Str& v, const Int& start, const Int& end) {
+  return Sub(v.text, start.value, Wrap(std::int64_t{end.value} + 1 - start.value));
+}
+inline bool OneIs(Tag tag, const Int& a, const Int& b) { return a.tag == tag || b.tag == tag; }
+inline int CalcSubString(Str& z, Str x, Int start, Int end) {
+  if (IsNil(x)) return ToNil(z);
+  if (IsAny(x)) return ToAny(z);
+  if (IsMin(x)) return ToMin(z);
+  if (OneIs(kNilTag, start, end)) return ToNil(z);
+  if (OneIs(kAnyTag, start, end)) return ToAny(z);
+  return Settle(z, Slice(x, start, end));
+}
+inline int CalcFirstInverseSubString(Str z, Str& x, Int start, Int end) {
+  if (IsNil(x)) return 0;
+  if (IsNil(z)) return ToNil(x);
+  if (IsAny(z) || OneIs(kAnyTag, start, end)) return ToAny(x);
+  if (IsAny(x)) return 0;
+  return !OneIs(kNilTag, start, end) && z.text == Slice(x, start, end) ? 0 : ToNil(x);
+}
+inline int Set(Int& t, Int value) { return t == value && value.tag != kExact ? 0 : (t = value, 1); }
+// Narrows the start or the end, t as it was.
+inline int Position(Str z, Str x, Int start, Int end, Int& t, bool isStart) {
+  const ZORLong n = static_cast<ZORLong>(z.text.size());
+  const Int known = isStart ? end : start;
+  if (IsNil(z) || IsNil(x) || OneIs(kNilTag, start, end)) return Set(t, kNoNumber);
+  if (IsAny(z) || IsAny(x)) return Set(t, kAnyNumber);
+  if (!OneIs(kAnyTag, start, end)) return z.text == Slice(x, start, end) ? 0 : Set(t, kNoNumber);
+  if (t.tag == kExact) return 0;
+  ZORLong at = static_cast<ZORLong>(x.text.find(z.text));  // below 0 when nowhere
+  if (known.tag == kAnyTag && at < 0) return Set(t, kNoNumber);
+  if (known.tag == kExact) at = isStart ? Wrap(std::int64_t{end.value} + 1 - n) : start.value;
+  if (known.tag == kExact && Sub(x.text, at, n) != z.text) return Set(t, kNoNumber);
+  return Set(t, Number(isStart ? at : Wrap(std::int64_t{at} + n - 1)));
+}
+inline int CalcSecondInverseSubString(Str z, Str x, Int& start, Int end) {
+  return Position(z, x, start, end, start, true);
+}
+inline int CalcThirdInverseSubString(Str z, Str x, Int start, Int& end) {
+  return Position(z, x, start, end, end, false);
+}
+
+// Case.
+template <char first, char last>
+std::string Folded(std::string text) {
+  for (char& c : text) c = c >= first && c <= last ? static_cast<char>(c ^ 0x20) : c;
+  return text;
+}
+inline int Fold(Str& z, Str x, std::string (*fold)(std::string)) {
+  if (IsNil(x) || IsNil(z)) return ToNil(z);
+  if (IsAny(z) && IsAny(x)) return 0;
+  if (IsMin(x)) return IsAny(z) ? ToMin(z) : IsMin(z) ? 0 : ToNil(z);
+  if (IsMax(x)) return IsAny(z) ? ToMax(z) : IsMax(z) ? 0 : ToNil(z);
+  if (IsMin(z) || IsMax(z)) return ToNil(z);
+  if (IsAny(x)) return fold(z.text) == z.text ? 0 : ToNil(z);
+  return Settle(z, fold(x.text));
+}
+inline int InverseFold(Str z, Str& x, std::string (*fold)(std::string)) {
+  if (IsNil(z)) return ToNil(x);
+  if ((IsMin(z) && IsMin(x)) || (IsMax(z) && IsMax(x))) return 0;
+  if (IsMin(z) || IsMax(z) || IsMin(x) || IsMax(x)) return ToNil(x);
+  if (IsAny(z)) return 0;
+  return fold(IsAny(x) ? z.text : x.text) == z.text ? 0 : ToNil(x);
+}
+inline int CalcLowerValue(Str& z, Str x) { return Fold(z, x, Folded<'A', 'Z'>); }
+inline int CalcInverseLowerValue(Str z, Str& x) { return InverseFold(z, x, Folded<'A', 'Z'>); }
+inline int CalcUpperValue(Str& z, Str x) { return Fold(z, x, Folded<'a', 'z'>); }
+inline int CalcInverseUpperValue(Str z, Str& x) { return InverseFold(z, x, Folded<'a', 'z'>); }
+
+// Text forms.
+inline std::string Print(const Str& v) {
+  return IsNil(v) ? "Nil" : IsAny(v) ? "Any" : IsMax(v) ? "Max" : IsMin(v) ? "Min" : '"' + v.text + '"';
+}
+// At most limit characters up to the delimiter, which is taken; a zero character hides the rest.
+inline std::string Line(std::string_view& in, std::size_t limit, char delimiter) {
+  const std::string line(in.substr(0, std::min({in.find(delimiter), limit, in.size()})));
+  in.remove_prefix(line.size());
+  if (in.starts_with(delimiter)) in.remove_prefix(1);
+  return line.c_str();
+}
+inline Str Input(std::string_view& in) {
+  in.remove_prefix(std::min(in.find_first_not_of(" \t\n\v\f\r"), in.size()));
+  if (in.starts_with('"')) return in.remove_prefix(1), Text(Line(in, 254, '"'));
+  if (in.empty() || std::string_view("MNA").find(in[0]) == std::string_view::npos) return kNil;
+  const std::string word = Line(in, 3, '\n');
+  return word == "Min" ? kMin : word == "Max" ? kMax : word == "Any" ? kAny : kNil;
+}
+inline int CalcStringRepresentation(Str& z, Str x) { return Set(z, Text(Print(x))); }
+inline int CalcInverseStringRepresentation(Str z, Str& x) {
+  std::string_view in = z.text;
+  return Set(x, Input(in));
+}
+
+}  // namespace zor::test::model

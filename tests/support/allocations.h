@@ -1,0 +1,27 @@
+// Counts what is allocated, by texts and by operator new alike. For one source file of a program. Where the address
+// sanitizer has a malloc of its own, nothing is counted.
+#pragma once
+
+#include <cstdlib>
+
+#if defined(__SANITIZE_ADDRESS__)
+#define ZOR_HAS_OWN_MALLOC
+#elif defined(__has_feature)
+#if __has_feature(address_sanitizer)
+#define ZOR_HAS_OWN_MALLOC
+#endif
+#endif
+
+namespace zor::test {
+inline int sAllocations = 0;
+}
+
+#ifndef ZOR_HAS_OWN_MALLOC
+extern "C" {
+void* __libc_malloc(std::size_t size);
+void* malloc(std::size_t size) {
+  ++zor::test::sAllocations;
+  return __libc_malloc(size);
+}
+}
+#endif

@@ -1,8 +1,11 @@
 // A string variable that holds an ordered, finite set of the texts that are still possible.
 #pragma once
 
+#include <bitset>
+
 #include "module/ZORVaDoString.h"
 #include "module/fold.h"
+#include "module/limits.h"
 #include "single/ZORVadSingleString.h"
 #include "vector/ZORISVectorImp_String.h"
 
@@ -14,9 +17,10 @@
 //          and nothing else.
 // An Exact value never keeps an empty set: an operation that would leave one makes the value Nil.
 //
-// Texts are copied in and stay the caller's. Equal texts stand side by side only after InputValue and Read. There is
-// no limit on their length, and one of 256 texts only where InsertExactValue is at work: the 257th turns the value
-// into Any. Memory that cannot be had ends the process, since a lost text would be a wrong answer.
+// Texts are copied in and stay the caller's. Equal texts stand side by side only after InputValue and Read, and where
+// Insert or Append add to an Any or Nil value, which compares nothing. There is no limit on their length, and one of
+// 256 texts only where InsertExactValue is at work: the 257th turns the value into Any. Memory that cannot be had
+// ends the process, since a lost text would be a wrong answer.
 //
 // An operation stands here in its typed forms, some with a single string as operand. Its entry in the solver's table
 // goes to the form that fits after these tests: an operand that is missing or fits no form changes nothing, 0 (Assign,
@@ -122,7 +126,10 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   using Single = ZORVadSingleString;
   using Bound = ZORString (ZORVaDoString::*)() const;
 
+  using Marks = std::bitset<zor::kSetLimit>;  // of listed texts
+
   explicit ZORVadEnumString(ZORStringStateTag state);
+  explicit ZORVadEnumString(std::size_t candidates);
 
   const ZORString& First() const { return *mVector[0]; }
   const ZORString& Last() const { return *mVector[mVector.Count() - 1]; }
@@ -130,6 +137,10 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   unsigned int CountUpTo(const ZORString& text) const;
   void Reserve(unsigned int places);
   void Store(ZORString* text, unsigned int position);
+  template <class Text>
+  int Place(Text&& text);
+  template <class Text>
+  void PlaceExact(Text&& text);
   void StoreLast(const ZORString& text);
   void Remove(unsigned int position, unsigned int count);
   void Flush();
@@ -139,6 +150,10 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   int Merge(const ZORISVectorImp_String& texts);
   int Keep(const ZORISVectorImp_String& texts);
   int Narrow(ZORVadEnumString& candidates);
+  bool CanMark(std::size_t candidates) const;
+  void Mark(const ZORString& candidate, Marks& marks, unsigned int& next) const;
+  void MarkPairs(const Enum& heads, const Enum& tails, Marks& marks) const;
+  int KeepMarked(const Marks& marks);
   void InputSet(ZORistrstream& in);
 
   template <class X>

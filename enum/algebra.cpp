@@ -1,5 +1,21 @@
 // Set operations of sets of texts: intersection, equality and union.
+#include <algorithm>
+
 #include "enum/dispatch.h"
+
+namespace {
+
+constexpr unsigned int kAhead = 8;    // places between a text that is compared and one on its way into the cache
+constexpr unsigned int kSearch = 16;  // so many times larger a set is searched, not walked
+
+// The first place whose text is not below the one sought.
+unsigned int FindPlace(const ZORISVectorImp_String& texts, const ZORString& sought) {
+  ZORString* const* const places = &texts[0];
+  const auto below = [](const ZORString* text, const ZORString& bound) { return *text < bound; };
+  return static_cast<unsigned int>(std::lower_bound(places, places + texts.Count(), sought, below) - places);
+}
+
+}  // namespace
 
 int ZORVadEnumString::Intersect(const ZORVadEnumString& other) {
   if (IsNil()) return 0;
@@ -24,10 +40,16 @@ int ZORVadEnumString::Intersect(const ZORISVectorImp_String& texts) {
 int ZORVadEnumString::Keep(const ZORISVectorImp_String& texts) {
   const unsigned int count = mVector.Count(), others = texts.Count();
   ZORString** const places = &mVector[0];
+  const bool searches = others / kSearch > count;
   unsigned int kept = 0;
   for (unsigned int i = 0, j = 0; i < count; ++i) {
+    if (i + kAhead < count) __builtin_prefetch(places[i + kAhead]);
+    if (searches) j = std::max(j, FindPlace(texts, *places[i]));
     std::strong_ordering order = std::strong_ordering::less;
-    while (j < others && (order = *places[i] <=> *texts[j]) > 0) ++j;
+    while (j < others && (order = *places[i] <=> *texts[j]) > 0) {
+      ++j;
+      if (j + kAhead < others) __builtin_prefetch(texts[j + kAhead]);
+    }
     if (j < others && order == 0) {
       places[kept++] = places[i];
       ++j;
@@ -43,6 +65,36 @@ int ZORVadEnumString::Keep(const ZORISVectorImp_String& texts) {
 // The end of the operations that build candidates: candidates are used up.
 int ZORVadEnumString::Narrow(ZORVadEnumString& candidates) {
   return IsUndefined() && !candidates.IsUndefined() ? Take(candidates) : Intersect(candidates);
+}
+
+// Candidates for a set with texts can be looked up there one by one and need not be built, as long as there are too
+// few of them to make a value Undefined.
+bool ZORVadEnumString::CanMark(std::size_t candidates) const {
+  return !IsUndefined() && mVector.Count() > 0 && mVector.Count() <= zor::kSetLimit && candidates <= zor::kSetLimit;
+}
+
+// Candidates mostly come in order, so the place behind the last one found is tried first. Of equal texts the first
+// alone is meant.
+void ZORVadEnumString::Mark(const ZORString& candidate, Marks& marks, unsigned int& next) const {
+  if (next > 0 && next <= mVector.Count() && *mVector[next - 1] == candidate) return;
+  if (next >= mVector.Count() || *mVector[next] != candidate) next = mVector.ClusteredFind(&candidate);
+  if (next < mVector.Count()) marks.set(next++);
+}
+
+int ZORVadEnumString::KeepMarked(const Marks& marks) {
+  const unsigned int count = mVector.Count();
+  if (marks.count() == count) return 0;
+  ZORString** const places = &mVector[0];
+  unsigned int kept = 0;
+  for (unsigned int i = 0; i < count; ++i) {
+    if (marks[i]) {
+      places[kept++] = places[i];
+    } else {
+      delete places[i];
+    }
+  }
+  mVector.SetTop(kept, count);
+  return kept > 0 ? 1 : Nil();
 }
 
 // Both tests of the single value's extremes stand before every look at the target's content.

@@ -1,11 +1,5 @@
 // Bounds of sets of texts, and texts one at a time.
-#include "enum/ZORVadEnumString.h"
-
-namespace {
-
-constexpr int kSetLimit = 256;  // texts that InsertExactValue lists at most
-
-}  // namespace
+#include "enum/insertion.h"
 
 ZORString ZORVadEnumString::GetLowerBound() const {
   if (IsNil()) return ZorVaDoStringNil;
@@ -38,12 +32,7 @@ ZORString ZORVadEnumString::GetPrevExactValue(const ZORString& text) const {
 
 void ZORVadEnumString::SetExactValue(const ZORString& text) { Become(ZorStringExact, text); }
 
-void ZORVadEnumString::InsertExactValue(const ZORString& text) {
-  if (IsUndefined() || IsFull()) return;
-  if (Count() == kSetLimit) return SetUndefinedValue();  // also for a listed text; larger sets take further texts
-  Insert(text);
-  mState = ZorStringExact;
-}
+void ZORVadEnumString::InsertExactValue(const ZORString& text) { PlaceExact(text); }
 
 int ZORVadEnumString::RemoveExactValue(const ZORString& text) {
   if (IsUndefined() || IsNil()) return 0;

@@ -1,16 +1,45 @@
 // Concatenation of sets of texts, and the operations that tell a set nothing.
+#include <string_view>
+#include <utility>
+
 #include "enum/dispatch.h"
+#include "enum/insertion.h"
+#include "module/textview.h"
+
+// Marks the listed texts that are a head and a tail. Those that begin with one head stand together, in the order of
+// what follows it, so that one walk compares them with the tails. Of equal texts the first alone can be meant.
+void ZORVadEnumString::MarkPairs(const Enum& heads, const Enum& tails, Marks& marks) const {
+  const unsigned int count = mVector.Count(), countTails = tails.mVector.Count();
+  for (unsigned int h = 0; h < heads.mVector.Count(); ++h) {
+    const std::string_view head = zor::View(*heads.mVector[h]);
+    unsigned int t = 0;
+    for (unsigned int i = CountBelow(*heads.mVector[h]); i < count; ++i) {
+      const std::string_view text = zor::View(*mVector[i]);
+      if (text.substr(0, head.size()) != head) break;
+      const std::string_view rest = text.substr(head.size());
+      while (t < countTails && zor::View(*tails.mVector[t]) < rest) ++t;
+      if (t == countTails) break;
+      if (zor::View(*tails.mVector[t]) == rest && (i == 0 || *mVector[i - 1] != *mVector[i])) marks.set(i);
+    }
+  }
+}
 
 int ZORVadEnumString::CalcConcatenation(const ZORVadEnumString& x, const ZORVadEnumString& y) {
   if (IsNil() || x.IsNil() || y.IsNil()) return Nil();
   if (x.IsUndefined() || y.IsUndefined()) return 0;
   if (x.IsFull() || y.IsFull()) return CalcMaxValue();
-  ZORVadEnumString candidates(ZorStringNil);
+  const std::size_t pairs = std::size_t{x.mVector.Count()} * y.mVector.Count();
+  if (CanMark(pairs)) {
+    Marks marks;
+    MarkPairs(x, y, marks);
+    return KeepMarked(marks);
+  }
+  ZORVadEnumString candidates(pairs);
   for (ZORISVectorIteratorImp_String head(x.mVector); head; ++head) {
     for (ZORISVectorIteratorImp_String tail(y.mVector); tail; ++tail) {
       ZORString text(*head.Current());
-      candidates.InsertExactValue(text.Append(*tail.Current()));
-      if (candidates.IsUndefined()) return 0;  // more than a set can hold
+      candidates.PlaceExact(std::move(text.Append(*tail.Current())));
+      if (candidates.IsUndefined()) return 0;  // more than a set can hold tells nothing
     }
   }
   return Narrow(candidates);

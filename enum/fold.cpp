@@ -1,5 +1,6 @@
 // Lower and upper case of sets of texts.
 #include "enum/dispatch.h"
+#include "enum/insertion.h"
 
 using zor::Folded;
 using zor::IsFolded;
@@ -17,10 +18,15 @@ int ZORVadEnumString::MeetFolds(const X& x, Fitting fitting) {
 
 int ZORVadEnumString::CalcFoldValue(const Enum& x, zor::Fold fold) {
   return MeetFolds(x, [&] {
-    ZORVadEnumString folds(ZorStringNil);
-    for (ZORISVectorIteratorImp_String text(x.mVector); text; ++text) {
-      folds.InsertExactValue(Folded(*text.Current(), fold));
+    if (CanMark(x.mVector.Count())) {
+      Marks marks;
+      unsigned int next = 0;
+      for (ZORISVectorIteratorImp_String text(x.mVector); text; ++text)
+        Mark(Folded(*text.Current(), fold), marks, next);
+      return KeepMarked(marks);
     }
+    ZORVadEnumString folds(x.mVector.Count());
+    for (ZORISVectorIteratorImp_String text(x.mVector); text; ++text) folds.PlaceExact(Folded(*text.Current(), fold));
     return Narrow(folds);
   });
 }

@@ -18,7 +18,7 @@ int ZORVadEnumString::CalcInverseLength(const ZORVaDoInteger& n) {
   if (n.IsNil()) return Nil();
   if (n.IsUndefined() || IsNil() || IsUndefined()) return 0;
   if (n.GetExactValue() < 0) return Nil();
-  ZORVadEnumString kept(ZorStringNil);
+  ZORVadEnumString kept(mVector.Count());
   ZORVadSingleInteger length;
   for (ZORISVectorIteratorImp_String text(mVector); text; ++text) {
     length.SetExactValue(text.Current()->GetLengthInChar());

@@ -3,7 +3,7 @@
 #include <cstdio>
 #include <cstdlib>
 
-#include "enum/ZORVadEnumString.h"
+#include "enum/insertion.h"
 
 namespace {
 
@@ -30,6 +30,7 @@ unsigned int ZORVadEnumString::CountUpTo(const ZORString& text) const {
 }
 
 void ZORVadEnumString::Reserve(unsigned int places) {
+  Require(mVector.Good());
   if (places > mVector.Limit()) Require(mVector.Resize(places));
 }
 
@@ -56,15 +57,7 @@ int ZORVadEnumString::Contains(const ZORString* text) const {
   return position <= mVector.Count() ? static_cast<int>(position + 1) : 0;
 }
 
-// The answers of Contains and the place of a new text come from one bisection; texts mostly arrive in order.
-int ZORVadEnumString::Insert(const ZORString& text) {
-  const unsigned int count = mVector.Count();
-  const unsigned int position = count == 0 || Last() < text ? count : CountUpTo(text);
-  const bool known = !IsUndefined() && !IsNil();
-  if (known && position > 0 && *mVector[position - 1] == text) return 0;
-  Store(new ZORString(text), position);
-  return 1;
-}
+int ZORVadEnumString::Insert(const ZORString& text) { return Place(text); }
 
 int ZORVadEnumString::Append(const ZORVadEnumString& other) {
   if (other.Count() == 0) return 0;
@@ -90,11 +83,14 @@ int ZORVadEnumString::Merge(const ZORISVectorImp_String& texts) {
   std::copy_backward(places, places + own, end);
 
   ZORString** out = places;
+  const ZORString* added = nullptr;
   for (unsigned int i = 0; i < more; ++i) {
     const ZORString& text = *texts[i];
-    while (next != end && **next <= text) *out++ = *next++;
-    if (known && out != places && *out[-1] == text) continue;
-    *out++ = new ZORString(text);
+    std::strong_ordering order = std::strong_ordering::greater;
+    while (next != end && ((order = **next <=> text) < 0 || (order == 0 && !known))) *out++ = *next++;
+    const bool listed = (next != end && order == 0) || (added != nullptr && *added == text);
+    if (listed && known) continue;
+    added = *out++ = new ZORString(text);
   }
   while (next != end) *out++ = *next++;
   const auto count = static_cast<unsigned int>(out - places);

@@ -1,4 +1,6 @@
 // What a set of texts is: its statics, construction, copies and states.
+#include <algorithm>
+
 #include "enum/dispatch.h"
 #include "module/characters.h"
 #include "module/plumbing.h"
@@ -16,6 +18,13 @@ ZORVadEnumString* ZORVadEnumString::Build(ZORStreamable* object) {
 }
 
 ZORVadEnumString::ZORVadEnumString(ZORStringStateTag state) : mVector(kPlaces, kPlaces) { mState = state; }
+
+// A set to be filled, with places for as many candidates as it can hold.
+ZORVadEnumString::ZORVadEnumString(std::size_t candidates)
+    : mVector(static_cast<unsigned int>(std::min(candidates, zor::kSetLimit)), kPlaces) {
+  mState = ZorStringNil;
+}
+
 ZORVadEnumString::ZORVadEnumString() : ZORVadEnumString(ZorStringAny) {}
 ZORVadEnumString::ZORVadEnumString(const ZORVadEnumString& other) : ZORVadEnumString(other.mState) { Append(other); }
 ZORVadEnumString::ZORVadEnumString(const ZORVadSingleString& other) : ZORVadEnumString() { Copy(other); }

@@ -42,18 +42,6 @@ ZORChar::~ZORChar() = default;
 
 bool operator==(const ZORChar& a, const ZORChar& b) { return static_cast<char>(a) == static_cast<char>(b); }
 
-ZORString::ZORString() noexcept { mInside[0] = '\0'; }
-
-ZORString::ZORString(const ZORString& other) : ZORString() {
-  if (other.IsOwner()) {
-    Extend(other.View());
-  } else {
-    Mirror(other);
-  }
-}
-
-ZORString::ZORString(ZORString&& other) noexcept : ZORString() { Take(other); }
-
 ZORString::ZORString(const char* text) : ZORString() { Extend(ViewOf(text)); }
 
 ZORString::ZORString(const char* text, std::size_t length) : ZORString() { Extend(std::string_view(text, length)); }
@@ -69,10 +57,12 @@ ZORString::ZORString(const ZORChar& c, std::size_t count) : ZORString() {
   }
 }
 
-ZORString::~ZORString() { Release(); }
-
+// A block of our own that is large enough is kept.
 ZORString& ZORString::operator=(const ZORString& other) {
-  if (this != &other) *this = ZORString(other);
+  if (this == &other) return *this;
+  if (!IsOwner() || other.mCapacity == kShared || other.mLength >= mCapacity) return *this = ZORString(other);
+  std::memcpy(mOutside, other.CastToCharPtr(), other.mLength + std::size_t{1});
+  mLength = other.mLength;
   return *this;
 }
 
@@ -84,7 +74,6 @@ ZORString& ZORString::operator=(ZORString&& other) noexcept {
 }
 
 void* ZORString::operator new(std::size_t size) { return AllocateOrDie(size); }
-void ZORString::operator delete(void* memory) noexcept { ::operator delete(memory); }
 
 bool ZORString::operator==(const char* text) const { return View() == ViewOf(text); }
 
@@ -149,6 +138,11 @@ char* ZORString::Reserve(std::size_t length) {
   return block;
 }
 
+void ZORString::CopyBlock(const ZORString& other) {
+  std::memset(mInside, 0, kRoom);
+  Extend(other.View());
+}
+
 // Text must not lie in storage that Reserve lets go.
 void ZORString::Extend(std::string_view text) {
   const std::size_t length = mLength + text.size();
@@ -158,22 +152,6 @@ void ZORString::Extend(std::string_view text) {
 }
 
 void ZORString::SetLength(std::size_t length) {
-  (mCapacity == kInside ? mInside : mOutside)[length] = '\0';
+  if (mCapacity != kInside) mOutside[length] = '\0';
   mLength = static_cast<std::uint32_t>(length);
-}
-
-void ZORString::Mirror(const ZORString& other) noexcept {
-  std::memcpy(mInside, other.mInside, kRoom);
-  mLength = other.mLength;
-  mCapacity = other.mCapacity;
-}
-
-void ZORString::Take(ZORString& other) noexcept {
-  Mirror(other);
-  other.mCapacity = kInside;
-  other.SetLength(0);
-}
-
-void ZORString::Release() noexcept {
-  if (IsOwner()) ::operator delete(mOutside);
 }

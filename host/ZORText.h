@@ -38,19 +38,19 @@ ZOR_EXPORT bool operator==(const ZORChar& a, const ZORChar& b);
 // Memory that cannot be had ends the process with a message, since a lost text would be a wrong answer.
 class ZOR_EXPORT ZORString {
  public:
-  ZORString() noexcept;
-  ZORString(const ZORString& other);
-  ZORString(ZORString&& other) noexcept;  // other is empty afterwards
-  ZORString(const char* text);            // NOLINT(google-explicit-constructor): zero-ended, copied; null is empty
+  ZORString() noexcept : mInside{} {}
+  ZORString(const ZORString& other) { other.IsOwner() ? CopyBlock(other) : Mirror(other); }
+  ZORString(ZORString&& other) noexcept { Take(other); }  // other is empty afterwards
+  ZORString(const char* text);  // NOLINT(google-explicit-constructor): zero-ended, copied; null is empty
   ZORString(const ZORChar& c, std::size_t count);
   ZORString(const char* text, std::size_t length);
-  ~ZORString();
+  ~ZORString() { Release(); }
   ZORString& operator=(const ZORString& other);
   ZORString& operator=(ZORString&& other) noexcept;
 
   static void* operator new(std::size_t size);  // never answers null
   static void* operator new(std::size_t, void* place) noexcept { return place; }
-  static void operator delete(void* memory) noexcept;
+  static void operator delete(void* memory) noexcept { ::operator delete(memory); }
 
   bool operator==(const ZORString& other) const;
   bool operator==(const char* text) const;
@@ -74,8 +74,10 @@ class ZOR_EXPORT ZORString {
   static constexpr int kInline = kRoom - 1;
   static constexpr std::uint32_t kInside = 0, kShared = UINT32_MAX;  // else mCapacity is the size of our own block
 
+  static bool AreInside(const ZORString& a, const ZORString& b) { return (a.mCapacity | b.mCapacity) == kInside; }
   std::string_view View() const { return {CastToCharPtr(), mLength}; }
   bool IsOwner() const { return mCapacity != kInside && mCapacity != kShared; }
+  void CopyBlock(const ZORString& other);
   void Extend(std::string_view text);
   void FlipCase(char first, char last);
   char* Reserve(std::size_t length);
@@ -84,22 +86,42 @@ class ZOR_EXPORT ZORString {
   void Take(ZORString& other) noexcept;
   void Release() noexcept;
 
+  std::uint32_t mLength = 0;  // in front, with the start of the text in its cache line
+  std::uint32_t mCapacity = kInside;
   union {
-    char mInside[kRoom];
+    char mInside[kRoom];  // the rest of it is zero
     char* mOutside;
   };
-  std::uint32_t mLength = 0;
-  std::uint32_t mCapacity = kInside;
 };
 
+inline void ZORString::Mirror(const ZORString& other) noexcept {
+  std::memcpy(mInside, other.mInside, kRoom);
+  mLength = other.mLength;
+  mCapacity = other.mCapacity;
+}
+
+inline void ZORString::Take(ZORString& other) noexcept {
+  Mirror(other);
+  std::memset(other.mInside, 0, kRoom);
+  other.mLength = 0;
+  other.mCapacity = kInside;
+}
+
+inline void ZORString::Release() noexcept {
+  if (IsOwner()) ::operator delete(mOutside);
+}
+
+// Texts inside their objects compare with their padding, in one step whose cost does not hang on their lengths.
 inline bool ZORString::operator==(const ZORString& other) const {
-  return mLength == other.mLength && std::memcmp(CastToCharPtr(), other.CastToCharPtr(), mLength) == 0;
+  if (mLength != other.mLength) return false;
+  if (AreInside(*this, other)) return std::memcmp(mInside, other.mInside, kRoom) == 0;
+  return View() == other.View();
 }
 
 inline std::strong_ordering ZORString::operator<=>(const ZORString& other) const {
-  const int common =
-      std::memcmp(CastToCharPtr(), other.CastToCharPtr(), mLength < other.mLength ? mLength : other.mLength);
-  return common != 0 ? common <=> 0 : mLength <=> other.mLength;
+  if (!AreInside(*this, other)) return View() <=> other.View();
+  const int order = std::memcmp(mInside, other.mInside, kRoom);
+  return order != 0 ? order <=> 0 : mLength <=> other.mLength;
 }
 
 class ZORipstream;

@@ -4,10 +4,9 @@
 #include <optional>
 
 #include "host/ZORText.h"
+#include "module/limits.h"
 
 namespace zor {
-
-constexpr int kLengthLimit = 255;  // characters of the longest text of the domain
 
 // The least text above this one: a text below the limit grows by a space, one at the limit drops its trailing z and
 // raises the character before them. None for a text at the limit of nothing but z.

@@ -1,28 +1,24 @@
 // Concatenation and substring of single strings.
+#include <algorithm>
 #include <cstdint>
-#include <cstring>
+#include <string_view>
 
 #include "module/alphabet.h"
 #include "module/guard.h"
+#include "module/textview.h"
 #include "single/ZORVadSingleString.h"
 
 namespace {
 
-bool IsConcatenation(const ZORString& text, const ZORString& x, const ZORString& y) {
-  const std::size_t lengthX = x.GetLengthInChar(), lengthY = y.GetLengthInChar();
-  const char* const characters = text.CastToCharPtr();
-  return static_cast<std::size_t>(text.GetLengthInChar()) == lengthX + lengthY &&
-         std::memcmp(characters, x.CastToCharPtr(), lengthX) == 0 &&
-         std::memcmp(characters + lengthX, y.CastToCharPtr(), lengthY) == 0;
+bool IsConcatenation(std::string_view text, std::string_view x, std::string_view y) {
+  return text.size() == x.size() + y.size() && text.substr(0, x.size()) == x && text.substr(x.size()) == y;
 }
 
 // For texts that keep to the limit together: one allocation, where appending to a copy takes two.
-ZORString Joined(const ZORString& x, const ZORString& y) {
-  const std::size_t lengthX = x.GetLengthInChar(), lengthY = y.GetLengthInChar();
+ZORString Joined(std::string_view x, std::string_view y) {
   char text[zor::kLengthLimit];
-  std::memcpy(text, x.CastToCharPtr(), lengthX);
-  std::memcpy(text + lengthX, y.CastToCharPtr(), lengthY);
-  return {text, lengthX + lengthY};
+  std::copy(y.begin(), y.end(), std::copy(x.begin(), x.end(), text));
+  return {text, x.size() + y.size()};
 }
 
 // Positions and counts are worked out in 32 bits and wrap there.
@@ -47,9 +43,10 @@ int ZORVadSingleString::CalcConcatenation(const ZORVadSingleString& x, const ZOR
   if (IsNil() || x.IsNil() || y.IsNil()) return Nil();
   if (x.IsUndefined() || y.IsUndefined()) return Any();  // overwrites a known value
   if (x.IsFull() || y.IsFull()) return CalcMaxValue();
-  if (std::int64_t{x.mText.GetLengthInChar()} + y.mText.GetLengthInChar() > zor::kLengthLimit) return CalcMaxValue();
-  if (!IsUndefined()) return IsConcatenation(mText, x.mText, y.mText) ? 0 : Nil();  // no text is built to be compared
-  return Settle(Joined(x.mText, y.mText));
+  const std::string_view head = zor::View(x.mText), tail = zor::View(y.mText);
+  if (head.size() + tail.size() > zor::kLengthLimit) return CalcMaxValue();
+  if (!IsUndefined()) return IsConcatenation(zor::View(mText), head, tail) ? 0 : Nil();  // no text is built
+  return Settle(Joined(head, tail));
 }
 
 int ZORVadSingleString::CalcFirstInverseConcatenation(ZORVadSingleString& x, const ZORVadSingleString& y) const {

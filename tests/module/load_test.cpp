@@ -16,7 +16,7 @@ namespace {
 using Log = std::vector<std::string>;
 Log sLog;
 
-std::string Plain(const ZORString& text) { return text.CastToCharPtr(); }
+void Tell(const char* what, const ZORString& name) { sLog.emplace_back(what).append(name.CastToCharPtr()); }
 
 struct Library {
   ~Library() { dlclose(handle); }
@@ -27,9 +27,7 @@ struct Library {
     EXPECT_NE(symbol, nullptr) << name;
     return reinterpret_cast<Symbol*>(symbol);
   }
-  const ZORVaDoObjectDescriptor* Descriptor(const std::string& name) {
-    return *Find<const ZORVaDoObjectDescriptor*>(("_ZN" + name + "11sDescriptorE").c_str());
-  }
+  const ZORVaDoObjectDescriptor* Descriptor(const char* name) { return *Find<const ZORVaDoObjectDescriptor*>(name); }
   std::array<int, 4> Lengths() {
     std::array<int, 4> lengths{};
     std::transform(std::begin(kTexts), std::end(kTexts), lengths.begin(),
@@ -43,18 +41,19 @@ struct Library {
   void* const handle = dlopen(ZOR_MODULE_FILE, RTLD_NOW | RTLD_LOCAL);
 };
 
-constexpr char kString[] = "13ZORVaDoString", kSingle[] = "18ZORVadSingleString", kEnum[] = "16ZORVadEnumString";
+constexpr char kString[] = "_ZN13ZORVaDoString11sDescriptorE", kSingle[] = "_ZN18ZORVadSingleString11sDescriptorE",
+               kEnum[] = "_ZN16ZORVadEnumString11sDescriptorE";
 using InitModule = int(ZORVaDoModule*, ZORVaDoModuleManager*);
 
 // A module object and a manager that tell what they are asked.
 struct Module : ZORVaDoModule {
   Module() : ZORVaDoModule("ZORVadStrings") {}
-  void AddLoadedModule(ZORVaDoModule* module) override { sLog.push_back("needs " + Plain(module->GetName())); }
-  void AddObjectDescriptor(const ZORVaDoObjectDescriptor* made) override { sLog.push_back(Plain(made->GetName())); }
+  void AddLoadedModule(ZORVaDoModule* module) override { Tell("needs ", module->GetName()); }
+  void AddObjectDescriptor(const ZORVaDoObjectDescriptor* made) override { Tell("", made->GetName()); }
 };
 struct Manager : ZORVaDoModuleManager {
   explicit Manager(ZORVaDoModule* module) : answer(module) {}
-  ZORVaDoModule* OpenModule(const ZORString& name) override { return sLog.push_back("open " + Plain(name)), answer; }
+  ZORVaDoModule* OpenModule(const ZORString& name) override { return Tell("open ", name), answer; }
   ZORVaDoModule* answer;
 };
 
@@ -66,7 +65,7 @@ struct ModuleLoad : testing::Test {
 
 TEST_F(ModuleLoad, ClassesComeAndGoInOrder) {
   ZORStreamableClass::Watch([](const ZORStreamableClass& record, bool added) {
-    sLog.emplace_back(1, added ? '+' : '-').append(record.Text()).append(" " + std::to_string(record.Kind()));
+    sLog.emplace_back(1, added ? '+' : '-').append(record.Text()).append(" ").append(std::to_string(record.Kind()));
   });
   { const Library library; }
   ZORStreamableClass::Watch(nullptr);

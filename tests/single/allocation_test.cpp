@@ -1,20 +1,9 @@
 // What calls cost: those that leave known values as they are allocate nothing, but for a long text that has to be
-// worked out to be compared. The sanitizers bring a malloc of their own.
-#include <cstdlib>
-
+// worked out to be compared.
+#include "tests/support/allocations.h"
 #include "tests/support/check.h"
 
-#if !defined(ZOR_SANITIZE)
-
 using namespace zor::test;
-
-static int sAllocations = 0;
-
-// Stands before that of the C library, from which texts and operator new have their memory.
-extern "C" {
-void* __libc_malloc(std::size_t size);
-void* malloc(std::size_t size) { return ++sAllocations, __libc_malloc(size); }
-}
 
 template <class Operation, class... Operands>
 static void Expect(int atMost, int answer, Operation operation, const Operands&... operands) {
@@ -53,5 +42,3 @@ TEST(SingleCost, ByLength) {
     // clang-format on
   }
 }
-
-#endif

@@ -1,0 +1,387 @@
+// Every operation on every combination of values, beside the model.
+#include "tests/enum/model.h"
+
+#include <iterator>
+#include <set>
+
+#include "tests/support/vtable.h"
+
+namespace zor::test {
+namespace {
+
+// What a call answers; 0 of one that answers nothing.
+template <class Call>
+int AnswerOf(Call call) {
+  if constexpr (std::is_void_v<decltype(call())>) {
+    call();
+    return 0;
+  } else {
+    return static_cast<int>(call());
+  }
+}
+
+// The outcome of a relation, however the Boolean stood before.
+template <class Call>
+int TellOf(Call call) {
+  HeldBoolean any({"Any"}), nil({"Nil"});
+  call(any.value);
+  call(nil.value);
+  if (nil.Now().form != "Nil") return model::kUndefined;
+  const std::string form = any.Now().form;
+  return form == "Any" ? model::kOpen : form == "Nil" ? model::kContradiction : form[0];
+}
+
+// An entry on an integer, where the operation takes one.
+template <class Call>
+int OnInteger(Call call, ZORVaDoString& z, ZORVadSingleInteger& n) {
+  if constexpr (std::is_invocable_v<Call, ZORVaDoString&, ZORVadSingleInteger&>) {
+    return AnswerOf([&] { return call(z, n); });
+  } else {
+    return 0;
+  }
+}
+
+struct Operation {  // on sets; pairs leave the third operand alone
+  const char* name;
+  int operands, target;
+  int (*typed)(ZORVadEnumString* const* v);
+  int (*entry)(ZORVaDoString* const* v);
+  int (*model)(Set* v);
+  int (*modelOfEntry)(Set* v);
+  int (*onInteger)(ZORVaDoString& z, ZORVadSingleInteger& n);
+};
+
+struct SingleOperation {  // on a set and a single string
+  const char* name;
+  int (*typed)(ZORVadEnumString& z, ZORVadSingleString& x);  // null when there is no such form
+  int (*entry)(ZORVaDoString& z, ZORVaDoString& x);
+  int (*model)(Set& z, Str& x);
+  int (*modelOfEntry)(Set& z, Str& x);
+};
+
+// clang-format off
+#define ROW(Name, operands, target, callArgs, modelArgs, ofEntry) \
+  {#Name, operands, target, \
+   [](ZORVadEnumString* const* v) { return AnswerOf([&] { return v[0]->Name callArgs; }); }, \
+   [](ZORVaDoString* const* v) { return AnswerOf([&] { return v[0]->Name callArgs; }); }, \
+   [](Set* v) { return model::Name modelArgs; }, [](Set* v) -> int { return ofEntry; }, \
+   [](ZORVaDoString& z, ZORVadSingleInteger& n) { \
+     return OnInteger([](auto& a, auto& b) -> decltype(a.Name(b)) { return a.Name(b); }, z, n); }}
+#define PAIR(Name, target, ofEntry) ROW(Name, 2, target, (*v[1]), (v[0], v[1]), ofEntry)
+#define ALIKE(Name, target)    PAIR(Name, target, (model::Name(v[0], v[1])))
+#define WORDLESS(Name)         PAIR(Name, 0, (model::Name(v[0], v[1]), 0))
+#define FORWARD(Name)          PAIR(Name, 0, (model::Entry(v[0], [&] { return model::Name(v[0], v[1]); }, v[1])))
+#define INVERSE(Name)          PAIR(Name, 1, (model::Entry(v[1], [&] { return model::Name(v[0], v[1]); }, v[0])))
+#define TRIPLE(Name, target, ...) \
+  ROW(Name, 3, target, (*v[1], *v[2]), (v[0], v[1], v[2]), \
+      (model::Entry(v[target], [&] { return model::Name(v[0], v[1], v[2]); }, __VA_ARGS__)))
+#define RELATION(Name) \
+  {#Name, 2, 0, [](ZORVadEnumString* const* v) { return TellOf([&](auto& b) { v[0]->Name(*v[1], b); }); }, \
+   [](ZORVaDoString* const* v) { return TellOf([&](auto& b) { v[0]->Name(*v[1], b); }); }, \
+   [](Set* v) { return model::Name(v[0], v[1]); }, [](Set* v) { return model::Name(v[0], v[1]); }, nullptr}
+
+#define TYPED_ALONE(Name) \
+  {#Name, 2, 0, [](ZORVadEnumString* const* v) { return v[0]->Name(*v[1]); }, nullptr, \
+   [](Set* v) { return model::Name(v[0], v[1]); }, nullptr, nullptr}
+
+const Operation kOperations[] = {
+  WORDLESS(Assign), WORDLESS(Intersect), WORDLESS(Unite), ALIKE(IsIntersected, 0),
+  ALIKE(CalcEqualValue, 0), ALIKE(CalcInverseEqualValue, 1), ALIKE(CalcUnequalValue, 0), ALIKE(CalcInverseUnequalValue, 1),
+  RELATION(CalcIsEqual), RELATION(CalcIsLessOrEqual), RELATION(CalcIsLess),
+  FORWARD(CalcLessValue), FORWARD(CalcLessOrEqualValue), FORWARD(CalcNotLessValue), FORWARD(CalcNotLessAndUnequalValue),
+  INVERSE(CalcInverseLessValue), INVERSE(CalcInverseLessOrEqualValue), INVERSE(CalcInverseNotLessValue),
+  INVERSE(CalcInverseNotLessAndUnequalValue), FORWARD(CalcNextValue), INVERSE(CalcInverseNextValue),
+  FORWARD(CalcLowerValue), INVERSE(CalcInverseLowerValue), FORWARD(CalcUpperValue), INVERSE(CalcInverseUpperValue),
+  TRIPLE(CalcMinValue, 0, v[1], v[2]), TRIPLE(CalcMaxValue, 0, v[1], v[2]), TRIPLE(CalcConcatenation, 0, v[1], v[2]),
+  TRIPLE(CalcFirstInverseMinValue, 1, v[0]), TRIPLE(CalcFirstInverseMaxValue, 1, v[0]),
+  TRIPLE(CalcFirstInverseConcatenation, 1, v[0]), TRIPLE(CalcSecondInverseConcatenation, 2, v[0]),
+  TYPED_ALONE(Copy), TYPED_ALONE(Append),
+};
+#define SINGLE(Name, ofEntry) \
+  {#Name, [](ZORVadEnumString& z, ZORVadSingleString& x) { return AnswerOf([&] { return z.Name(x); }); }, \
+   [](ZORVaDoString& z, ZORVaDoString& x) { return AnswerOf([&] { return z.Name(x); }); }, \
+   [](Set& z, Str& x) { return model::Name(z, x); }, [](Set& z, Str& x) -> int { return ofEntry; }}
+#define SINGLE_ALIKE(Name)    SINGLE(Name, (model::Name(z, x)))
+#define SINGLE_WORDLESS(Name) SINGLE(Name, (model::Name(z, x), 0))
+#define SINGLE_FORWARD(Name)  SINGLE(Name, (model::Entry(z, [&] { return model::Name(z, x); }, x)))
+#define SINGLE_INVERSE(Name)  SINGLE(Name, (model::Entry(x, [&] { return model::Name(z, x); }, z)))
+#define SINGLE_NONE(Name) \
+  {#Name, nullptr, [](ZORVaDoString& z, ZORVaDoString& x) { return z.Name(x); }, nullptr, [](Set&, Str&) { return 0; }}
+#define SINGLE_RELATION(Name) \
+  {#Name, nullptr, [](ZORVaDoString& z, ZORVaDoString& x) { return TellOf([&](auto& b) { z.Name(x, b); }); }, nullptr, \
+   [](Set& z, Str& x) { return model::Name(z, x); }}
+#define SINGLE_TYPED(Name) \
+  {#Name, [](ZORVadEnumString& z, ZORVadSingleString& x) { return z.Name(x); }, nullptr, \
+   [](Set& z, Str& x) { return model::Name(z, x); }, nullptr}
+
+const SingleOperation kSingleOperations[] = {
+  SINGLE_WORDLESS(Assign), SINGLE_WORDLESS(Intersect), SINGLE_WORDLESS(Unite), SINGLE_ALIKE(IsIntersected),
+  SINGLE_ALIKE(CalcEqualValue), SINGLE_ALIKE(CalcInverseEqualValue),
+  SINGLE_ALIKE(CalcUnequalValue), SINGLE_ALIKE(CalcInverseUnequalValue),
+  SINGLE_RELATION(CalcIsEqual), SINGLE_RELATION(CalcIsLessOrEqual), SINGLE_RELATION(CalcIsLess),
+  SINGLE_NONE(CalcLessValue), SINGLE_NONE(CalcInverseLessValue), SINGLE_NONE(CalcNotLessValue),
+  SINGLE_NONE(CalcNotLessAndUnequalValue), SINGLE_NONE(CalcNextValue), SINGLE_NONE(CalcInverseNextValue),
+  SINGLE_FORWARD(CalcLessOrEqualValue), SINGLE_INVERSE(CalcInverseLessOrEqualValue),
+  SINGLE_INVERSE(CalcInverseNotLessValue), SINGLE_INVERSE(CalcInverseNotLessAndUnequalValue),
+  SINGLE_FORWARD(CalcLowerValue), SINGLE_INVERSE(CalcInverseLowerValue),
+  SINGLE_FORWARD(CalcUpperValue), SINGLE_INVERSE(CalcInverseUpperValue),
+  SINGLE_TYPED(Copy), SINGLE_TYPED(IntersectInverse),
+};
+
+const Set kSets[] = {
+  "Nil", "Any", "Max", "Min", "{ }", "{a}", "{b}", "{a,b}", "{,a}", "{a,Max}", "{,Max}", "{b,Max}",
+  "{z*255}", "{z*255,Max}", "{z*256}", "{a,a}", "Any{a}", "{aa,ab}",  // in triples
+  "{a,b,c}", "{A,b}", "{a*255}", "{c,d}", "Nil{b}", "{,}", "{A}", "{B,a}", "{A,B}", "{A,a}", "{A,a,b,Max}", "{ab ,ac}",
+  "{z*254}", "{z*254,z*255}", "{a*254}", "{a*256}", "{a*253zz}", "{z*256,Max}", "{a,a,b}", "{m,z}", "{ ,!}", "Any{a,b}",
+};
+constexpr std::size_t kTripled = 18;
+const Str kSingles[] = {kNil, {kNilTag, "a"}, kAny, {kAnyTag, "b"}, kMax, kMin, Text(""), Text("a"), Text("A"), Text("b"),
+                        Text("c"), Times(255, 'z'), Times(256, 'z'), Times(254, 'z', "y"), Times(255, 'a')};
+constexpr int kPatterns[][3] = {{0, 1, 2}, {0, 0, 2}, {0, 1, 0}, {0, 1, 1}, {0, 0, 0}};  // who is the same object
+// clang-format on
+
+bool Shares(const HeldSet* held, int count) {
+  std::multiset<const ZORString*> objects;
+  for (int i = 0; i < count; ++i)
+    for (const ZORString* object : held[i].Objects()) objects.insert(object);
+  return std::adjacent_find(objects.begin(), objects.end()) != objects.end();
+}
+
+bool IsCalc(const Operation& operation) { return std::string_view(operation.name).starts_with("Calc"); }
+
+// Two calls in one form; pattern says which operands are one object. An unchanged target keeps its very texts.
+template <class Class, class Form, class Model>
+void Compare(const Operation& operation, const Set* v, const int* pattern, Form form, Model slow) {
+  HeldSet held[] = {HeldSet(v[0]), HeldSet(v[1]), HeldSet(v[2])};
+  Class* operands[3];
+  for (int i = 0; i < 3; ++i) operands[i] = &held[pattern[i]].value;
+  Set expected[] = {v[0], v[1], v[2]};
+  for (int call = 1; call <= 2; ++call) {
+    Set copies[3];
+    for (int i = 0; i < 3; ++i) copies[i] = expected[pattern[i]];
+    const int answer = (operation.*slow)(copies);
+    Set& after = expected[pattern[operation.target]];
+    const bool stays = answer == 0 && after == copies[operation.target] && IsCalc(operation);
+    after = copies[operation.target];
+    const auto objects = held[pattern[operation.target]].Objects();
+    ASSERT_EQ((operation.*form)(operands), answer) << "call " << call;
+    for (int i = 0; i < 3; ++i) ASSERT_EQ(held[i].Now(), expected[i]) << "operand " << i << " after call " << call;
+    ASSERT_TRUE(!stays || objects == held[pattern[operation.target]].Objects()) << "call " << call;
+    ASSERT_FALSE(Shares(held, 3)) << "call " << call;
+  }
+}
+
+void CompareForms(const Operation& operation, const Set* v) {
+  const std::string_view name = operation.name;
+  for (const auto& pattern : kPatterns) {
+    if (operation.operands == 2 && pattern[2] != 2) continue;
+    // To itself a value is assigned without going through a list.
+    if ((name == "Assign" || name == "Copy") && pattern[1] == 0 && v[0].HasEquals()) continue;
+    bool repeats = false;  // what stands at the place of an operand that repeats is not looked at: once is enough
+    for (int i = 1; i < 3; ++i) repeats |= pattern[i] != i && !(v[i] == kSets[0]);
+    if (repeats) continue;
+    Compare<ZORVadEnumString>(operation, v, pattern, &Operation::typed, &Operation::model);
+    if (operation.entry) Compare<ZORVaDoString>(operation, v, pattern, &Operation::entry, &Operation::modelOfEntry);
+    ASSERT_FALSE(testing::Test::HasFatalFailure()) << v[0] << '.' << operation.name << ' ' << v[1] << ' ' << v[2]
+                                                   << ", objects " << pattern[0] << pattern[1] << pattern[2];
+  }
+}
+
+void CompareAll(const Operation& operation) {
+  const bool pair = operation.operands == 2;
+  const std::size_t n = pair ? std::size(kSets) : kTripled;
+  for (std::size_t i = 0; i < (pair ? n * n : n * n * n); ++i) {
+    const Set v[] = {kSets[i % n], kSets[i / n % n], kSets[i / n / n]};
+    CompareForms(operation, v);
+    if (testing::Test::HasFatalFailure()) return;
+  }
+}
+
+TEST(EnumModel, EveryCombination) {
+  for (const Operation& operation : kOperations) ASSERT_NO_FATAL_FAILURE(CompareAll(operation));
+}
+
+template <class Form, class Model>
+void CompareSingle(const SingleOperation& operation, Set z, Str x, Form form, Model slow) {
+  if (operation.*form == nullptr) return;
+  HeldSet set(z);
+  HeldSingle single(x);
+  for (int call = 1; call <= 2; ++call) {
+    const int answer = (operation.*slow)(z, x);
+    ASSERT_EQ((operation.*form)(set.value, single.value), answer) << "call " << call;
+    ASSERT_EQ(set.Now(), z) << "after call " << call;
+    ASSERT_EQ(single.Now(), x) << "after call " << call;
+  }
+}
+
+TEST(EnumModel, SingleOperands) {
+  for (const SingleOperation& operation : kSingleOperations) {
+    for (const Set& z : kSets) {
+      for (const Str& x : kSingles) {
+        CompareSingle(operation, z, x, &SingleOperation::typed, &SingleOperation::model);
+        CompareSingle(operation, z, x, &SingleOperation::entry, &SingleOperation::modelOfEntry);
+        ASSERT_FALSE(HasFatalFailure()) << z << '.' << operation.name << ' ' << x;
+      }
+    }
+  }
+}
+
+// A missing operand, or one of another class, makes Nil of the target of these three and tells the others nothing.
+void CheckWrong(const Operation& operation, const Set& z, const char* wrong, int answer, const HeldSet& held) {
+  const std::string name = operation.name;
+  const bool clears = name == "Assign" || name == "Intersect" || name == "Unite";
+  EXPECT_EQ(answer, name == "IsIntersected" && z.tag == kAnyTag ? 1 : 0) << name << ' ' << z << ' ' << wrong;
+  EXPECT_EQ(held.Now(), clears ? "Nil" : z) << name << ' ' << wrong;
+}
+
+TEST(EnumModel, WrongOperands) {
+  for (const Operation& operation : kOperations) {
+    for (const Set& z : {Set("{a,b}"), Set("Nil"), Set("Any"), Set("Min"), Set("{b,Max}")}) {
+      if (operation.onInteger == nullptr) continue;
+      HeldSet held(z), withInteger(z), other("{b}");
+      HeldSingle single(Text("b"));
+      HeldInteger n(Number(7));
+      CheckWrong(operation, z, "integer", operation.onInteger(withInteger.value, n.value), withInteger);
+      for (int wrong = 1; wrong < operation.operands; ++wrong) {
+        ZORVaDoString* operands[] = {&held.value, &other.value, &other.value};
+        operands[wrong] = nullptr;
+        CheckWrong(operation, z, "missing", operation.entry(operands), held);
+        operands[wrong] = &single.value;
+        if (operation.operands == 3) CheckWrong(operation, z, "single", operation.entry(operands), held);
+        ASSERT_EQ(other.Now(), Set("{b}")) << operation.name;
+        ASSERT_EQ(single.Now(), Text("b")) << operation.name;
+      }
+    }
+  }
+}
+
+// Operations on a text, which may be one that the value lists.
+struct TextOperation {
+  const char* name;
+  int (*call)(ZORVadEnumString& z, const ZORString& text);
+  int (*model)(Set& z, std::string text);
+};
+// clang-format off
+#define ON_TEXT(Name, Class) \
+  {#Name, \
+   [](ZORVadEnumString& z, const ZORString& t) { return AnswerOf([&] { return Class::StaticCast(&z)->Name(t); }); }, \
+   [](Set& z, std::string t) { return model::Name(z, t); }}
+const TextOperation kTextOperations[] = {
+  ON_TEXT(SetExactValue, ZORVaDoString), ON_TEXT(InsertExactValue, ZORVaDoString), ON_TEXT(RemoveExactValue, ZORVaDoString),
+  ON_TEXT(SetLowerBound, ZORVadEnumString), ON_TEXT(SetUpperBound, ZORVadEnumString), ON_TEXT(CutLower, ZORVadEnumString),
+  ON_TEXT(CutUpper, ZORVadEnumString), ON_TEXT(Insert, ZORVadEnumString),
+};
+// clang-format on
+
+void CompareText(const TextOperation& operation, Set z, const std::string& text, int own) {
+  HeldSet held(z);
+  const ZORString given = Packed(text);
+  for (int call = 1; call <= 2; ++call, own = -1) {
+    const int answer = operation.model(z, text);
+    ASSERT_EQ(operation.call(held.value, own < 0 ? given : held.value.GetValue(own)), answer) << "call " << call;
+    ASSERT_EQ(held.Now(), z) << "after call " << call;
+  }
+}
+
+void CompareReaders(const Set& z, const std::string& text) {
+  const HeldSet held(z);
+  const ZORVaDoString& value = held.value;
+  const ZORString given = Packed(text);
+  ASSERT_EQ(Plain(value.GetNextExactValue(given)), model::NextExactValue(z, text));
+  ASSERT_EQ(Plain(value.GetPrevExactValue(given)), model::PrevExactValue(z, text));
+  const int position = held.value.Contains(given), first = model::Contains(z, text);
+  ASSERT_EQ(position > 0 ? 1 : position, first > 0 ? 1 : first);  // of equal texts it may be any
+  ASSERT_TRUE(position <= 0 || z.texts[position - 1] == text);
+  ASSERT_EQ(held.value.Contains(&given), position);
+}
+
+TEST(EnumModel, Texts) {
+  const char* const given[] = {"",  " ",  "!", "A", "a",     "aa",    "ab",    "b",
+                               "c", "bb", "z", "~", "z*254", "z*255", "z*256", "a*255"};
+  for (const Set& z : kSets) {
+    for (const char* notation : given) {
+      const std::string text = Unpacked(notation);
+      CompareReaders(z, text);
+      for (const TextOperation& operation : kTextOperations) CompareText(operation, z, text, -1);
+      ASSERT_FALSE(HasFatalFailure()) << z << ' ' << text;
+    }
+    for (std::size_t own = 0; own < z.texts.size(); ++own) {
+      for (const TextOperation& operation : kTextOperations)
+        CompareText(operation, z, z.texts[own], static_cast<int>(own));
+      ASSERT_FALSE(HasFatalFailure()) << z << ' ' << own;
+    }
+  }
+}
+
+// The states and bounds that a value tells, and the operations that look at nothing else.
+TEST(EnumModel, States) {
+  for (const Set& z : kSets) {
+    const auto check = [&](const char* name, int answer, const Set& after, auto call) {
+      HeldSet held(z);
+      EXPECT_EQ(AnswerOf([&] { return call(held.Abstract()); }), answer) << z << '.' << name;
+      EXPECT_EQ(held.Now(), after) << z << '.' << name;
+    };
+    const bool nil = model::IsNil(z), any = model::IsAny(z), min = model::IsMin(z), max = model::IsMax(z);
+    const int count = static_cast<int>(z.texts.size());
+    check("IsNil", nil, z, ZOR_OPERATION(IsNil));
+    check("IsUndefined", any, z, ZOR_OPERATION(IsUndefined));
+    check("IsEmpty", min, z, ZOR_OPERATION(IsEmpty));
+    check("IsFull", max, z, ZOR_OPERATION(IsFull));
+    check("GetCardinality", nil ? 0 : any ? 256 : count, z, ZOR_OPERATION(GetCardinality));
+    check("CalcMinValue", !min, "Min", ZOR_OPERATION(CalcMinValue));
+    check("CalcEmptyValue", !min, "Min", ZOR_OPERATION(CalcEmptyValue));
+    check("CalcMaxValue", !max, "Max", ZOR_OPERATION(CalcMaxValue));
+    check("CalcFullValue", !max, "Max", ZOR_OPERATION(CalcFullValue));
+    check("SetNilValue", 0, "Nil", ZOR_OPERATION(SetNilValue));
+    check("SetUndefinedValue", 0, "Any", ZOR_OPERATION(SetUndefinedValue));
+    check("Nil", !nil, nil ? z : "Nil", ZOR_OPERATION(Nil));
+    check("Any", !any, any ? z : "Any", ZOR_OPERATION(Any));
+    const HeldSet held(z);
+    const ZORVaDoString& value = held.value;
+    EXPECT_EQ(Plain(value.GetLowerBound()), model::Lower(z)) << z;
+    EXPECT_EQ(Plain(value.GetUpperBound()), model::Upper(z)) << z;
+    EXPECT_TRUE(held.value.CheckNil() == nil && held.value.CheckAny() == any) << z;
+  }
+}
+
+// A bare vector, whose texts are copied.
+TEST(EnumModel, Vectors) {
+  for (const Set& z : kSets) {
+    for (const Set& x : kSets) {
+      ZORISVectorImp_String texts(20, 20u);
+      for (const std::string& text : x.texts) texts.Add(new ZORString(Packed(text)));
+      for (const bool intersects : {false, true}) {
+        HeldSet held(z);
+        Set expected = z;
+        for (int call = 1; call <= 2; ++call) {
+          const int answer =
+              intersects ? model::IntersectTexts(expected, x.texts) : model::AppendTexts(expected, x.texts);
+          ASSERT_EQ(intersects ? held.value.Intersect(texts) : held.value.Append(texts), answer) << z << ' ' << x;
+          ASSERT_EQ(held.Now(), expected) << z << ' ' << x;
+        }
+      }
+      ASSERT_EQ(texts.Count(), x.texts.size());
+      texts.Flush(1);
+    }
+  }
+}
+
+// Bodies that changed places would be seen above: no two operations answer alike throughout.
+bool Differ(const Operation& a, const Operation& b) {
+  for (std::size_t i = 0; i < kTripled * kTripled * kTripled; ++i) {
+    Set left[] = {kSets[i % kTripled], kSets[i / kTripled % kTripled], kSets[i / kTripled / kTripled]};
+    Set right[] = {left[0], left[1], left[2]};
+    if (a.modelOfEntry(left) != b.modelOfEntry(right) || !std::equal(left, left + 3, right)) return true;
+  }
+  return false;
+}
+
+TEST(EnumModel, NoTwoOperationsAreAlike) {
+  for (const Operation& a : kOperations) {
+    for (const Operation& b : kOperations)
+      EXPECT_TRUE(&a == &b || a.entry == nullptr || b.entry == nullptr || Differ(a, b)) << a.name << ' ' << b.name;
+  }
+}
+
+}  // namespace
+}  // namespace zor::test

@@ -1,0 +1,41 @@
+// What is wrong with a model, told where it stands: file:line:column, the line, a caret with the extent.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "runner/source.h"
+
+namespace zornet {
+
+struct Diagnostic {
+  enum Severity { Error, Note };
+
+  Severity severity;
+  Extent extent;
+  std::string message;
+};
+
+// Errors in the order in which they were found, each followed by its notes.
+class Diagnostics {
+ public:
+  static constexpr std::size_t kErrorLimit = 20;
+
+  void Error(Extent extent, std::string message);  // from the limit on nothing is added
+  void Note(Extent extent, std::string message);   // to the last error
+  void Sort();                                     // into the order of their places
+  bool Failed() const { return mErrors != 0; }
+  bool Full() const { return mErrors >= kErrorLimit; }
+  std::size_t Count() const { return mErrors; }
+  const std::vector<Diagnostic>& All() const { return mAll; }
+
+ private:
+  std::vector<Diagnostic> mAll;
+  std::size_t mErrors = 0;
+  bool mDropped = false;  // the last error was beyond the limit
+};
+
+std::string Render(const Source& source, const Diagnostic& diagnostic, bool colour);
+std::string Render(const Source& source, const Diagnostics& diagnostics, bool colour);
+
+}  // namespace zornet

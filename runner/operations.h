@@ -1,0 +1,57 @@
+// Names of what a propagation calls, for its statistics and traces.
+#pragma once
+
+#include <array>
+#include <cstddef>
+#include <string_view>
+
+namespace zornet {
+
+enum class Operation {
+  Equal,
+  InverseEqual,
+  Unequal,
+  NotAbove,
+  NotBelow,
+  IsEqual,
+  IsLess,
+  IsLessOrEqual,
+  Concatenation,
+  Slice,
+  Length,
+  Lower,
+  Upper,
+  Minimum,
+  Maximum,
+  Successor,
+  TextForm,
+  Supports,
+  Choice,
+};
+inline constexpr std::size_t kOperations = static_cast<std::size_t>(Operation::Choice) + 1;
+
+// The operation of the module; in lower case what the runner does by itself.
+constexpr std::string_view NameOf(Operation operation) {
+  constexpr std::array<std::string_view, kOperations> kNames = {"CalcEqualValue",
+                                                                "CalcInverseEqualValue",
+                                                                "CalcUnequalValue",
+                                                                "CalcLessOrEqualValue",
+                                                                "CalcNotLessValue",
+                                                                "CalcIsEqual",
+                                                                "CalcIsLess",
+                                                                "CalcIsLessOrEqual",
+                                                                "CalcConcatenation",
+                                                                "CalcSubString",
+                                                                "CalcLength",
+                                                                "CalcLowerValue",
+                                                                "CalcUpperValue",
+                                                                "CalcMinValue",
+                                                                "CalcMaxValue",
+                                                                "CalcNextValue",
+                                                                "CalcStringRepresentation",
+                                                                "supports",
+                                                                "choice"};
+  return kNames[static_cast<std::size_t>(operation)];
+}
+
+}  // namespace zornet

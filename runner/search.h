@@ -1,0 +1,53 @@
+// Full assignments: every listed variable is given each of its values in turn, the rest is narrowed, and what is left
+// at the end is confirmed constraint by constraint.
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <vector>
+
+#include "runner/propagation.h"
+#include "runner/store.h"
+#include "runner/truth.h"
+
+namespace zornet {
+
+class Search {
+ public:
+  using Solution = std::function<void()>;  // the store holds it
+
+  Search(Store& store, Propagation& propagation) : mStore(store), mPropagation(propagation), mTruth(store.Types()) {}
+
+  // Goes on from a network that was settled. Settled: stopped at the limit or because there are no more.
+  Outcome Run(std::uint64_t limit, const Solution& solution);
+
+  std::uint64_t Found() const { return mFound; }
+  std::uint64_t Open() const { return mOpen; }        // assignments that leave a variable unknown
+  int OpenVariable() const { return mOpenVariable; }  // one such variable
+  bool IsComplete() const { return mComplete; }       // there are no more
+
+ private:
+  struct Frame {
+    int variable;
+    Listing listing;
+    std::size_t next = 0;
+  };
+
+  bool Descend();
+  void Choose(int variable, const Listing& listing, std::size_t index);
+  void Mark();
+  void Retract();
+  void Leaf(const Solution& solution);
+  bool Confirm();
+
+  Store& mStore;
+  Propagation& mPropagation;
+  Truth mTruth;
+  std::vector<Frame> mFrames;
+  std::uint64_t mFound = 0;
+  std::uint64_t mOpen = 0;
+  int mOpenVariable = kNone;
+  bool mComplete = false;
+};
+
+}  // namespace zornet

@@ -1,0 +1,16 @@
+// Guesses what a misspelt word was meant to be.
+#pragma once
+
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace zornet {
+
+// The word closest to the one given; empty when none is close enough to be meant.
+std::string_view Closest(std::string_view word, std::span<const std::string_view> words);
+
+// "; did you mean 'x'?", or nothing.
+std::string Suggestion(std::string_view word, std::span<const std::string_view> words);
+
+}  // namespace zornet

@@ -1,0 +1,29 @@
+// The texts that a model can speak of: at most 255 characters from the space to z, ordered by character code with a
+// prefix before its extensions. The empty text is the least of them and 255 times z the greatest.
+#pragma once
+
+#include <cstddef>
+#include <string_view>
+
+#include "host/ZORText.h"
+
+namespace zornet {
+
+inline constexpr std::size_t kTextLimit = 255;
+
+constexpr bool IsInAlphabet(char c) { return c >= ' ' && c <= 'z'; }
+
+inline ZORString ToZor(std::string_view text) { return {text.data(), text.size()}; }
+inline std::string_view ToView(const ZORString& text) {
+  return {text.CastToCharPtr(), static_cast<std::size_t>(text.GetLengthInChar())};
+}
+
+const ZORString& GreatestText();
+
+// One space is the least value of a single string and the empty text that of an enumerated one. The module knows
+// these values by their state, ahead of their text, so that its answers on them are not always about the text.
+inline bool IsLeastSomewhere(const ZORString& text) {
+  return text.GetLengthInChar() == 0 || (text.GetLengthInChar() == 1 && *text.CastToCharPtr() == ' ');
+}
+
+}  // namespace zornet

@@ -1,0 +1,56 @@
+// Small random networks, and what their solutions are: a second, plain reading of the constraints on std::string, and
+// every assignment tried.
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <random>
+#include <string>
+#include <vector>
+
+namespace naive {
+
+inline constexpr std::size_t kLongest = 255;
+
+// A text, or a number where the variable is one. Truth values are 0 and 1.
+struct Value {
+  std::string text;
+  std::int64_t number = 0;
+
+  auto operator<=>(const Value&) const = default;
+};
+
+enum class Type { Text, TextSet, Integer, Interval, IntegerSet, Boolean };
+inline bool IsText(Type type) { return type == Type::Text || type == Type::TextSet; }
+
+struct Variable {
+  Type type = Type::Text;
+  std::vector<Value> domain;  // empty: anything
+};
+
+struct Constraint {
+  std::string name;
+  std::vector<int> arguments;
+};
+
+struct Network {
+  std::vector<Variable> variables;
+  std::vector<Constraint> constraints;
+
+  std::string Write() const;  // as a model; variable 3 is called v3
+};
+
+using Assignment = std::vector<Value>;
+
+bool Holds(const Network& network, const Constraint& constraint, const Assignment& values);
+
+// Calls found for each assignment that satisfies every constraint. Where anything is possible, the texts of universe
+// (or numbers around zero) are tried, and whatever a constraint computes for the variable.
+void Solve(const Network& network, const std::vector<std::string>& universe,
+           const std::function<void(const Assignment&)>& found);
+
+// A network over the texts of a small universe.
+Network Random(std::mt19937& random, std::vector<std::string>& universe);
+
+}  // namespace naive

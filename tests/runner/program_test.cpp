@@ -1,0 +1,173 @@
+// The built program: the examples and what they print, exit codes, and each way of asking.
+#include <gtest/gtest.h>
+#include <sys/wait.h>
+
+#include <array>
+#include <cstdio>
+#include <filesystem>
+#include <fstream>
+#include <nlohmann/json.hpp>
+#include <sstream>
+
+namespace {
+
+namespace fs = std::filesystem;
+
+const fs::path kExamples = ZORNET_EXAMPLES;
+const std::string kProgram = ZORNET_PROGRAM;
+
+struct Ran {
+  int code;
+  std::string out;
+};
+
+// By way of the shell; standard error comes along only where the arguments say so.
+Ran Zornet(const std::string& arguments) {
+  FILE* pipe = popen(("'" + kProgram + "' " + arguments).c_str(), "r");
+  Ran ran{-1, ""};
+  std::array<char, 4096> buffer;
+  while (const std::size_t read = std::fread(buffer.data(), 1, buffer.size(), pipe))
+    ran.out.append(buffer.data(), read);
+  ran.code = WEXITSTATUS(pclose(pipe));
+  return ran;
+}
+
+std::string Quoted(const fs::path& path) {
+  std::string quoted = path.string();
+  quoted.insert(quoted.begin(), '\'');
+  return quoted += '\'';
+}
+std::string Example(const std::string& name) { return Quoted(kExamples / (name + ".szn")); }
+Ran RunModel(const std::string& model, const std::string& arguments) {
+  return Zornet(arguments + " - <<'END'\n" + model + "\nEND\n");
+}
+
+std::string Read(const fs::path& file) {
+  std::ifstream in(file);
+  std::ostringstream text;
+  text << in.rdbuf();
+  return text.str();
+}
+
+TEST(Program, PrintsWhatTheExamplesExpect) {
+  int models = 0;
+  for (const auto& entry : fs::directory_iterator(kExamples)) {
+    if (entry.path().extension() != ".szn") continue;
+    ++models;
+    const fs::path expected = fs::path(entry.path()).replace_extension(".expected");
+    EXPECT_EQ(Zornet("-q " + Quoted(entry.path()) + " 2>&1").out, Read(expected)) << entry.path();
+    const fs::path solutions = fs::path(entry.path()).replace_extension(".solutions");
+    if (!fs::exists(solutions)) continue;
+    EXPECT_EQ(Zornet("-q --solutions 100 " + Quoted(entry.path()) + " 2>&1").out, Read(solutions)) << entry.path();
+  }
+  EXPECT_GE(models, 16);
+}
+
+TEST(Program, ExitCodes) {
+  EXPECT_EQ(Zornet(Example("hello") + " 2>&1").code, 0);
+  EXPECT_EQ(Zornet(Example("clash") + " 2>&1").code, 1);
+  EXPECT_EQ(RunModel("var {\"a\", \"b\"}: x; var {\"a\", \"b\"}: y; var {\"a\", \"b\"}: z;"
+                     "constraint str_ne(x, y); constraint str_ne(y, z); constraint str_ne(x, z);",
+                     "--solutions 1 2>&1")
+                .code,
+            1);
+  EXPECT_EQ(Zornet("2>&1").code, 2);
+  EXPECT_EQ(Zornet("--no-such-option x 2>&1").code, 2);
+  EXPECT_EQ(Zornet("/no/such/file 2>&1").code, 2);
+  EXPECT_EQ(Zornet(Quoted(kExamples) + " 2>&1").code, 2);
+  EXPECT_EQ(Zornet("--explain nobody " + Example("hello") + " 2>&1").code, 2);
+  EXPECT_EQ(Zornet("--dot /no/such/folder/x " + Example("hello") + " 2>&1").code, 2);
+  EXPECT_EQ(RunModel("var x;", "2>&1").code, 3);
+  EXPECT_EQ(Zornet("--step-limit 1 " + Example("hello") + " 2>&1").code, 5);
+  EXPECT_EQ(Zornet("--help 2>&1").code, 0);
+  EXPECT_EQ(Zornet("--version").code, 0);
+}
+
+// A copy of the program in a folder of its own finds no module, unless it is told where to look.
+TEST(Program, ModuleNotFound) {
+  const fs::path folder = fs::path(testing::TempDir()) / "zornet-alone" / "bin";
+  fs::create_directories(folder);
+  fs::copy_file(kProgram, folder / "zornet", fs::copy_options::overwrite_existing);
+  const fs::path home = fs::path(kProgram).parent_path();
+  const std::string start = "-h >/dev/null; LD_LIBRARY_PATH=" + Quoted(home) + " " + Quoted(folder / "zornet") + " ";
+  const Ran alone = Zornet(start + Example("hello") + " 2>&1");
+  EXPECT_EQ(alone.code, 4);
+  EXPECT_NE(alone.out.find("libZORVadStrings.so: not found"), std::string::npos) << alone.out;
+  EXPECT_EQ(
+      Zornet(start + "--module-path /nowhere --module-path " + Quoted(home) + " " + Example("hello") + " 2>&1").code,
+      0);
+  fs::remove_all(folder.parent_path());
+}
+
+TEST(Program, Trace) {
+  const Ran ran = RunModel("var {\"a\", \"b\"}: x;\nconstraint  str_ne( x,\n  \"b\" ); % not b", "-q --trace");
+  EXPECT_EQ(ran.out, "<stdin>:2: str_ne( x, \"b\" )  x: { \"a\", \"b\" } -> \"a\" (CalcUnequalValue)\nx = \"a\"\n");
+}
+
+TEST(Program, ExplainTellsTheChainAndNothingElse) {
+  const Ran ran = RunModel(
+      "var string: a = \"x\"; var string: b; var string: c;\nvar string: far = \"y\"; var string: other;\n"
+      "constraint str_upper(a, b);\nconstraint str_upper(far, other);\nconstraint str_concat(b, \"!\", c);\noutput c;",
+      "-q --explain c");
+  EXPECT_EQ(ran.out,
+            "c = \"X!\"\nc is \"X!\", since\n  <stdin>:1: a was declared as \"x\"\n"
+            "  <stdin>:3: str_upper(a, b)  b: Any -> \"X\" (CalcUpperValue)\n"
+            "  <stdin>:5: str_concat(b, \"!\", c)  c: Any -> \"X!\" (CalcConcatenation)\n");
+}
+
+TEST(Program, RawCallsAnswerAsTheModuleDoes) {
+  const Ran ran = RunModel("var string: x; var string: z = \"k\";\nconstraint str_concat(x, \"b\", z);", "-q --raw");
+  EXPECT_EQ(ran.out,
+            "<stdin>:2: z.CalcConcatenation(x, \"b\") = 1  z: \"k\" -> Any\n"
+            "<stdin>:2: z.CalcFirstInverseConcatenation(x, \"b\") = 0\n"
+            "<stdin>:2: z.CalcSecondInverseConcatenation(x, \"b\") = 1  \"b\": \"b\" -> Any\n"
+            "x = Any\nz = Any\n");
+}
+
+TEST(Program, Summary) {
+  EXPECT_NE(Zornet(Example("clash") + " 2>&1 >/dev/null").out.find("contradiction at "), std::string::npos);
+  EXPECT_NE(Zornet(Example("clash") + " 2>&1 >/dev/null")
+                .out.find(":10: str_eq(found, archive) leaves nothing for found; 3 constraints"),
+            std::string::npos);
+  EXPECT_TRUE(Zornet(Example("hello") + " 2>&1 >/dev/null").out.starts_with("settled; 5 constraints, "));
+  EXPECT_NE(RunModel("var string: x; var {\"a\", \"b\"}: y;", "--solutions 9 2>&1")
+                .out.find("2 assignments left out: x stays unknown in them"),
+            std::string::npos);
+}
+
+TEST(Program, JsonStream) {
+  std::istringstream lines(Zornet("--json-stream --stats --explain machine " + Example("hello")).out);
+  std::map<std::string, int> events;
+  nlohmann::json last;
+  for (std::string line; std::getline(lines, line);) {
+    last = nlohmann::json::parse(line);
+    ++events[last["event"]];
+    if (last["event"] != "variable" || last["name"] != "machine") continue;
+    EXPECT_EQ(last["texts"], nlohmann::json::array({"north-7"}));
+  }
+  EXPECT_EQ(events["variable"], 7);
+  EXPECT_EQ(events["narrowing"], 5);
+  EXPECT_EQ(events["explanation"], 1);
+  EXPECT_EQ(events["operation"], 5);
+  EXPECT_EQ(last["event"], "summary");
+  EXPECT_EQ(last["outcome"], "settled");
+  const auto error = nlohmann::json::parse(RunModel("var x;", "--json-stream").out);
+  EXPECT_EQ(error["event"], "error");
+  EXPECT_EQ(error["column"], 5);
+}
+
+TEST(Program, Colours) {
+  const std::string hello = Example("hello");
+  EXPECT_EQ(Zornet("-q " + hello).out.find('\x1b'), std::string::npos);
+  EXPECT_NE(Zornet("-q --color=always " + hello).out.find('\x1b'), std::string::npos);
+  EXPECT_EQ(Zornet("-q --color=never " + hello).out.find('\x1b'), std::string::npos);
+}
+
+TEST(Program, Graph) {
+  const std::string graph = Zornet("-q --dot /dev/stdout " + Example("clash")).out;
+  EXPECT_NE(graph.find("<b>found</b><br/>Nil"), std::string::npos);
+  EXPECT_NE(graph.find("color=\"#b3261e\", penwidth=2, label=<<b>found</b>"), std::string::npos);
+  EXPECT_NE(graph.find("fontcolor=\"#b3261e\", penwidth=2, label=\"str_eq\""), std::string::npos);
+}
+
+}  // namespace

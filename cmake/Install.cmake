@@ -1,0 +1,69 @@
+# What `cmake --install` lays down and CPack packs. The tree can be moved: libraries find each other by their place.
+set(CMAKE_INSTALL_LIBDIR lib)  # zornet looks for modules in lib/zorvadstrings beside its own folder
+set(CMAKE_INSTALL_DOCDIR share/doc/zorvadstrings)
+include(GNUInstallDirs)
+include(CMakePackageConfigHelpers)
+set(module_dir ${CMAKE_INSTALL_LIBDIR}/zorvadstrings)
+set(header_dir ${CMAKE_INSTALL_INCLUDEDIR}/zorvadstrings)
+set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/ZORVadStrings)
+
+# Before 1.0 every minor version may break the binary interface. The module is opened by its name alone.
+set_target_properties(ZORHost PROPERTIES
+  VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR})
+set_target_properties(ZORVadStrings PROPERTIES INSTALL_RPATH "\$ORIGIN/..")
+set_target_properties(zornet PROPERTIES INSTALL_RPATH "\$ORIGIN/../${CMAKE_INSTALL_LIBDIR}")
+target_compile_features(ZORHost PUBLIC cxx_std_20)
+
+target_sources(ZORHost PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES
+  host/ZORExport.h
+  host/ZORNumbers.h
+  host/ZORSolver.h
+  host/ZORText.h)
+target_sources(ZORVadStrings PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES
+  enum/ZORVadEnumString.h
+  module/InitModule.h
+  module/ZORStringClass.h
+  module/ZORVaDoString.h
+  module/fold.h
+  module/limits.h
+  single/ZORVadSingleString.h
+  vector/ZORISVectorImp_String.h)
+
+install(TARGETS ZORHost EXPORT ZORVadStrings
+  LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR}
+  FILE_SET HEADERS DESTINATION ${header_dir}
+  INCLUDES DESTINATION ${header_dir})
+install(TARGETS ZORVadStrings EXPORT ZORVadStrings
+  LIBRARY DESTINATION ${module_dir}
+  FILE_SET HEADERS DESTINATION ${header_dir})
+install(TARGETS zornet)
+install(FILES runner/zornet.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 OPTIONAL)
+install(FILES README.md DESTINATION ${CMAKE_INSTALL_DOCDIR})
+install(DIRECTORY examples DESTINATION ${CMAKE_INSTALL_DOCDIR} FILES_MATCHING PATTERN *.szn)
+
+install(EXPORT ZORVadStrings NAMESPACE ZORVadStrings:: FILE ZORVadStringsConfig.cmake DESTINATION ${package_dir})
+write_basic_package_version_file(${PROJECT_BINARY_DIR}/ZORVadStringsConfigVersion.cmake
+  COMPATIBILITY SameMinorVersion)
+configure_file(cmake/zorvadstrings.pc.in zorvadstrings.pc @ONLY)
+install(FILES ${PROJECT_BINARY_DIR}/ZORVadStringsConfigVersion.cmake DESTINATION ${package_dir})
+install(FILES ${PROJECT_BINARY_DIR}/zorvadstrings.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
+
+# gdb runs LIBRARY-gdb.py from beside a library whose folder the user trusts. In /usr it trusts a folder of its own.
+set(printers libZORHost.so.${PROJECT_VERSION}-gdb.py)
+install(CODE "
+  set(folder ${CMAKE_INSTALL_LIBDIR})
+  if(CMAKE_INSTALL_PREFIX MATCHES \"/usr/?$\")
+    set(folder share/gdb/auto-load/usr/${CMAKE_INSTALL_LIBDIR})
+  endif()
+  file(INSTALL \"${PROJECT_SOURCE_DIR}/gdb/zorvadstrings.py\"
+       DESTINATION \"\${CMAKE_INSTALL_PREFIX}/\${folder}\" RENAME ${printers})")
+
+set(CPACK_GENERATOR DEB TGZ)
+set(CPACK_PACKAGE_NAME zorvadstrings)
+set(CPACK_PACKAGE_CONTACT "The ZORVadStrings developers <zorvadstrings@localhost>")
+set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "String types for a subdefinite constraint solver, and a runner for its networks")
+set(CPACK_STRIP_FILES ON)
+set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
+set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
+set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS ON)
+include(CPack)

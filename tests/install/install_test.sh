@@ -1,0 +1,74 @@
+#!/usr/bin/env bash
+# The installed tree as its users meet it: install_test.sh BUILD_FOLDER PART. The flags of the build are in CXXFLAGS.
+# The part named tree comes first, and find_package before opening and gdb.
+set -euo pipefail
+build=$1
+here=$(cd "$(dirname "$0")" && pwd)
+scratch=$build/install-test
+tree=$scratch/tree
+module=$tree/lib/zorvadstrings/libZORVadStrings.so
+
+fail() { echo "$*" >&2; exit 1; }
+fresh() { rm -rf "$1" && mkdir -p "$1"; }
+narrow() { (cd / && "$1/bin/zornet" "$1/share/doc/zorvadstrings/examples/hello.szn"); }
+try_linked() { [[ $("$1") == *'"abcabove thirty-one characters"'* ]] || fail "$1: no concatenation"; }
+
+# Moved after it was installed, so that whatever holds on to its first place is missed.
+tree() {
+  fresh "$scratch/first" && rm -rf "$tree"
+  cmake --install "$build" --prefix "$scratch/first" >"$scratch/install.log"
+  mv "$scratch/first" "$tree"
+  # shellcheck disable=SC2016  # the loader expands it
+  ! readelf -d "$tree"/bin/zornet "$tree"/lib/*.so "$module" | grep -E 'R(UN)?PATH' | grep -v '\[\$ORIGIN/\.\.[a-z/]*\]' ||
+    fail "run paths that lead out of the tree"
+}
+
+# Each public header is enough in itself.
+headers() {
+  local header
+  cd "$tree/include/zorvadstrings"
+  for header in */*.h; do
+    # shellcheck disable=SC2086  # flags are words
+    echo "#include \"$header\"" | "$CXX" -std=c++20 $CXXFLAGS -I. -fsyntax-only -x c++ - || fail "$header"
+  done
+}
+
+find_package() {
+  fresh "$scratch/consumer"
+  cmake -S "$here/consumer" -B "$scratch/consumer" -DCMAKE_PREFIX_PATH="$tree" -DCMAKE_BUILD_TYPE=Debug
+  cmake --build "$scratch/consumer"
+  try_linked "$scratch/consumer/linked"
+}
+
+pkg_config() {
+  local flags
+  flags=$(PKG_CONFIG_PATH=$tree/lib/pkgconfig pkg-config --cflags --libs zorvadstrings)
+  # shellcheck disable=SC2086  # flags are words
+  "$CXX" -std=c++20 $CXXFLAGS "$here/consumer/linked.cpp" $flags -o "$scratch/linked"
+  try_linked "$scratch/linked"
+}
+
+opening() { "$scratch/consumer/opening" "$module"; }
+
+runner() { narrow "$tree"; }
+
+# The printers are found beside the library and show what the program prints.
+gdb() {
+  command gdb -nx -batch -iex "add-auto-load-safe-path $tree" -x "$here/consumer/values.gdb" \
+    "$scratch/consumer/linked" >"$scratch/gdb.log" 2>&1 || { cat "$scratch/gdb.log" >&2; exit 1; }
+  diff <("$scratch/consumer/linked") <(sed -n 's/^(const ZOR[A-Za-z]* &) //p' "$scratch/gdb.log")
+}
+
+packages() {
+  fresh "$scratch/packages"
+  cpack --config "$build/CPackConfig.cmake" -B "$scratch/packages" >"$scratch/cpack.log"
+  cd "$scratch/packages"
+  dpkg-deb -x ./*.deb deb
+  narrow "$PWD/deb/usr"
+  ls deb/usr/share/gdb/auto-load/usr/lib/libZORHost.so.*-gdb.py
+  [[ $(dpkg-deb -f ./*.deb Depends) == *libstdc++6* ]] || fail "the .deb does not tell what it needs"
+  mkdir archive && tar -C archive --strip-components=1 -xf ./*.tar.gz
+  narrow "$PWD/archive"
+}
+
+"$2"

@@ -90,6 +90,7 @@ class JsonReport : public Report {
     Json values = Json::object();
     for (const int variable : mModel.outputs) values[mNames.OfVariable(variable)] = store[variable].Show();
     Tell({{"event", "solution"}, {"number", number}, {"values", std::move(values)}});
+    mResults.flush();
   }
 
   void Explain(const Store& store, int variable, const Log::Explanation& explanation) override {

@@ -77,10 +77,9 @@ Token Lexer::NextNumber() {
 
 // A text ends at its closing quote; one that lacks it ends with its line, so that the next line is read in peace.
 Token Lexer::NextText() {
-  const std::size_t limit = std::min(mText.find('\n', mNext), mText.size());
-  const std::size_t close = mText.find('"', mNext + 1);
-  if (close >= limit) {
-    const std::size_t length = mText.substr(mNext, limit - mNext).find_last_not_of("\r \t") + 1;
+  const std::size_t close = std::min(mText.find_first_of("\"\n", mNext + 1), mText.size());
+  if (close == mText.size() || mText[close] == '\n') {
+    const std::size_t length = mText.substr(mNext, close - mNext).find_last_not_of("\r \t") + 1;
     mDiagnostics.Error({mNext, length}, "the text has no closing quote on its line");
     return Make(Token::Broken, length);
   }

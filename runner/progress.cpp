@@ -17,7 +17,7 @@ void ProgressLine::Show(std::uint64_t steps, std::size_t waiting) {
 }
 
 ProgressLine::~ProgressLine() {
-  if (mShown) fmt::print(stderr, "\r\x1b[K");
+  if (mShown) std::fputs("\r\x1b[K", stderr);
 }
 
 }  // namespace zornet

@@ -20,6 +20,17 @@ Meaning Opposite(Meaning meaning) {
   }
 }
 
+Operation RelationOf(Meaning meaning) {
+  switch (meaning) {
+    case Meaning::Equal:
+      return Operation::IsEqual;
+    case Meaning::NotAbove:
+      return Operation::IsLessOrEqual;
+    default:
+      return Operation::IsLess;
+  }
+}
+
 bool IsOrder(Meaning meaning) { return meaning == Meaning::NotAbove || meaning == Meaning::Below; }
 
 }  // namespace
@@ -55,6 +66,7 @@ Progress Relations::Post(Meaning meaning, int x, int y) {
 }
 
 Progress Relations::Reflexive(Meaning meaning, int x) {
+  mStore.StartOperation(meaning == Meaning::Unequal ? Operation::Unequal : Operation::NotAbove);
   if (!Truth::Relates(meaning, ZORString(), ZORString())) mStore.Fail(x);
   return Progress::Done;
 }
@@ -164,6 +176,7 @@ Value& Relations::Bound(const ZORString& text) {
 Progress Relations::Decide(Meaning meaning, int x, int y, int truth) {
   mTruth.Reset();
   if (x == y) {
+    mStore.StartOperation(RelationOf(meaning));
     mTruth.SetNumber(Truth::Relates(meaning, ZORString(), ZORString()) ? 1 : 0);
   } else if (!mStore[x].IsKnown() || !mStore[y].IsKnown() || !Ask(meaning, x, y, mTruth)) {
     return Progress::Waits;
@@ -172,36 +185,40 @@ Progress Relations::Decide(Meaning meaning, int x, int y, int truth) {
   return Progress::Done;
 }
 
-// False while the relation is open.
+// False while the relation is open. Where the least texts are concerned, it is asked of the texts and not the module.
 bool Relations::Ask(Meaning meaning, int x, int y, Value& answer) {
-  const bool exchanged = mStore[x].Sort() == Sort::Text;  // a single value does not know what a set lists
   const Value& left = OperandFor(x, mSingle);
   const Value& right = OperandFor(y, mOther);
-  const bool least = TouchesLeast(left) || TouchesLeast(right);
-  if (meaning == Meaning::Equal) {
-    mStore.StartOperation(Operation::IsEqual);
-    const Value& asked = exchanged ? right : left;
-    const Value& other = exchanged ? left : right;
-    if (!least) {
-      asked.Text().CalcIsEqual(other.Any(), answer.Boolean());
-    } else if (asked.Any().IsIntersected(other.Any()) == 0) {
-      answer.SetNumber(0);
-    } else if (asked.IsOne() && other.IsOne()) {
-      answer.SetNumber(1);
-    }
-    return answer.IsOne();
+  mStore.StartOperation(RelationOf(meaning));
+  if (meaning != Meaning::Equal) {
+    AskOrder(meaning, left, right, answer);
+  } else if (left.Sort() == Sort::Text) {  // a single value does not know what a set lists
+    AskEqual(right, left, answer);
+  } else {
+    AskEqual(left, right, answer);
   }
-  const bool strict = meaning == Meaning::Below;
-  mStore.StartOperation(strict ? Operation::IsLess : Operation::IsLessOrEqual);
-  if (!least) {
-    strict ? left.Text().CalcIsLess(right.Text(), answer.Boolean())
-           : left.Text().CalcIsLessOrEqual(right.Any(), answer.Boolean());
+  return answer.IsOne();
+}
+
+void Relations::AskEqual(const Value& left, const Value& right, Value& answer) {
+  if (!TouchesLeast(left) && !TouchesLeast(right)) {
+    left.Text().CalcIsEqual(right.Any(), answer.Boolean());
+  } else if (left.Any().IsIntersected(right.Any()) == 0) {
+    answer.SetNumber(0);
+  } else if (left.IsOne() && right.IsOne()) {
+    answer.SetNumber(1);
+  }
+}
+
+void Relations::AskOrder(Meaning meaning, const Value& left, const Value& right, Value& answer) {
+  if (!TouchesLeast(left) && !TouchesLeast(right)) {
+    meaning == Meaning::Below ? left.Text().CalcIsLess(right.Text(), answer.Boolean())
+                              : left.Text().CalcIsLessOrEqual(right.Any(), answer.Boolean());
   } else if (Truth::Relates(meaning, left.HighestText(), right.LowestText())) {
     answer.SetNumber(1);
   } else if (!Truth::Relates(meaning, left.LowestText(), right.HighestText())) {
     answer.SetNumber(0);
   }
-  return answer.IsOne();
 }
 
 // The variable's value, or its text as an Exact value where it is the greatest: the module judges Max by its state.

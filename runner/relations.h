@@ -35,6 +35,8 @@ class Relations {
   void RaiseTo(const ZORString& bound, const ZORString& lowest, Value& outcome);
   void RemoveFrom(Value& outcome, const ZORString& text);
   bool Ask(Meaning meaning, int x, int y, Value& answer);
+  void AskEqual(const Value& left, const Value& right, Value& answer);
+  void AskOrder(Meaning meaning, const Value& left, const Value& right, Value& answer);
   const Value& OperandFor(int variable, Value& plain);
   Value& Bound(const ZORString& text);
 

@@ -31,8 +31,10 @@ struct UsageError : std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
-Source Load(const std::string& file) {
+// A model may be named without its ending.
+Source Load(std::string file) {
   if (file == "-") return {"<stdin>", {std::istreambuf_iterator<char>(std::cin), {}}};
+  if (!std::filesystem::exists(file) && std::filesystem::exists(file + ".szn")) file += ".szn";
   if (std::filesystem::is_directory(file)) throw UsageError(file + ": is a folder");
   std::ifstream in(file, std::ios::binary);
   std::string text{std::istreambuf_iterator<char>(in), {}};

@@ -261,6 +261,7 @@ void Supports::MeetFound(Column& column) {
   Value& outcome = mStore.Fresh(sort);
   if (sort == Sort::TextSet) {
     std::vector<ZORString> texts;
+    texts.reserve(found.size());
     for (Answer& answer : found) texts.push_back(std::move(answer.text));
     outcome.SetTexts(texts);
   } else if (sort == Sort::Text) {

@@ -44,7 +44,7 @@ class TextReport : public Report {
 
   void Solution(const Store& store, std::uint64_t) override {
     Variables(store);
-    mResults << "----------\n";
+    mResults << "----------\n" << std::flush;
   }
 
   void Explain(const Store& store, int variable, const Log::Explanation& explanation) override;

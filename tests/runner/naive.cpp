@@ -199,7 +199,8 @@ std::string Network::Write() const {
         type = "bool";
         break;
       case Type::Interval:
-        type = std::to_string(variable.domain.front().number) + ".." + std::to_string(variable.domain.back().number);
+        type = std::to_string(variable.domain.front().number);
+        type += ".." + std::to_string(variable.domain.back().number);
         break;
     }
     const bool single = variable.type == Type::Text || variable.type == Type::Integer || variable.type == Type::Boolean;

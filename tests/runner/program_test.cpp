@@ -65,6 +65,7 @@ TEST(Program, PrintsWhatTheExamplesExpect) {
 
 TEST(Program, ExitCodes) {
   EXPECT_EQ(Zornet(Example("hello") + " 2>&1").code, 0);
+  EXPECT_EQ(Zornet(Quoted(kExamples / "hello") + " 2>&1").code, 0);
   EXPECT_EQ(Zornet(Example("clash") + " 2>&1").code, 1);
   EXPECT_EQ(RunModel("var {\"a\", \"b\"}: x; var {\"a\", \"b\"}: y; var {\"a\", \"b\"}: z;"
                      "constraint str_ne(x, y); constraint str_ne(y, z); constraint str_ne(x, z);",

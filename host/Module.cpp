@@ -117,7 +117,7 @@ ZORVaDoModule* ZORVaDoModuleManager::OpenModule(const ZORString& name) {
   const std::string file = "lib" + TextOf(name) + ".so";
   if (name == "" || file.find('/') != std::string::npos) return Fail(file, "not the name of a module");
   for (const std::string& folder : mSearchPath) {
-    const std::string path = folder + "/" + file;
+    const std::string path = std::string(folder).append("/").append(file);
     if (access(path.c_str(), F_OK) == 0) return Load(name, path);
   }
   return Fail(file, "not found in the search path");

@@ -167,8 +167,6 @@ ZORistrstream::ZORistrstream(const char* text, int size)
     : mNext(text != nullptr ? text : ""),
       mEnd(mNext + (text != nullptr && size > 0 ? static_cast<std::size_t>(size) : std::strlen(mNext))) {}
 
-ZORistrstream::~ZORistrstream() = default;
-
 ZORistrstream& ZORistrstream::operator>>(char& c) {
   c = mNext != mEnd ? *mNext++ : '\0';
   return *this;

@@ -134,7 +134,7 @@ char* ZORString::Reserve(std::size_t length) {
   std::memcpy(block, CastToCharPtr(), mLength + std::size_t{1});
   Release();
   mOutside = block;
-  mCapacity = static_cast<std::uint32_t>(size);  // NOLINT(clang-analyzer-unix.Malloc): held by the union
+  mCapacity = static_cast<std::uint32_t>(size);  // NOLINT(clang-analyzer-cplusplus.NewDeleteLeaks): held by the union
   return block;
 }
 

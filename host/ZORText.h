@@ -238,7 +238,6 @@ class ZOR_EXPORT ZORistrstream {
   static constexpr int kNoCharacter = -1;
 
   ZORistrstream(const char* text, int size);  // size characters, or up to the zero when size is 0
-  ~ZORistrstream();
 
   ZORistrstream& operator>>(ZORistrstream& (*manipulator)(ZORistrstream&)) { return manipulator(*this); }
   ZORistrstream& operator>>(char& c);  // the zero character at the end

@@ -108,7 +108,7 @@ inline void ZORString::Take(ZORString& other) noexcept {
 }
 
 inline void ZORString::Release() noexcept {
-  if (IsOwner()) ::operator delete(mOutside);
+  if (IsOwner()) ::operator delete(mOutside);  // NOLINT(clang-analyzer-cplusplus.NewDelete): no other text holds it
 }
 
 // Texts inside their objects compare with their padding, in one step whose cost does not hang on their lengths.

@@ -133,7 +133,7 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
 
   const ZORString& First() const { return *mVector[0]; }
   const ZORString& Last() const { return *mVector[mVector.Count() - 1]; }
-  unsigned int CountBelow(const ZORString& text) const;
+  static unsigned int CountBelow(const ZORISVectorImp_String& texts, const ZORString& text);
   unsigned int CountUpTo(const ZORString& text) const;
   void Reserve(unsigned int places);
   void Store(ZORString* text, unsigned int position);

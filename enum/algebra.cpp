@@ -8,11 +8,9 @@ namespace {
 constexpr unsigned int kAhead = 8;    // places between a text that is compared and one on its way into the cache
 constexpr unsigned int kSearch = 16;  // so many times larger a set is searched, not walked
 
-// The first place whose text is not below the one sought.
-unsigned int FindPlace(const ZORISVectorImp_String& texts, const ZORString& sought) {
-  ZORString* const* const places = &texts[0];
-  const auto below = [](const ZORString* text, const ZORString& bound) { return *text < bound; };
-  return static_cast<unsigned int>(std::lower_bound(places, places + texts.Count(), sought, below) - places);
+// Asks for the text that stands kAhead places behind position i.
+void FetchAhead(ZORString* const* places, unsigned int i, unsigned int count) {
+  if (i + kAhead < count) __builtin_prefetch(places[i + kAhead]);
 }
 
 }  // namespace
@@ -43,13 +41,10 @@ int ZORVadEnumString::Keep(const ZORISVectorImp_String& texts) {
   const bool searches = others / kSearch > count;
   unsigned int kept = 0;
   for (unsigned int i = 0, j = 0; i < count; ++i) {
-    if (i + kAhead < count) __builtin_prefetch(places[i + kAhead]);
-    if (searches) j = std::max(j, FindPlace(texts, *places[i]));
+    FetchAhead(places, i, count);
+    if (searches) j = std::max(j, CountBelow(texts, *places[i]));
     std::strong_ordering order = std::strong_ordering::less;
-    while (j < others && (order = *places[i] <=> *texts[j]) > 0) {
-      ++j;
-      if (j + kAhead < others) __builtin_prefetch(texts[j + kAhead]);
-    }
+    while (j < others && (order = *places[i] <=> *texts[j]) > 0) FetchAhead(&texts[0], ++j, others);
     if (j < others && order == 0) {
       places[kept++] = places[i];
       ++j;
@@ -60,6 +55,34 @@ int ZORVadEnumString::Keep(const ZORISVectorImp_String& texts) {
   if (kept == count) return 0;
   mVector.SetTop(kept, count);
   return kept > 0 ? 1 : Nil();
+}
+
+// What Insert of each text would do, for texts in order, in one merge: our places move to the end of an array with
+// room for all, and both runs are read from there into its front, which never overtakes them.
+int ZORVadEnumString::Merge(const ZORISVectorImp_String& texts) {
+  const unsigned int own = mVector.Count(), more = texts.Count();
+  const bool known = !IsUndefined() && !IsNil();
+  Reserve(own + more);
+  ZORString** const places = &mVector[0];
+  ZORString** next = places + more;
+  ZORString** const end = next + own;
+  std::copy_backward(places, places + own, end);
+
+  ZORString** out = places;
+  const ZORString* added = nullptr;
+  for (unsigned int i = 0; i < more; ++i) {
+    FetchAhead(&texts[0], i, more);
+    const ZORString& text = *texts[i];
+    std::strong_ordering order = std::strong_ordering::greater;
+    while (next != end && ((order = **next <=> text) < 0 || (order == 0 && !known))) *out++ = *next++;
+    const bool listed = (next != end && order == 0) || (added != nullptr && *added == text);
+    if (listed && known) continue;
+    added = *out++ = new ZORString(text);
+  }
+  while (next != end) *out++ = *next++;
+  const auto count = static_cast<unsigned int>(out - places);
+  mVector.SetTop(count, own + more);
+  return count == own + more ? 1 : 0;
 }
 
 // The end of the operations that build candidates: candidates are used up.

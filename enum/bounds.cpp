@@ -53,7 +53,7 @@ void ZORVadEnumString::SetLowerBound(const ZORString& text) {
 void ZORVadEnumString::SetUpperBound(const ZORString& text) {
   auto* const bound = new ZORString(text);
   mState = *bound < ZorVaDoStringMax ? ZorStringExact : ZorStringMax;
-  const unsigned int kept = CountBelow(*bound);
+  const unsigned int kept = CountBelow(mVector, *bound);
   Remove(kept, mVector.Count() - kept);
   Store(bound, kept);
 }

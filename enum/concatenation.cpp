@@ -1,6 +1,5 @@
 // Concatenation of sets of texts, and the operations that tell a set nothing.
 #include <string_view>
-#include <utility>
 
 #include "enum/dispatch.h"
 #include "enum/insertion.h"
@@ -13,7 +12,7 @@ void ZORVadEnumString::MarkPairs(const Enum& heads, const Enum& tails, Marks& ma
   for (unsigned int h = 0; h < heads.mVector.Count(); ++h) {
     const std::string_view head = zor::View(*heads.mVector[h]);
     unsigned int t = 0;
-    for (unsigned int i = CountBelow(*heads.mVector[h]); i < count; ++i) {
+    for (unsigned int i = CountBelow(mVector, *heads.mVector[h]); i < count; ++i) {
       const std::string_view text = zor::View(*mVector[i]);
       if (text.substr(0, head.size()) != head) break;
       const std::string_view rest = text.substr(head.size());
@@ -37,8 +36,7 @@ int ZORVadEnumString::CalcConcatenation(const ZORVadEnumString& x, const ZORVadE
   ZORVadEnumString candidates(pairs);
   for (ZORISVectorIteratorImp_String head(x.mVector); head; ++head) {
     for (ZORISVectorIteratorImp_String tail(y.mVector); tail; ++tail) {
-      ZORString text(*head.Current());
-      candidates.PlaceExact(std::move(text.Append(*tail.Current())));
+      candidates.PlaceExact(ZORString::Concatenation(*head.Current(), *tail.Current()));
       if (candidates.IsUndefined()) return 0;  // more than a set can hold tells nothing
     }
   }

@@ -16,11 +16,11 @@ void Require(int stored) {
 
 }  // namespace
 
-// Bisections over the listed texts, which are always in order.
-unsigned int ZORVadEnumString::CountBelow(const ZORString& text) const {
-  ZORString* const* const places = &mVector[0];
+// Bisections over texts in order.
+unsigned int ZORVadEnumString::CountBelow(const ZORISVectorImp_String& texts, const ZORString& text) {
+  ZORString* const* const places = &texts[0];
   const auto below = [](const ZORString* listed, const ZORString& bound) { return *listed < bound; };
-  return static_cast<unsigned int>(std::lower_bound(places, places + mVector.Count(), text, below) - places);
+  return static_cast<unsigned int>(std::lower_bound(places, places + texts.Count(), text, below) - places);
 }
 
 unsigned int ZORVadEnumString::CountUpTo(const ZORString& text) const {
@@ -71,39 +71,12 @@ int ZORVadEnumString::Append(const ZORISVectorImp_String& texts) {
   return allNew;
 }
 
-// What Insert of each text would do, for texts in order, in one merge: our places move to the end of an array with
-// room for all, and both runs are read from there into its front, which never overtakes them.
-int ZORVadEnumString::Merge(const ZORISVectorImp_String& texts) {
-  const unsigned int own = mVector.Count(), more = texts.Count();
-  const bool known = !IsUndefined() && !IsNil();
-  Reserve(own + more);
-  ZORString** const places = &mVector[0];
-  ZORString** next = places + more;
-  ZORString** const end = next + own;
-  std::copy_backward(places, places + own, end);
-
-  ZORString** out = places;
-  const ZORString* added = nullptr;
-  for (unsigned int i = 0; i < more; ++i) {
-    const ZORString& text = *texts[i];
-    std::strong_ordering order = std::strong_ordering::greater;
-    while (next != end && ((order = **next <=> text) < 0 || (order == 0 && !known))) *out++ = *next++;
-    const bool listed = (next != end && order == 0) || (added != nullptr && *added == text);
-    if (listed && known) continue;
-    added = *out++ = new ZORString(text);
-  }
-  while (next != end) *out++ = *next++;
-  const auto count = static_cast<unsigned int>(out - places);
-  mVector.SetTop(count, own + more);
-  return count == own + more ? 1 : 0;
-}
-
 int ZORVadEnumString::Count() const { return static_cast<int>(mVector.Count()); }
 
 ZORString& ZORVadEnumString::GetValue(int position) const { return *mVector[static_cast<unsigned int>(position)]; }
 
 int ZORVadEnumString::CutLower(const ZORString& bound) {
-  Remove(0, CountBelow(bound));
+  Remove(0, CountBelow(mVector, bound));
   if (mState == ZorStringExact && Count() == 0) mState = ZorStringNil;
   return Count();
 }

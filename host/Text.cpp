@@ -5,7 +5,6 @@
 #include <climits>
 #include <cstdio>
 #include <cstdlib>
-#include <new>
 #include <utility>
 
 namespace {
@@ -20,17 +19,6 @@ constexpr std::array<char, kLongestRun + 1> MakeRun() {
   return run;
 }
 constexpr std::array<char, kLongestRun + 1> kRun = MakeRun();
-
-[[noreturn]] void DieOutOfMemory() {
-  std::fputs("ZORString: out of memory\n", stderr);
-  std::abort();
-}
-
-void* AllocateOrDie(std::size_t size) {
-  void* memory = ::operator new(size, std::nothrow);
-  if (memory == nullptr) DieOutOfMemory();
-  return memory;
-}
 
 std::string_view ViewOf(const char* text) { return text != nullptr ? std::string_view(text) : std::string_view(); }
 
@@ -73,7 +61,10 @@ ZORString& ZORString::operator=(ZORString&& other) noexcept {
   return *this;
 }
 
-void* ZORString::operator new(std::size_t size) { return AllocateOrDie(size); }
+void ZORString::DieOutOfMemory() {
+  std::fputs("ZORString: out of memory\n", stderr);
+  std::abort();
+}
 
 bool ZORString::operator==(const char* text) const { return View() == ViewOf(text); }
 
@@ -130,7 +121,7 @@ char* ZORString::Reserve(std::size_t length) {
   if (length >= INT_MAX) DieOutOfMemory();
   const std::size_t doubled = IsOwner() ? std::min<std::size_t>(std::size_t{mCapacity} * 2, INT_MAX) : 0;
   const std::size_t size = std::max({length, std::size_t{mLength}, doubled}) + 1;
-  char* block = static_cast<char*>(AllocateOrDie(size));
+  char* block = static_cast<char*>(Allocate(size));
   std::memcpy(block, CastToCharPtr(), mLength + std::size_t{1});
   Release();
   mOutside = block;

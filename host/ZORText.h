@@ -2,10 +2,12 @@
 // networks and text streams for people. No class here throws; lengths and positions count characters from 0.
 #pragma once
 
+#include <bit>
 #include <compare>
 #include <cstddef>
 #include <cstdint>
 #include <cstring>
+#include <new>
 #include <string>
 #include <string_view>
 #include <unordered_map>
@@ -60,7 +62,9 @@ class ZOR_EXPORT ZORString {
   int GetLengthInChar() const { return static_cast<int>(mLength); }
   const char* CastToCharPtr() const { return mCapacity == kInside ? mInside : mOutside; }  // zero-ended, stays ours
 
-  ZORString& Append(const ZORString& tail);  // tail may be *this
+  static ZORString Concatenation(const ZORString& head, const ZORString& tail);  // in one allocation at most
+  bool IsConcatenation(const ZORString& head, const ZORString& tail) const;      // builds no text
+  ZORString& Append(const ZORString& tail);                                      // tail may be *this
   // Empty when start lies outside the text or length was negative before it was widened; cut at the end.
   ZORString SubString(std::size_t start, std::size_t length) const;
   // First position at or after start where pattern stands, -1 when nowhere; the empty pattern stands at start.
@@ -74,6 +78,10 @@ class ZOR_EXPORT ZORString {
   static constexpr int kInline = kRoom - 1;
   static constexpr std::uint32_t kInside = 0, kShared = UINT32_MAX;  // else mCapacity is the size of our own block
 
+  static void* Allocate(std::size_t size);
+  [[noreturn]] static void DieOutOfMemory();
+  static int OrderRooms(const char* a, const char* b);
+  static void JoinRooms(const ZORString& head, const ZORString& tail, char* joined);
   static bool AreInside(const ZORString& a, const ZORString& b) { return (a.mCapacity | b.mCapacity) == kInside; }
   std::string_view View() const { return {CastToCharPtr(), mLength}; }
   bool IsOwner() const { return mCapacity != kInside && mCapacity != kShared; }
@@ -94,6 +102,14 @@ class ZOR_EXPORT ZORString {
   };
 };
 
+inline void* ZORString::Allocate(std::size_t size) {
+  void* const memory = ::operator new(size, std::nothrow);
+  if (memory == nullptr) DieOutOfMemory();
+  return memory;
+}
+
+inline void* ZORString::operator new(std::size_t size) { return Allocate(size); }
+
 inline void ZORString::Mirror(const ZORString& other) noexcept {
   std::memcpy(mInside, other.mInside, kRoom);
   mLength = other.mLength;
@@ -111,6 +127,23 @@ inline void ZORString::Release() noexcept {
   if (IsOwner()) ::operator delete(mOutside);  // NOLINT(clang-analyzer-cplusplus.NewDelete): no other text holds it
 }
 
+// Word by word, the first character in the highest byte: what differs mostly does so in the first two words, where a
+// call of memcmp costs more than the comparison.
+inline int ZORString::OrderRooms(const char* a, const char* b) {
+  for (std::size_t i = 0; i < kRoom; i += sizeof(std::uint64_t)) {
+    std::uint64_t x, y;
+    std::memcpy(&x, a + i, sizeof x);
+    std::memcpy(&y, b + i, sizeof y);
+    if (x == y) continue;
+    if constexpr (std::endian::native == std::endian::little) {
+      x = __builtin_bswap64(x);
+      y = __builtin_bswap64(y);
+    }
+    return x < y ? -1 : 1;
+  }
+  return 0;
+}
+
 // Texts inside their objects compare with their padding, in one step whose cost does not hang on their lengths.
 inline bool ZORString::operator==(const ZORString& other) const {
   if (mLength != other.mLength) return false;
@@ -120,8 +153,39 @@ inline bool ZORString::operator==(const ZORString& other) const {
 
 inline std::strong_ordering ZORString::operator<=>(const ZORString& other) const {
   if (!AreInside(*this, other)) return View() <=> other.View();
-  const int order = std::memcmp(mInside, other.mInside, kRoom);
+  const int order = OrderRooms(mInside, other.mInside);
   return order != 0 ? order <=> 0 : mLength <=> other.mLength;
+}
+
+// Copies of fixed size, behind one another: joined has two rooms, the first of them ends in zeros.
+inline void ZORString::JoinRooms(const ZORString& head, const ZORString& tail, char* joined) {
+  std::memcpy(joined, head.mInside, kRoom);
+  std::memcpy(joined + head.mLength, tail.mInside, kRoom);
+}
+
+inline ZORString ZORString::Concatenation(const ZORString& head, const ZORString& tail) {
+  ZORString text;
+  const std::size_t length = std::size_t{head.mLength} + tail.mLength;
+  if (length > kInline || !AreInside(head, tail)) {
+    text.Reserve(length);
+    text.Extend(head.View());
+    text.Extend(tail.View());
+    return text;
+  }
+  char joined[2 * kRoom];
+  JoinRooms(head, tail, joined);
+  std::memcpy(text.mInside, joined, kRoom);
+  text.mLength = static_cast<std::uint32_t>(length);
+  return text;
+}
+
+inline bool ZORString::IsConcatenation(const ZORString& head, const ZORString& tail) const {
+  if (std::uint64_t{head.mLength} + tail.mLength != mLength) return false;
+  if (mCapacity != kInside || !AreInside(head, tail))
+    return View().substr(0, head.mLength) == head.View() && View().substr(head.mLength) == tail.View();
+  char joined[2 * kRoom];
+  JoinRooms(head, tail, joined);
+  return std::memcmp(joined, mInside, kRoom) == 0;
 }
 
 class ZORipstream;
@@ -253,4 +317,4 @@ class ZOR_EXPORT ZORistrstream {
   const char* mEnd;
 };
 
-ZOR_EXPORT ZORistrstream& ws(ZORistrstream& in);  // skips space, \t, \n, \v, \f and \r
+ZOR_EXPORT ZORistrstream& ws(ZORistrstream& in);  // skips spaces and the codes 9 to 13

@@ -10,17 +10,6 @@
 
 namespace {
 
-bool IsConcatenation(std::string_view text, std::string_view x, std::string_view y) {
-  return text.size() == x.size() + y.size() && text.substr(0, x.size()) == x && text.substr(x.size()) == y;
-}
-
-// For texts that keep to the limit together: one allocation, where appending to a copy takes two.
-ZORString Joined(std::string_view x, std::string_view y) {
-  char text[zor::kLengthLimit];
-  std::copy(y.begin(), y.end(), std::copy(x.begin(), x.end(), text));
-  return {text, x.size() + y.size()};
-}
-
 // Positions and counts are worked out in 32 bits and wrap there.
 ZORLong Wrapped(std::int64_t sum) { return static_cast<ZORLong>(static_cast<std::uint32_t>(sum)); }
 
@@ -43,10 +32,10 @@ int ZORVadSingleString::CalcConcatenation(const ZORVadSingleString& x, const ZOR
   if (IsNil() || x.IsNil() || y.IsNil()) return Nil();
   if (x.IsUndefined() || y.IsUndefined()) return Any();  // overwrites a known value
   if (x.IsFull() || y.IsFull()) return CalcMaxValue();
-  const std::string_view head = zor::View(x.mText), tail = zor::View(y.mText);
-  if (head.size() + tail.size() > zor::kLengthLimit) return CalcMaxValue();
-  if (!IsUndefined()) return IsConcatenation(zor::View(mText), head, tail) ? 0 : Nil();  // no text is built
-  return Settle(Joined(head, tail));
+  const std::size_t length = zor::View(x.mText).size() + zor::View(y.mText).size();
+  if (length > zor::kLengthLimit) return CalcMaxValue();
+  if (!IsUndefined()) return mText.IsConcatenation(x.mText, y.mText) ? 0 : Nil();
+  return Settle(ZORString::Concatenation(x.mText, y.mText));
 }
 
 int ZORVadSingleString::CalcFirstInverseConcatenation(ZORVadSingleString& x, const ZORVadSingleString& y) const {

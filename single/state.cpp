@@ -58,7 +58,6 @@ void ZORVadSingleString::SetNilValue() { Become(ZorStringNil, ZorVaDoStringNil);
 void ZORVadSingleString::SetUndefinedValue() { Become(ZorStringAny, ZorVaDoStringAny); }
 
 int ZORVadSingleString::IsEmpty() const { return mState == ZorStringExact && mText == ZorVaDoStringMin; }
-int ZORVadSingleString::IsFull() const { return mState == ZorStringMax; }
 
 unsigned long ZORVadSingleString::GetCardinality() const {
   if (IsNil()) return 0;

@@ -29,8 +29,8 @@ class ZOR_EXPORT ZORISVectorImp_String {
   ZORISVectorImp_String(const ZORISVectorImp_String& other);
   const ZORISVectorImp_String& operator=(const ZORISVectorImp_String& other);
 
-  ZOR_EXPORT ZORString*& operator[](unsigned int pos) { return mItems[pos]; }  // below Limit(), untested
-  ZOR_EXPORT ZORString*& operator[](unsigned int pos) const { return mItems[pos]; }
+  ZORString*& operator[](unsigned int pos);  // below Limit(), untested
+  ZORString*& operator[](unsigned int pos) const;
 
   // clang-format off
   virtual ~ZORISVectorImp_String();
@@ -114,6 +114,17 @@ class ZOR_EXPORT ZORISVectorImp_String {
   double mRatio;
   int mGood;
 };
+
+// Inline, yet defined behind the class: so they stay exported to programs that do not inline them.
+inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) { return mItems[pos]; }
+inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) const { return mItems[pos]; }
+inline int ZORISVectorImp_String::Good() const { return mGood; }
+inline int ZORISVectorImp_String::Good() { return mGood; }
+inline int ZORISVectorImp_String::IsEmpty() const { return mTop == 0; }
+inline unsigned int ZORISVectorImp_String::Limit() const { return mLimit; }
+inline unsigned int ZORISVectorImp_String::Top() const { return mTop; }
+inline unsigned int ZORISVectorImp_String::Count() const { return mTop; }
+inline unsigned int ZORISVectorImp_String::GetDelta() const { return mDelta; }
 
 // A cursor over a vector, which it does not own. The end of the walk is fixed when it is made or restarted: strings
 // added behind it meanwhile stay outside. It must lie within the vector's limit.

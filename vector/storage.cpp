@@ -70,14 +70,6 @@ void ZORISVectorImp_String::TakeOver(const ZORISVectorImp_String& other) {
 
 ZORISVectorImp_String::~ZORISVectorImp_String() { delete[] mItems; }
 
-int ZORISVectorImp_String::Good() const { return mGood; }
-int ZORISVectorImp_String::Good() { return mGood; }
-int ZORISVectorImp_String::IsEmpty() const { return mTop == 0; }
-unsigned int ZORISVectorImp_String::Limit() const { return mLimit; }
-unsigned int ZORISVectorImp_String::Top() const { return mTop; }
-unsigned int ZORISVectorImp_String::Count() const { return mTop; }
-unsigned int ZORISVectorImp_String::GetDelta() const { return mDelta; }
-
 unsigned int ZORISVectorImp_String::NextDelta(unsigned int needed) {
   if (mRatio == 0.0) {
     if (mDelta == 0 || needed % mDelta == 0) return mDelta == 0 ? 0 : needed;

@@ -148,3 +148,32 @@ TEST(String, OrdersByUnsignedCode) {
   EXPECT_LT(ZORString("ab"), ZORString("ab "));
   EXPECT_LT(ZORString("a"), ZORString("b"));
 }
+
+TEST(String, OrdersByTheFirstCharacterThatDiffers) {
+  for (const std::size_t length : kLengths) {
+    for (std::size_t at = 0; at < length; ++at) {
+      std::string low(length, 'm'), high(low);
+      high[at] = '\xe9';
+      if (at + 1 < length) low[at + 1] = '\xff';
+      EXPECT_LT(ZORString(low.data(), length), ZORString(high.data(), length)) << length << ' ' << at;
+    }
+  }
+  EXPECT_LT(ZORString("a"), ZORString("a\0", 2));
+}
+
+TEST(String, ConcatenationsAreTestedWithoutBeingBuilt) {
+  for (const std::size_t first : kLengths) {
+    for (const std::size_t second : kLengths) {
+      const ZORString head('a', first), tail('z', second);
+      std::string model = std::string(first, 'a') + std::string(second, 'z');
+      ExpectSame(ZORString::Concatenation(head, tail), model);
+      EXPECT_TRUE(ZORString(model.data(), model.size()).IsConcatenation(head, tail));
+      EXPECT_FALSE(ZORString(model.data(), model.size()).IsConcatenation(head, ZORString('z', second + 1)));
+      for (std::size_t at = 0; at < model.size(); at += 15) {
+        std::string other(model);
+        other[at] = 'b';
+        EXPECT_FALSE(ZORString(other.data(), other.size()).IsConcatenation(head, tail)) << first << ' ' << at;
+      }
+    }
+  }
+}

@@ -21,20 +21,22 @@ class Diagnostics {
  public:
   static constexpr std::size_t kErrorLimit = 20;
 
-  void Error(Extent extent, std::string message);  // from the limit on nothing is added
+  void Error(Extent extent, std::string message);  // beyond the limit nothing is added
   void Note(Extent extent, std::string message);   // to the last error
   void Sort();                                     // into the order of their places
   bool Failed() const { return mErrors != 0; }
-  bool Full() const { return mErrors >= kErrorLimit; }
-  std::size_t Count() const { return mErrors; }
+  bool Stopped() const { return mErrors > kErrorLimit; }  // there was an error beyond the limit
   const std::vector<Diagnostic>& All() const { return mAll; }
 
  private:
   std::vector<Diagnostic> mAll;
   std::size_t mErrors = 0;
-  bool mDropped = false;  // the last error was beyond the limit
 };
 
+// Characters that are marked below the line: at least one, and no more than stand in it.
+std::size_t MarkedLength(const Source& source, Extent extent);
+
+// Of a long line the neighbourhood of what is marked. Control characters are shown as question marks.
 std::string Render(const Source& source, const Diagnostic& diagnostic, bool colour);
 std::string Render(const Source& source, const Diagnostics& diagnostics, bool colour);
 

@@ -54,6 +54,11 @@ Progress Functions::Narrow(const Constraint& constraint) {
   }
   if (constraint.kind->meaning == Meaning::Length) BoundLength(constraint.Result());
   if (mStore.HasFailed()) return Progress::Waits;
+  if (constraint.kind->meaning == Meaning::Successor && constraint.arguments[0] == constraint.Result()) {
+    mStore.StartOperation(Operation::Successor);
+    MeetResult(constraint, {GreatestText(), 0});  // the one text that is its own
+    return Progress::Done;
+  }
   if (mStore[constraint.Result()].IsUndefined() && ComputeSets(constraint)) return Progress::Waits;
   if (mSupports.Narrow(constraint)) return Progress::Waits;
   ComputeSets(constraint);

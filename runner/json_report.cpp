@@ -70,6 +70,7 @@ class JsonReport : public Report {
             {"file", source.Name()},
             {"line", at.line},
             {"column", at.column},
+            {"length", MarkedLength(source, diagnostic.extent)},
             {"message", diagnostic.message}});
     }
   }

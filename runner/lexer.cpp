@@ -16,13 +16,6 @@ bool IsDigit(char c) { return c >= '0' && c <= '9'; }
 bool IsLetter(char c) { return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || c == '_'; }
 bool IsBlank(char c) { return c == ' ' || (c >= '\t' && c <= '\r'); }
 
-// Bytes of the character that text begins with.
-std::size_t CharacterLength(std::string_view text) {
-  std::size_t length = 1;
-  while (length < text.size() && CountCharacters(text.substr(length, 1)) == 0) ++length;
-  return length;
-}
-
 std::string NameOf(std::string_view character) {
   const auto code = static_cast<unsigned char>(character.front());
   if (code < ' ' || code == 0x7F) return fmt::format("character {}", code);

@@ -1,10 +1,12 @@
-#include <csignal>
+#include <iostream>
 
 #include "runner/run.h"
 
 int main(int argc, char** argv) {
-  std::signal(SIGPIPE, SIG_IGN);  // a program that we feed may end early
   int exitCode = 0;
   const auto options = zornet::ReadOptions(argc, argv, exitCode);
-  return options ? zornet::Run(*options) : exitCode;
+  if (options) exitCode = zornet::Run(*options);
+  if (std::cout.flush()) return exitCode;
+  std::cerr << "zornet: error: standard output cannot be written\n";
+  return zornet::kUsage;
 }

@@ -6,7 +6,7 @@ namespace zornet {
 
 namespace {
 
-constexpr std::string_view kBlanks = " \t\r\n";
+constexpr std::string_view kBlanks = " \t\r\n\v\f";
 
 }  // namespace
 
@@ -37,11 +37,11 @@ std::string Names::OfVariable(int variable) const {
 }
 
 std::size_t Names::LineOfConstraint(int constraint) const {
-  return mSource.Locate(mModel.constraints[static_cast<std::size_t>(constraint)].place.begin).line;
+  return mSource.LineOf(mModel.constraints[static_cast<std::size_t>(constraint)].place.begin);
 }
 
 std::size_t Names::LineOfVariable(int variable) const {
-  return mSource.Locate(mModel.variables[static_cast<std::size_t>(variable)].place.begin).line;
+  return mSource.LineOf(mModel.variables[static_cast<std::size_t>(variable)].place.begin);
 }
 
 std::string Names::PlaceOfConstraint(int constraint) const {

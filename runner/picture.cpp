@@ -7,6 +7,7 @@
 #include <unistd.h>
 
 #include <cerrno>
+#include <csignal>
 #include <cstring>
 #include <fstream>
 #include <stdexcept>
@@ -52,7 +53,9 @@ pid_t StartDot(const std::string& file, const Pipe& input) {
   return child;
 }
 
+// Who reads may end early; that is told by its status and must not end this program.
 void Feed(Pipe& input, std::string_view graph) {
+  auto* const before = std::signal(SIGPIPE, SIG_IGN);
   close(input.ends[0]);
   input.ends[0] = -1;
   while (!graph.empty()) {
@@ -63,6 +66,7 @@ void Feed(Pipe& input, std::string_view graph) {
   }
   close(input.ends[1]);
   input.ends[1] = -1;
+  std::signal(SIGPIPE, before);
 }
 
 }  // namespace

@@ -8,21 +8,22 @@ namespace zornet {
 
 class ProgressLine {
  public:
-  explicit ProgressLine(bool on) : mOn(on) {}
+  using Clock = std::chrono::steady_clock;
+
+  // Writes nothing before its patience has run out, and then ten times a second at most.
+  explicit ProgressLine(bool on, Clock::duration patience = std::chrono::seconds(1))
+      : mOn(on), mNext(mBegin + patience) {}
   ~ProgressLine();  // wipes the line
   ProgressLine(const ProgressLine&) = delete;
   ProgressLine& operator=(const ProgressLine&) = delete;
 
-  // Writes nothing in the first second, and then ten times a second at most.
   void Show(std::uint64_t steps, std::size_t waiting);
 
  private:
-  using Clock = std::chrono::steady_clock;
-
   bool mOn;
   bool mShown = false;
   Clock::time_point mBegin = Clock::now();
-  Clock::time_point mNext = mBegin + std::chrono::seconds(1);
+  Clock::time_point mNext;
 };
 
 }  // namespace zornet

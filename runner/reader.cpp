@@ -81,6 +81,9 @@ class Resolver {
   }
 
   Model Resolve() {
+    mNames.reserve(mSyntax.declarations.size());
+    mModel.variables.reserve(mSyntax.declarations.size() + CountConstants());
+    mModel.constraints.reserve(mSyntax.constraints.size());
     for (const DeclarationSyntax& declaration : mSyntax.declarations) Declare(declaration);
     for (const ConstraintSyntax& constraint : mSyntax.constraints) Add(constraint);
     for (const Token& name : mSyntax.outputs) AddOutput(name);
@@ -89,11 +92,12 @@ class Resolver {
   }
 
  private:
+  std::size_t CountConstants() const;
   void Declare(const DeclarationSyntax& declaration);
   bool SetType(const TypeSyntax& type, Variable& variable);
   bool SetValue(const DeclarationSyntax& declaration, Variable& variable);
   bool IsAllowed(const Variable& variable, const Word& word) const;
-  bool Collect(const std::vector<Word>& words, Word::Type expected, Variable& variable);
+  bool Collect(std::span<const Word> words, Word::Type expected, Variable& variable);
   void Add(const ConstraintSyntax& constraint);
   const Kind* FindKindFor(const ConstraintSyntax& constraint);
   int AddArgument(const Word& word, Takes takes, std::string_view constraint, std::string_view role);
@@ -110,6 +114,12 @@ class Resolver {
 };
 
 constexpr int kUnknown = -1;
+
+std::size_t Resolver::CountConstants() const {
+  const auto& words = mSyntax.arguments;
+  return static_cast<std::size_t>(
+      std::count_if(words.begin(), words.end(), [](const Word& word) { return word.type != Word::Name; }));
+}
 
 void Resolver::Declare(const DeclarationSyntax& declaration) {
   const auto known = mNames.find(declaration.name.text);
@@ -141,7 +151,7 @@ bool Resolver::SetType(const TypeSyntax& type, Variable& variable) {
 }
 
 // The words as the variable's texts or numbers, in order and each once.
-bool Resolver::Collect(const std::vector<Word>& words, Word::Type expected, Variable& variable) {
+bool Resolver::Collect(std::span<const Word> words, Word::Type expected, Variable& variable) {
   variable.texts.clear();
   variable.numbers.clear();
   for (const Word& word : words) {
@@ -193,8 +203,9 @@ void Resolver::Add(const ConstraintSyntax& syntax) {
   if (kind == nullptr) return;
   Constraint constraint{kind, {}, syntax.extent};
   bool good = true;
-  for (std::size_t i = 0; i < syntax.arguments.size(); ++i) {
-    constraint.arguments[i] = AddArgument(syntax.arguments[i], kind->takes[i], kind->name, kind->roles[i]);
+  const std::span<const Word> arguments = mSyntax.ArgumentsOf(syntax);
+  for (std::size_t i = 0; i < arguments.size(); ++i) {
+    constraint.arguments[i] = AddArgument(arguments[i], kind->takes[i], kind->name, kind->roles[i]);
     good = good && constraint.arguments[i] != kUnknown;
   }
   if (good) mModel.constraints.push_back(constraint);
@@ -210,12 +221,11 @@ const Kind* Resolver::FindKindFor(const ConstraintSyntax& constraint) {
                                                            Suggestion(constraint.name.text, names)));
     return nullptr;
   }
-  if (static_cast<int>(constraint.arguments.size()) == kind->arity) return kind;
+  if (static_cast<int>(constraint.arguments) == kind->arity) return kind;
   std::string roles(kind->roles[0]);
-  for (int i = 1; i < kind->arity; ++i)
-    fmt::format_to(std::back_inserter(roles), ", {}", kind->roles[static_cast<std::size_t>(i)]);
+  for (int i = 1; i < kind->arity; ++i) roles += fmt::format(", {}", kind->roles[static_cast<std::size_t>(i)]);
   mDiagnostics.Error(constraint.extent, fmt::format("{}({}) takes {} arguments, not {}", kind->name, roles, kind->arity,
-                                                    constraint.arguments.size()));
+                                                    constraint.arguments));
   return nullptr;
 }
 
@@ -236,7 +246,7 @@ int Resolver::AddConstant(const Word& word) {
   constant.place = word.token.extent;
   if (word.type == Word::Number) constant.sort = Sort::Integer;
   if (word.type == Word::Truth) constant.sort = Sort::Boolean;
-  Collect({word}, word.type, constant);
+  Collect({&word, 1}, word.type, constant);
   mModel.variables.push_back(std::move(constant));
   return static_cast<int>(mModel.variables.size()) - 1;
 }
@@ -244,12 +254,12 @@ int Resolver::AddConstant(const Word& word) {
 int Resolver::Find(const Token& name) {
   const auto found = mNames.find(name.text);
   if (found != mNames.end()) return found->second;
-  if (mBroken.contains(name.text)) return kUnknown;
+  if (mBroken.contains(name.text) || mDiagnostics.Stopped()) return kUnknown;
   std::vector<std::string_view> names;
   for (const auto& [known, variable] : mNames) names.push_back(known);
   std::sort(names.begin(), names.end());
   const std::string_view closest = Closest(name.text, names);
-  mDiagnostics.Error(name.extent, fmt::format("'{}' is not declared{}", name.text, Suggestion(name.text, names)));
+  mDiagnostics.Error(name.extent, fmt::format("'{}' is not declared{}", name.text, Suggestion(closest)));
   if (closest.empty()) return kUnknown;
   mDiagnostics.Note(mModel.variables[static_cast<std::size_t>(mNames.at(closest))].place,
                     fmt::format("'{}' is declared here", closest));

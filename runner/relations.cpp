@@ -114,13 +114,27 @@ void Relations::Remove(int target, const ZORString& text) {
 // x <= y or x < y: what x has above all of y goes, and what y has below all of x. A strict order is posted as not
 // above and unequal, since on sets the module compares the upper bounds alone.
 Progress Relations::Ordered(int x, int y, bool strict) {
-  if (!mStore[x].IsKnown() || !mStore[y].IsKnown()) return Progress::Waits;
+  if (!mStore[x].IsKnown() || !mStore[y].IsKnown()) {
+    if (strict) FailBeyondEnds(x, y);
+    return Progress::Waits;
+  }
   const ZORString lowest = mStore[x].LowestText(), highest = mStore[y].HighestText();
   const ZORString from = mStore[x].HighestText(), to = mStore[y].LowestText();
   if (strict ? from < to : from <= to) return Progress::Done;
   CutAbove(x, highest, strict);
   if (!mStore.HasFailed()) CutBelow(y, lowest, strict);
   return Progress::Waits;
+}
+
+// Below the least text there is none, nor above the greatest.
+void Relations::FailBeyondEnds(int x, int y) {
+  if (mStore[y].IsKnown() && mStore[y].HighestText().GetLengthInChar() == 0) {
+    mStore.StartOperation(Operation::NotAbove);
+    mStore.Fail(x);
+  } else if (mStore[x].IsKnown() && mStore[x].LowestText() == GreatestText()) {
+    mStore.StartOperation(Operation::NotBelow);
+    mStore.Fail(y);
+  }
 }
 
 void Relations::CutAbove(int target, const ZORString& bound, bool strict) {

@@ -65,7 +65,7 @@ class OneRun {
 
  private:
   void FindExplained();
-  void Watch(Store& store);
+  void Watch(Store& store, bool explained);
   void Solve(Store& store);
   void Search(Store& store, Propagation& propagation);
   void Tell(Store& store);
@@ -86,7 +86,7 @@ int OneRun::Go() {
   FindExplained();
   const Session session(mOptions.modulePaths);
   Store store(session.Types(), mModel);
-  Watch(store);
+  Watch(store, !mExplained.empty());
   const auto begin = std::chrono::steady_clock::now();
   if (mOptions.raw) {
     RunRaw(store, mNames, [this](const RawCall& call) { mReport.Called(call); });
@@ -109,12 +109,9 @@ void OneRun::FindExplained() {
 }
 
 // Nobody watches where nobody listens: text forms cost more than the narrowing itself.
-void OneRun::Watch(Store& store) {
-  if (!mExplained.empty()) {
-    store.Watch(&mBoth);
-  } else if (mOptions.trace || mOptions.json) {
-    store.Watch(&mReport);
-  }
+void OneRun::Watch(Store& store, bool explained) {
+  Watcher* const told = mOptions.trace || mOptions.json ? &mReport : nullptr;
+  store.Watch(explained ? &mBoth : told);
 }
 
 void OneRun::Solve(Store& store) {
@@ -122,17 +119,25 @@ void OneRun::Solve(Store& store) {
   ProgressLine progress(isatty(STDERR_FILENO) != 0 && !mOptions.json);
   propagation.OnProgress([&](std::uint64_t steps, std::size_t waiting) { progress.Show(steps, waiting); });
   mSummary.outcome = propagation.Run();
-  if (mOptions.solutions != 0 && mSummary.outcome == Outcome::Settled) Search(store, propagation);
+  mSummary.searched = mOptions.solutions != 0;
+  mSummary.complete = mSummary.outcome == Outcome::Contradiction;
+  if (mSummary.searched && mSummary.outcome == Outcome::Settled) Search(store, propagation);
   mSummary.passes = propagation.Steps();
 }
 
+// The choices are undone in the end, so that they explain nothing.
 void OneRun::Search(Store& store, Propagation& propagation) {
+  Watch(store, false);
   zornet::Search search(store, propagation);
-  mSummary.outcome = search.Run(mOptions.solutions, [&] { mReport.Solution(store, ++mSummary.solutions); });
-  mSummary.searched = true;
+  mSummary.outcome = search.Run(mOptions.solutions, [&] {
+    mReport.Solution(store, ++mSummary.solutions);
+    return std::cout.good();
+  });
   mSummary.complete = search.IsComplete();
   mSummary.open = search.Open();
   mSummary.openVariable = search.OpenVariable();
+  const bool none = mSummary.complete && mSummary.solutions == 0 && mSummary.open == 0;
+  if (none) mSummary.outcome = Outcome::Contradiction;
 }
 
 void OneRun::Tell(Store& store) {
@@ -154,9 +159,7 @@ void OneRun::WritePictures(const Store& store) const {
 
 int OneRun::ExitCode() const {
   if (mSummary.outcome == Outcome::StepLimit) return kStepLimit;
-  if (mSummary.outcome == Outcome::Contradiction) return kContradiction;
-  const bool none = mSummary.searched && mSummary.complete && mSummary.solutions == 0 && mSummary.open == 0;
-  return none ? kContradiction : kSettled;
+  return mSummary.outcome == Outcome::Contradiction ? kContradiction : kSettled;
 }
 
 }  // namespace

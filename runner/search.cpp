@@ -5,8 +5,17 @@
 namespace zornet {
 
 Outcome Search::Run(std::uint64_t limit, const Solution& solution) {
+  const Outcome outcome = Look(limit, solution);
+  mComplete = mFrames.empty();
+  for (; !mFrames.empty(); mFrames.pop_back()) {
+    if (mFrames.size() > 1) Retract();
+  }
+  return outcome;
+}
+
+Outcome Search::Look(std::uint64_t limit, const Solution& solution) {
   if (!Descend()) Leaf(solution);
-  while (!mFrames.empty() && mFound < limit) {
+  while (!mFrames.empty() && mFound < limit && mWanted) {
     Frame& frame = mFrames.back();
     if (frame.next == frame.listing.count) {
       mFrames.pop_back();
@@ -16,12 +25,11 @@ Outcome Search::Run(std::uint64_t limit, const Solution& solution) {
     Mark();
     Choose(frame.variable, frame.listing, frame.next++);
     const Outcome outcome = mPropagation.Run();
-    if (outcome == Outcome::StepLimit) return outcome;
     if (outcome == Outcome::Settled && Descend()) continue;
     if (outcome == Outcome::Settled) Leaf(solution);
     Retract();
+    if (outcome == Outcome::StepLimit) return outcome;
   }
-  mComplete = mFrames.empty();
   return Outcome::Settled;
 }
 
@@ -72,7 +80,7 @@ void Search::Leaf(const Solution& solution) {
   }
   if (!Confirm()) return;
   ++mFound;
-  solution();
+  mWanted = solution();
 }
 
 bool Search::Confirm() {

@@ -14,11 +14,12 @@ namespace zornet {
 
 class Search {
  public:
-  using Solution = std::function<void()>;  // the store holds it
+  using Solution = std::function<bool()>;  // the store holds it; false when no other is wanted
 
   Search(Store& store, Propagation& propagation) : mStore(store), mPropagation(propagation), mTruth(store.Types()) {}
 
-  // Goes on from a network that was settled. Settled: stopped at the limit or because there are no more.
+  // Goes on from a network that was settled, and leaves it so. Settled: stopped at the limit, because no other is
+  // wanted or because there are no more.
   Outcome Run(std::uint64_t limit, const Solution& solution);
 
   std::uint64_t Found() const { return mFound; }
@@ -33,6 +34,7 @@ class Search {
     std::size_t next = 0;
   };
 
+  Outcome Look(std::uint64_t limit, const Solution& solution);
   bool Descend();
   void Choose(int variable, const Listing& listing, std::size_t index);
   void Mark();
@@ -47,6 +49,7 @@ class Search {
   std::uint64_t mFound = 0;
   std::uint64_t mOpen = 0;
   int mOpenVariable = kNone;
+  bool mWanted = true;
   bool mComplete = false;
 };
 

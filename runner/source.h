@@ -31,7 +31,9 @@ class Source {
   std::string_view Text(Extent extent) const { return Text().substr(extent.begin, extent.length); }
   std::string_view Line(std::size_t line) const;  // without its end; lines count from 1
   std::size_t LineBegin(std::size_t line) const { return mLines[line - 1]; }
-  Location Locate(std::size_t position) const;
+  std::string_view InLine(Extent extent) const;  // what of it stands in the line where it begins
+  std::size_t LineOf(std::size_t position) const;
+  Location Locate(std::size_t position) const;  // reads the line up to there
 
  private:
   std::string mName;
@@ -39,7 +41,8 @@ class Source {
   std::vector<std::size_t> mLines;  // where each begins
 };
 
-// Characters of UTF-8 in text; a stray byte counts as one.
+// Characters of UTF-8; a stray byte counts as one. Bytes of the first, of a text that is not empty:
+std::size_t CharacterLength(std::string_view text);
 std::size_t CountCharacters(std::string_view text);
 
 }  // namespace zornet

@@ -10,6 +10,8 @@ namespace zornet {
 
 namespace {
 
+constexpr std::size_t kLongestWord = 64;  // nobody slips in a longer one, and comparing takes the square of its length
+
 // Letters to insert, to drop, to replace or to exchange with a neighbour to make b of a.
 std::size_t Distance(std::string_view a, std::string_view b) {
   std::vector<std::size_t> before(b.size() + 1), row(b.size() + 1), next(b.size() + 1);
@@ -30,9 +32,11 @@ std::size_t Distance(std::string_view a, std::string_view b) {
 }  // namespace
 
 std::string_view Closest(std::string_view word, std::span<const std::string_view> words) {
+  if (word.size() > kLongestWord) return {};
   std::size_t nearest = word.size() / 3 + 1;  // one slip, and one more for every three letters
   std::string_view found;
   for (const std::string_view other : words) {
+    if (other.size() > word.size() + nearest || word.size() > other.size() + nearest) continue;
     const std::size_t distance = Distance(word, other);
     if (distance > nearest || distance >= std::max(word.size(), other.size())) continue;
     if (distance == nearest && !found.empty()) continue;
@@ -43,7 +47,10 @@ std::string_view Closest(std::string_view word, std::span<const std::string_view
 }
 
 std::string Suggestion(std::string_view word, std::span<const std::string_view> words) {
-  const std::string_view closest = Closest(word, words);
+  return Suggestion(Closest(word, words));
+}
+
+std::string Suggestion(std::string_view closest) {
   return closest.empty() ? "" : fmt::format("; did you mean '{}'?", closest);
 }
 

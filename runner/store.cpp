@@ -36,10 +36,10 @@ Value Store::Initial(const zornet::Types& types, const Variable& variable) {
   if (variable.texts.empty() && variable.numbers.empty()) return value;
   if (!IsText(variable.sort)) {
     value.SetNumbers(variable.numbers);
-  } else if (IsReadable(variable.texts)) {
-    value.Input(TextForm(variable.texts));
   } else if (variable.sort == Sort::Text) {
     value.SetText(ToZor(variable.texts.front()));
+  } else if (IsReadable(variable.texts)) {
+    value.Input(TextForm(variable.texts));
   } else {
     std::vector<ZORString> texts;
     for (const std::string& text : variable.texts) texts.push_back(ToZor(text));

@@ -33,18 +33,19 @@ std::size_t Find(const Listing& listing, const Answer& answer) {
 
 bool Supports::Narrow(const Constraint& constraint) {
   Prepare(constraint);
-  std::vector<std::pair<double, int>> targets;  // by what it costs to reach them; the result ahead of its equals
+  mTargets.clear();
   for (int position = constraint.kind->Inputs(); position >= 0; --position) {
     const bool result = position == constraint.kind->Inputs();
     if (!result && !Truth::CanInvert(*constraint.kind, position)) continue;
     const double combinations = Combinations(constraint, position);
     if (combinations <= static_cast<double>(mBudget)) {
-      targets.emplace_back(combinations * (result ? 1 : kInversionCost), position);
+      mTargets.emplace_back(combinations * (result ? 1 : kInversionCost), position);
     }
   }
-  std::stable_sort(targets.begin(), targets.end(), [](const auto& a, const auto& b) { return a.first < b.first; });
+  std::sort(mTargets.begin(), mTargets.end(),
+            [](const auto& a, const auto& b) { return a.first != b.first ? a.first < b.first : a.second > b.second; });
   const auto reached = [&](const auto& target) { return Try(constraint, target.second); };
-  if (std::none_of(targets.begin(), targets.end(), reached)) return false;
+  if (std::none_of(mTargets.begin(), mTargets.end(), reached)) return false;
   Apply(constraint);
   return true;
 }

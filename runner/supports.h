@@ -3,6 +3,7 @@
 #pragma once
 
 #include <array>
+#include <utility>
 #include <vector>
 
 #include "runner/store.h"
@@ -64,7 +65,8 @@ class Supports {
   std::array<std::size_t, kMostArguments> mColumnOf{};  // by position
   std::array<Exact, kMostArguments> mExact{};           // what is tried, by position
   int mArity = 0;
-  std::vector<Column*> mTried;  // the columns whose combinations are tried
+  std::vector<Column*> mTried;                   // the columns whose combinations are tried
+  std::vector<std::pair<double, int>> mTargets;  // by what it costs to reach them; the result ahead of its equals
 };
 
 }  // namespace zornet

@@ -4,6 +4,7 @@
 
 #include <string>
 #include <string_view>
+#include <utility>
 
 #include "runner/spelling.h"
 
@@ -38,7 +39,7 @@ class Parser {
   }
 
   Syntax Parse() {
-    while (mToken.type != Token::End && !mDiagnostics.Full()) Item();
+    while (mToken.type != Token::End && !mDiagnostics.Stopped()) Item();
     return std::move(mSyntax);
   }
 
@@ -64,7 +65,7 @@ class Parser {
   Diagnostics& mDiagnostics;
   Lexer mLexer;
   Token mToken;  // the next
-  Token mLast;   // the one before
+  Extent mLast;  // of the one before
   Token mDeclared;
   Syntax mSyntax;
 };
@@ -94,7 +95,7 @@ void Parser::Declaration() {
     const Token first = mToken;
     declaration.setValue = mToken.Is("{");
     declaration.value = declaration.setValue ? Braces() : std::vector{Constant()};
-    declaration.valueExtent = Join(first.extent, mLast.extent);
+    declaration.valueExtent = Join(first.extent, mLast);
   }
   Expect(";", "at the end of the declaration");
   mSyntax.declarations.push_back(std::move(declaration));
@@ -116,7 +117,7 @@ TypeSyntax Parser::Type() {
   } else {
     type = NamedType();
   }
-  type.extent = Join(first.extent, mLast.extent);
+  type.extent = Join(first.extent, mLast);
   return type;
 }
 
@@ -180,16 +181,18 @@ void Parser::Constraint() {
   Take();
   if (mToken.type != Token::Name) Fail("the name of a constraint");
   constraint.name = Take();
+  constraint.firstArgument = mSyntax.arguments.size();
   Expect("(", "behind the name of the constraint");
-  if (!mToken.Is(")")) constraint.arguments.push_back(Argument());
+  if (!mToken.Is(")")) mSyntax.arguments.push_back(Argument());
   while (mToken.Is(",")) {
     Take();
-    constraint.arguments.push_back(Argument());
+    mSyntax.arguments.push_back(Argument());
   }
+  constraint.arguments = mSyntax.arguments.size() - constraint.firstArgument;
   const Token close = Expect(")", "behind the arguments");
   constraint.extent = Join(constraint.name.extent, close.extent);
   Expect(";", "at the end of the constraint");
-  mSyntax.constraints.push_back(std::move(constraint));
+  mSyntax.constraints.push_back(constraint);
 }
 
 void Parser::Output() {
@@ -202,9 +205,8 @@ void Parser::Output() {
 }
 
 Token Parser::Take() {
-  mLast = mToken;
-  mToken = mLexer.Next();
-  return mLast;
+  mLast = mToken.extent;
+  return std::exchange(mToken, mLexer.Next());
 }
 
 // What is missing at the end of a line is told there, not at the line below where it was noticed.
@@ -212,7 +214,7 @@ Token Parser::Expect(std::string_view mark, std::string_view where) {
   if (mToken.Is(mark)) return Take();
   const std::string expected = fmt::format("'{}' {}", mark, where);
   if (mToken.type == Token::End || StartsLine(mToken)) {
-    mDiagnostics.Error({mLast.extent.End(), 1}, "expected " + expected);
+    mDiagnostics.Error({mLast.End(), 1}, "expected " + expected);
     throw Unreadable();
   }
   Fail(expected);
@@ -221,7 +223,7 @@ Token Parser::Expect(std::string_view mark, std::string_view where) {
 // A Broken word has been told by the lexer.
 void Parser::Fail(const std::string& expected) {
   if (mToken.type == Token::End) {
-    mDiagnostics.Error({mLast.extent.End(), 1}, "the model ends here, expected " + expected);
+    mDiagnostics.Error({mLast.End(), 1}, "the model ends here, expected " + expected);
   } else if (mToken.type != Token::Broken) {
     mDiagnostics.Error(mToken.extent, "expected " + expected);
   }
@@ -240,8 +242,9 @@ void Parser::Recover() {
 }
 
 bool Parser::StartsLine(const Token& token) const {
-  const std::size_t begin = mSource.LineBegin(mSource.Locate(token.extent.begin).line);
-  return mSource.Text({begin, token.extent.begin - begin}).find_first_not_of(" \t") == std::string_view::npos;
+  const std::string_view before = mSource.Text({0, token.extent.begin});
+  const std::size_t last = before.find_last_not_of(" \t");
+  return last == std::string_view::npos || before[last] == '\n';
 }
 
 }  // namespace

@@ -1,6 +1,8 @@
 // The items of a model as they are written, before names are looked up.
 #pragma once
 
+#include <cstddef>
+#include <span>
 #include <vector>
 
 #include "runner/diagnostics.h"
@@ -33,15 +35,20 @@ struct DeclarationSyntax {
 
 struct ConstraintSyntax {
   Token name;
-  std::vector<Word> arguments;
+  std::size_t firstArgument = 0, arguments = 0;
   Extent extent;
 };
 
 struct Syntax {
   std::vector<DeclarationSyntax> declarations;
   std::vector<ConstraintSyntax> constraints;
+  std::vector<Word> arguments;  // of all constraints, one behind the other
   std::vector<Token> outputs;
   std::vector<Token> broken;  // names whose declaration could not be read
+
+  std::span<const Word> ArgumentsOf(const ConstraintSyntax& constraint) const {
+    return std::span(arguments).subspan(constraint.firstArgument, constraint.arguments);
+  }
 };
 
 Syntax Parse(const Source& source, Diagnostics& diagnostics);

@@ -121,22 +121,24 @@ void TextReport::Called(const RawCall& call) {
 }
 
 std::string TextReport::Result(const Store& store, const Summary& summary) const {
-  if (summary.outcome == Outcome::StepLimit) return "step limit reached";
-  if (store.HasFailed() || summary.outcome == Outcome::Contradiction) {
+  std::string solutions = Counted(summary.solutions, "solution");
+  if (summary.outcome == Outcome::StepLimit) {
+    return "step limit reached" + (summary.searched ? " after " + solutions : "");
+  }
+  if (store.HasFailed()) {
     return fmt::format("contradiction at {}: {} leaves nothing for {}",
                        mNames.PlaceOfConstraint(store.FailedConstraint()),
                        mNames.OfConstraint(store.FailedConstraint()), mNames.OfVariable(store.Failed()));
   }
+  if (summary.outcome == Outcome::Contradiction) return "contradiction: no solution";
   if (!summary.searched) return "settled";
-  std::string text = Counted(summary.solutions, "solution");
-  if (!summary.complete) return text + ", there may be more";
-  if (summary.solutions != 0) text = summary.solutions == 1 ? "the only solution" : "all " + text;
-  if (summary.solutions == 0 && summary.open == 0) text = "contradiction: no solution";
-  return text;
+  if (!summary.complete) return solutions + ", there may be more";
+  if (summary.solutions == 0) return solutions;
+  return summary.solutions == 1 ? "the only solution" : "all " + solutions;
 }
 
 void TextReport::Finish(const Store& store, const Summary& summary) {
-  if (summary.searched && summary.complete && summary.outcome == Outcome::Settled) mResults << "==========\n";
+  if (summary.searched && summary.complete) mResults << "==========\n";
   mResults.flush();
   if (mStyle.quiet) return;
   const Paint paint(mStyle.remarkColour);
@@ -144,8 +146,7 @@ void TextReport::Finish(const Store& store, const Summary& summary) {
     mRemarks << fmt::format("{} left out: {} stays unknown in {}\n", Counted(summary.open, "assignment"),
                             mNames.OfVariable(summary.openVariable), summary.open == 1 ? "it" : "them");
   }
-  const bool good =
-      summary.outcome == Outcome::Settled && !(summary.searched && summary.complete && summary.solutions == 0);
+  const bool good = summary.outcome == Outcome::Settled;
   mRemarks << fmt::format("{}; {}, {}, {} in {:.1f} ms\n",
                           paint(good ? Style::Known : Style::Error, Result(store, summary)),
                           Counted(mModel.constraints.size(), "constraint"), Counted(store.Calls(), "call"),

@@ -108,6 +108,7 @@ std::optional<std::vector<Answer>> Truth::Invert(const Kind& kind, int position,
   const Exact& result = values[kind.Inputs()];
   const Exact& other = values[kind.Inputs() == 2 ? 1 - position : 0];
   std::vector<Answer> proposals;
+  proposals.reserve(2);
   switch (kind.meaning) {
     case Meaning::Concatenation:
       if (*result.text == GreatestText()) return std::nullopt;  // whatever is too long gives it
@@ -128,6 +129,7 @@ std::optional<std::vector<Answer>> Truth::Invert(const Kind& kind, int position,
   }
   Propose(kind, position, values, proposals);
   std::vector<Answer> found;
+  found.reserve(proposals.size());
   for (Answer& proposal : proposals) {
     const bool again = std::find(found.begin(), found.end(), proposal) != found.end();
     if (!again && Gives(kind, position, proposal, values)) found.push_back(std::move(proposal));

@@ -85,6 +85,7 @@ class Check {
     const zornet::Outcome outcome = search.Run(1'000'000, [&] {
       const naive::Assignment assignment = Current(solved);
       EXPECT_TRUE(found.insert(assignment).second) << mText << "found twice:\n" << Describe(assignment);
+      return true;
     });
     ASSERT_EQ(outcome, zornet::Outcome::Settled) << mText;
     for (const naive::Assignment& assignment : found) ASSERT_NO_FATAL_FAILURE(CheckHolds(assignment));

@@ -63,6 +63,8 @@ TEST(Program, PrintsWhatTheExamplesExpect) {
   EXPECT_GE(models, 16);
 }
 
+const char kMany[] = "var 0..999: a; var 0..999: b; var 0..999: c;";  // more solutions than anybody waits for
+
 TEST(Program, ExitCodes) {
   EXPECT_EQ(Zornet(Example("hello") + " 2>&1").code, 0);
   EXPECT_EQ(Zornet(Quoted(kExamples / "hello") + " 2>&1").code, 0);
@@ -81,7 +83,35 @@ TEST(Program, ExitCodes) {
   EXPECT_EQ(RunModel("var x;", "2>&1").code, 3);
   EXPECT_EQ(Zornet("--step-limit 1 " + Example("hello") + " 2>&1").code, 5);
   EXPECT_EQ(Zornet("--help 2>&1").code, 0);
+  for (const char* arguments : {"", "--help", "--json-stream", "--solutions 1000000000"})
+    EXPECT_EQ(RunModel(kMany, std::string(arguments) + " 2>/dev/null >/dev/full").code, 2) << arguments;
+  EXPECT_EQ(Zornet(Example("hello") + " 2>/dev/null >&-").code, 2);
   EXPECT_EQ(Zornet("--version").code, 0);
+}
+
+TEST(Program, NumbersAreWholeAndNotNegative) {
+  for (const char* option : {"--budget -1", "--step-limit=-5", "--solutions -1", "--solutions 0", "--budget 1e3"}) {
+    const Ran ran = Zornet(option + (" " + Example("hello")) + " 2>&1");
+    EXPECT_EQ(ran.code, 2) << option;
+    EXPECT_NE(ran.out.find(": expected a whole number from "), std::string::npos) << ran.out;
+  }
+}
+
+TEST(Program, ReadersThatEndEarly) {
+  const fs::path folder = fs::path(testing::TempDir()) / "zornet-dot";
+  fs::create_directories(folder);
+  std::ofstream(folder / "many.szn") << kMany;
+  EXPECT_EQ(Zornet("-q --solutions 1000000000 " + Quoted(folder / "many.szn") + " | head -1").out, "a = 0\n");
+
+  std::ofstream(folder / "dot") << "#!/bin/sh\nexit 1\n";
+  fs::permissions(folder / "dot", fs::perms::owner_all);
+  std::string large;
+  for (int i = 0; i < 2000; ++i) large += "var string: v" + std::to_string(i) + ";\n";
+  const std::string start = "-h >/dev/null; PATH=" + Quoted(folder) + ":\"$PATH\" '" + kProgram + "' ";
+  const Ran drawn = RunModel(large, start + "-q --svg /dev/null 2>&1 >/dev/null");
+  EXPECT_EQ(drawn.code, 2);
+  EXPECT_EQ(drawn.out, "zornet: error: /dev/null: dot could not draw it\n");
+  fs::remove_all(folder);
 }
 
 // A copy of the program in a folder of its own finds no module, unless it is told where to look.
@@ -114,6 +144,34 @@ TEST(Program, ExplainTellsTheChainAndNothingElse) {
             "c = \"X!\"\nc is \"X!\", since\n  <stdin>:1: a was declared as \"x\"\n"
             "  <stdin>:3: str_upper(a, b)  b: Any -> \"X\" (CalcUpperValue)\n"
             "  <stdin>:5: str_concat(b, \"!\", c)  c: Any -> \"X!\" (CalcConcatenation)\n");
+}
+
+// Whether a contradiction shows before the first choice or behind the last.
+TEST(Program, SearchesEndInOneWay) {
+  for (const char* model : {"var {\"a\"}: x; var {\"a\"}: y; constraint str_ne(x, y);",
+                            "var {\"a\", \"b\"}: x; var {\"a\", \"b\"}: y; var {\"a\", \"b\"}: z;"
+                            "constraint str_ne(x, y); constraint str_ne(y, z); constraint str_ne(x, z);"}) {
+    const Ran text = RunModel(model, "--solutions 5 2>/dev/null");
+    EXPECT_EQ(text.out, "==========\n");
+    EXPECT_EQ(text.code, 1);
+    std::string last = RunModel(model, "--json-stream --solutions 5").out;
+    last.erase(0, last.rfind("{\"event\":\"summary\""));
+    const auto summary = nlohmann::json::parse(last);
+    EXPECT_EQ(summary["outcome"], "contradiction");
+    EXPECT_EQ(summary["solutions"], 0);
+    EXPECT_EQ(summary["complete"], true);
+  }
+  const Ran stopped = RunModel("var {\"a\", \"b\"}: x; var {\"a\", \"b\", \"c\"}: y; constraint str_ne(x, y);",
+                               "--solutions 9 --step-limit 4 2>&1");
+  EXPECT_NE(stopped.out.find("step limit reached after 2 solutions;"), std::string::npos) << stopped.out;
+  EXPECT_EQ(stopped.code, 5);
+}
+
+TEST(Program, ChoicesExplainNothing) {
+  EXPECT_EQ(RunModel("var {\"a\", \"b\", \"c\"}: x;\nconstraint str_ne(x, \"c\");", "-q --solutions 1 --explain x").out,
+            "x = \"a\"\n----------\nx is { \"a\", \"b\" }, since\n"
+            "  <stdin>:1: x was declared as { \"a\", \"b\", \"c\" }\n"
+            "  <stdin>:2: str_ne(x, \"c\")  x: { \"a\", \"b\", \"c\" } -> { \"a\", \"b\" } (CalcUnequalValue)\n");
 }
 
 TEST(Program, RawCallsAnswerAsTheModuleDoes) {
@@ -155,6 +213,7 @@ TEST(Program, JsonStream) {
   const auto error = nlohmann::json::parse(RunModel("var x;", "--json-stream").out);
   EXPECT_EQ(error["event"], "error");
   EXPECT_EQ(error["column"], 5);
+  EXPECT_EQ(error["length"], 1);
 }
 
 TEST(Program, Colours) {

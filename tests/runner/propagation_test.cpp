@@ -4,6 +4,7 @@
 #include <fmt/core.h>
 #include <gtest/gtest.h>
 
+#include "runner/progress.h"
 #include "runner/search.h"
 #include "tests/runner/support.h"
 
@@ -76,6 +77,8 @@ const Row kNetworks[] = {
    "Nil, \"a\""},
   {"one variable at two places is one text",
    "var {\"a\", \"b\"}: x; var {\"ab\", \"bb\"}: z; constraint str_concat(x, x, z);", "\"b\", \"bb\""},
+  {"nothing is below the least text", "var string: x; constraint str_lt(x, \"\");", "Nil"},
+  {"one text is its own successor", "var string: x; constraint str_next(x, x);", "Max"},
   {"below itself", "var string: x; constraint str_lt(x, x);", "Nil"},
   {"changes travel along a chain, against the order of the file",
    "var set string: a; var set string: b; var {\"x\", \"y\"}: c;"
@@ -163,18 +166,48 @@ TEST(Search, TellsWhatCannotBeLabelled) {
   Solved solved("var string: x; var {\"a\", \"b\"}: y;");
   ASSERT_EQ(solved.Settle(), zornet::Outcome::Settled);
   zornet::Search search(solved.store, solved.propagation);
-  search.Run(10, [] { ADD_FAILURE() << "a full assignment"; });
+  search.Run(10, [] {
+    ADD_FAILURE() << "a full assignment";
+    return true;
+  });
   EXPECT_EQ(search.Open(), 2u);
   EXPECT_EQ(search.OpenVariable(), solved.Find("x"));
 }
 
-TEST(Search, StopsAtTheLimitAndLeavesNoTrace) {
-  Solved solved("var {\"a\", \"b\"}: x; var {\"a\", \"b\"}: y;");
-  ASSERT_EQ(solved.Settle(), zornet::Outcome::Settled);
-  zornet::Search some(solved.store, solved.propagation);
-  some.Run(3, [] {});
-  EXPECT_EQ(some.Found(), 3u);
-  EXPECT_FALSE(some.IsComplete());
+TEST(Search, StopsInTimeAndLeavesNoTrace) {
+  struct {
+    const char* why;
+    std::uint64_t limit, wanted, steps, found;
+    zornet::Outcome outcome;
+  } const rows[] = {
+      {"at the limit", 3, 9, 1000, 3, zornet::Outcome::Settled},
+      {"when no other is wanted", 9, 2, 1000, 2, zornet::Outcome::Settled},
+      {"at the limit of steps", 9, 9, 3, 1, zornet::Outcome::StepLimit},
+  };
+  for (const auto& row : rows) {
+    Solved solved("var {\"a\", \"b\"}: x; var {\"b\", \"c\"}: y; constraint str_ne(x, y);", {65536, row.steps});
+    solved.Settle();
+    zornet::Search search(solved.store, solved.propagation);
+    EXPECT_EQ(search.Run(row.limit, [&] { return search.Found() < row.wanted; }), row.outcome) << row.why;
+    EXPECT_EQ(search.Found(), row.found) << row.why;
+    EXPECT_FALSE(search.IsComplete()) << row.why;
+    EXPECT_EQ(solved.Show("x") + solved.Show("y"), "{ \"a\", \"b\" }{ \"b\", \"c\" }") << row.why;
+  }
+}
+
+TEST(Progress, IsToldOnceInAWhile) {
+  testing::internal::CaptureStderr();
+  std::string model = "var string: x0 = \"a\";";
+  for (int i = 1; i <= 600; ++i) model += fmt::format("var string: x{}; constraint str_eq(x{}, x{});", i, i - 1, i);
+  Solved solved(model);
+  {
+    zornet::ProgressLine shown(true, {}), silent(false, {}), patient(true);
+    solved.propagation.OnProgress([&](std::uint64_t steps, std::size_t waiting) {
+      for (zornet::ProgressLine* line : {&shown, &silent, &patient}) line->Show(steps, waiting);
+    });
+    solved.Settle();
+  }
+  EXPECT_EQ(testing::internal::GetCapturedStderr(), "\r\x1b[K0.0 s: 256 passes, 345 constraints waiting\r\x1b[K");
 }
 
 }  // namespace

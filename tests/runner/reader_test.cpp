@@ -1,6 +1,7 @@
 // What is told of broken models: place, caret, note.
 #include "runner/reader.h"
 
+#include <fmt/core.h>
 #include <gtest/gtest.h>
 
 namespace {
@@ -24,6 +25,12 @@ const Row kBroken[] = {
   {"a name that is like no other gets no guess",
    "var string: x;\noutput something;\n",
    "2:8: error: 'something' is not declared\noutput something;\n       ^~~~~~~~~\n"},
+  {"nor does a name too long for a slip",
+   "var string: aaaaaaaaaabbbbbbbbbbccccccccccddddddddddeeeeeeeeeeffffffffffggggg;\n"
+   "output aaaaaaaaaabbbbbbbbbbccccccccccddddddddddeeeeeeeeeeffffffffffgggg_;\n",
+   "2:8: error: 'aaaaaaaaaabbbbbbbbbbccccccccccddddddddddeeeeeeeeeeffffffffffgggg_' is not declared\n"
+   "output aaaaaaaaaabbbbbbbbbbccccccccccddddddddddeeeeeeeeeeffffffffffgggg_;\n"
+   "       ^~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~~\n"},
   {"a misspelt constraint",
    "constraint str_lenght(\"a\", 1);\n",
    "1:12: error: there is no constraint 'str_lenght'; did you mean 'str_length'?\n"
@@ -107,6 +114,10 @@ const Row kBroken[] = {
    "1:18: error: '\xC3\xA9' is no character of a text: those are the ones from space to z, without {|}~\n"
    "var string: x = \"\xC3\xA9\"; % \xC3\xA9\xC3\xA9\n                 ^\n"
    "2:13: error: '\xC3\xA9' has no meaning here\nvar string: \xC3\xA9;\n            ^\n"},
+  {"control characters and stray bytes do not reach the terminal",
+   "var string: x;\x1b\x9B% \xC2\x9B\x7F\n",
+   "1:15: error: character 27 has no meaning here\nvar string: x;??% ??\n              ^\n"
+   "1:16: error: '?' has no meaning here\nvar string: x;??% ??\n               ^\n"},
   {"a tab in the line stays one above the caret",
    "\tconstraint\tstr_eq(x, \"a\");\n",
    "1:20: error: 'x' is not declared\n\tconstraint\tstr_eq(x, \"a\");\n\t          \t       ^\n"},
@@ -160,11 +171,51 @@ TEST(Reader, LongestText) {
 
 TEST(Reader, StopsAfterTwentyErrors) {
   std::string model;
-  for (int i = 0; i < 30; ++i) model += "nonsense;\n";
-  const std::string told = Told(model);
-  EXPECT_NE(told.find("20:1: error"), std::string::npos);
-  EXPECT_EQ(told.find("21:1: error"), std::string::npos);
-  EXPECT_TRUE(told.ends_with("stopped after 20 errors\n"));
+  for (int i = 0; i < 20; ++i) model += "nonsense;\n";
+  const std::string all = Told(model), told = Told(model + "output x;");
+  EXPECT_TRUE(all.ends_with("20:1: error: expected 'var', 'constraint' or 'output'\nnonsense;\n^~~~~~~~\n"));
+  EXPECT_EQ(told, all + " stopped after 20 errors\n");
+}
+
+// Each takes half a minute and more where work grows with the square of the model.
+TEST(Reader, LongBrokenModels) {
+  std::string names, uses, items = "x ";
+  for (int i = 0; i < 3000; ++i) {
+    names += fmt::format("var string: name{}; ", i);
+    uses += fmt::format("constraint str_eq(\"\", nane{}); ", i);
+    items += "var var var var var var var var ";
+  }
+  EXPECT_TRUE(Told(names + uses).ends_with("stopped after 20 errors\n"));
+  EXPECT_TRUE(Told(items).starts_with("1:1: error: expected 'var'"));
+  EXPECT_TRUE(Told("output " + std::string(300000, 'n') + ";" + names).find("is not declared\n") != std::string::npos);
+}
+
+// Blanks, what is marked, and a comment behind it.
+TEST(Reader, ShowsTheNeighbourhoodInALongLine) {
+  struct {
+    const char* why;
+    std::size_t before, marked, behind;
+    const char* left;
+    std::size_t blanks, shown, comment;
+    const char* right;
+  } const rows[] = {
+      // clang-format off
+      {"all of a line that fits",      60,   3,  57, "",    60,   3,  57, ""},
+      {"cut at both ends",            200,   3, 200, "...", 40,   3,  77, "..."},
+      {"cut behind the mark",          10,   3, 300, "",    10,   3, 107, "..."},
+      {"cut ahead of it",             300,   3,  10, "...", 107,  3,  10, ""},
+      {"cut in a mark that is long",    0, 500,   0, "",     0, 120,   0, "..."},
+      // clang-format on
+  };
+  for (const auto& row : rows) {
+    const auto repeat = [](std::size_t times, char c) { return std::string(times, c); };
+    const std::string told = Told(repeat(row.before, ' ') + repeat(row.marked, 'q') + repeat(row.behind, '%'));
+    EXPECT_EQ(told.substr(told.find('\n') + 1), row.left + repeat(row.blanks, ' ') + repeat(row.shown, 'q') +
+                                                    repeat(row.comment, '%') + row.right + '\n' +
+                                                    repeat(std::string_view(row.left).size() + row.blanks, ' ') + '^' +
+                                                    repeat(row.shown - 1, '~') + '\n')
+        << row.why;
+  }
 }
 
 // Whatever the bytes: it ends, and every place lies in the file.

@@ -1,0 +1,99 @@
+#!/usr/bin/env python3
+"""Runs what a page shows: check.py ROOT BUILD PAGE. Its fenced blocks are, by their kind,
+
+console      commands behind `$ `, each with what it prints below, first on stdout, then on stderr. A line of three dots
+             stands for any lines. Times are not compared.
+szn, sh      a file for the commands, where a comment at the top of the block is its name
+cpp, cmake   a piece of a source file, word for word
+
+Commands run in a folder of their own beside the examples and docs: `zornet` and `./dev run` are the built program,
+`c++` compiles with the flags of the build, and the tree that the install tests made is in $PREFIX.
+"""
+import os
+import pathlib
+import re
+import shutil
+import subprocess
+import sys
+
+root, build = (pathlib.Path(argument).resolve() for argument in sys.argv[1:3])
+page = root / sys.argv[3]
+folder, prefix = build / 'docs-test' / page.stem, build / 'install-test/tree'
+failures = []
+
+shutil.rmtree(folder, ignore_errors=True)
+(folder / 'bin').mkdir(parents=True)
+for name, command in (('bin/zornet', f'exec {build}/bin/zornet "$@"'), ('bin/c++', 'exec $CXX $CXXFLAGS "$@"'),
+                      ('dev', '[ "$1" = run ] && shift && exec zornet "${@:-examples/hello.szn}"')):
+    (folder / name).write_text(f'#!/usr/bin/env bash\n{command}\n')
+    (folder / name).chmod(0o755)
+for name in ('examples', 'docs'):
+    (folder / name).symlink_to(root / name)
+path = f'{folder}/bin:{os.environ["PATH"]}'
+os.environ.update(PATH=path, PREFIX=str(prefix), PKG_CONFIG_PATH=f'{prefix}/lib/pkgconfig')
+
+
+def without_times(text):
+    return re.sub(r'(?<="milliseconds":)[\d.e-]+|[\d.]+(?= ms\b)', '0.1', text).rstrip('\n')
+
+
+def run(command, expected):
+    done = subprocess.run(['bash', '-c', command], cwd=folder, capture_output=True, text=True, timeout=120)
+    printed = without_times(done.stdout + done.stderr)
+    pattern = '(?s:.*?)'.join(map(re.escape, re.split(r'(?m)^\.\.\.$', without_times(expected))))
+    if not re.fullmatch(pattern, printed):
+        failures.append(f'$ {command}\n--- the page says\n{expected}--- it prints\n{printed}\n')
+
+
+def check_block(kind, text):
+    if kind == 'console':
+        for command, expected in re.findall(r'^\$ (.*)\n((?:(?!\$ ).*\n)*)', text, re.M):
+            run(command, expected)
+    elif kind in ('szn', 'sh'):
+        for name in re.findall(r'^[%#] ([\w.-]+)$', text, re.M)[:1]:
+            (folder / name).write_text(text)
+    elif kind in ('cpp', 'cmake'):
+        files = [f for place in ('docs', 'module', 'single', 'enum', 'tests') for f in (root / place).rglob('*.*')]
+        if not any(text in file.read_text() for file in files if file.suffix in ('.cpp', '.h', '.txt')):
+            failures.append(f'This stands in no source file:\n{text}')
+    else:
+        failures.append(f'A block of an unknown kind: {kind}')
+
+
+def check_references(text):
+    """Links lead to files, commands are in the usage, and a filter of tests finds some."""
+    usage = (root / 'dev').read_text()
+    missing = [link for link in re.findall(r'\]\(([\w./-]+)[)#]', text) if not (page.parent / link).exists()]
+    missing += [command for command in re.findall(r'\./dev [a-z-]+', text) if f'{command} ' not in usage]
+    for name in re.findall(r'ctest --preset dev -R (\S+?)`', text):
+        if 'Total Tests: 0' in subprocess.check_output(['ctest', '-N', '-R', name], cwd=build, text=True):
+            missing.append(name)
+    failures.extend(f'There is no {what}' for what in missing)
+
+
+def check_table(text):
+    """A row for every operation of the virtual table, in its order."""
+    table = (root / 'tests/module/table_test.cpp').read_text()
+    slots, rows = re.findall(r'\b(?:S|S_OF)\((?!name)(\w+)|\{"(Set\w+)"', table), re.findall(r'^\| `(\w+)', text, re.M)
+    if list(dict.fromkeys(a or b for a, b in slots)) != list(dict.fromkeys(rows)):
+        failures.append('The rows differ from the virtual table or its order')
+
+
+def check_picture():
+    """What is in the picture of the first example; where it lies is up to fonts and Graphviz."""
+    run('zornet -q --svg hello.svg examples/hello.szn', '...')
+    parts = re.compile(r'<(?:title|text)[^>]*>([^<]*)|(?:fill|stroke)="(#\w+)"')
+    drawn, shown = (parts.findall((where / 'hello.svg').read_text()) for where in (folder, root / 'docs'))
+    if drawn != shown:
+        failures.append('docs/hello.svg is not the picture of examples/hello.szn')
+
+
+content = page.read_text()
+for block in re.findall(r'^```(\w*)\n(.*?)^```$', content, re.M | re.S):
+    check_block(*block)
+check_references(content)
+if page.name == 'values.md':
+    check_table(content)
+if 'docs/hello.svg' in content:
+    check_picture()
+sys.exit('\n'.join(failures) or 0)

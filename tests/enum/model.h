@@ -272,17 +272,6 @@ inline int CalcFirstInverseMinValue(Set z, Set& x, Set y) {
   if (IsAny(x)) return attains ? (Copy(x, z), 1) : 0;
   return !attains && Upper(x) > Upper(y) ? ToNil(x) : 0;
 }
-inline std::string Next(const std::string& s) {
-  if (s.size() < 255) return s + ' ';
-  const std::size_t i = s.find_last_not_of('z');
-  return i == std::string::npos ? s : s.substr(0, i) + static_cast<char>(s[i] + 1);
-}
-inline std::string Previous(const std::string& s) {
-  if (s == " ") return "";
-  std::string u = s.substr(0, s.size() - 1);
-  if (s.back() != ' ') u += static_cast<char>(s.back() - 1);
-  return u + std::string(u.size() < 255 ? 255 - u.size() : 0, 'z');
-}
 inline int CalcNextValue(Set& z, Set x) {
   if (IsAny(x)) return 0;
   if (IsMax(x)) return ToMax(z);
@@ -298,7 +287,7 @@ inline int CalcInverseNextValue(Set z, Set& x) {
   if (IsMax(z)) return x = Set{kMaxTag, {std::string(254, 'z') + 'y'}}, 1;
   Set previous{kExact, {}};
   for (const std::string& text : z.texts)
-    if (!text.empty()) Insert(previous, Previous(text));
+    if (!text.empty()) Insert(previous, text == kLeastText ? "" : Previous(text));
   return previous.texts.empty() ? ToNil(x) : (x = previous, 1);
 }
 
@@ -315,45 +304,41 @@ inline int CalcConcatenation(Set& z, Set x, Set y) {
 inline int CalcFirstInverseConcatenation(Set, Set&, Set) { return 0; }
 inline int CalcSecondInverseConcatenation(Set, Set, Set&) { return 0; }
 
-inline std::string Folded(std::string text, char first, char last) {
-  for (char& c : text) c = c >= first && c <= last ? static_cast<char>(c ^ 0x20) : c;
-  return text;
-}
-inline int Settle(Set& z, const Set& x, char first, char last) {
+using Folding = std::string (*)(std::string);
+inline int Settle(Set& z, const Set& x, Folding fold) {
   Set folds{kNilTag, {}};
-  for (const std::string& text : x.texts) InsertExactValue(folds, Folded(text, first, last));
+  for (const std::string& text : x.texts) InsertExactValue(folds, fold(text));
   return Intersect(z, folds);
 }
-inline int Settle(Set& z, const Str& x, char first, char last) {
-  const std::string fold = Folded(x.text, first, last);
+inline int Settle(Set& z, const Str& x, Folding fold) {
   if (IsMax(z)) return ToNil(z);
-  if (IsAny(z)) return z = Set{kExact, {fold}}, 1;
-  return z.texts.front() == fold ? 0 : ToNil(z);
+  if (IsAny(z)) return z = Set{kExact, {fold(x.text)}}, 1;
+  return z.texts.front() == fold(x.text) ? 0 : ToNil(z);
 }
-inline int Fold(Set& z, const auto& x, char first, char last) {
+inline int Fold(Set& z, const auto& x, Folding fold) {
   if (IsNil(z) || IsAny(x)) return 0;
   if (IsNil(x)) return ToNil(z);
   if (IsMin(x)) return IsMin(z) ? 0 : IsAny(z) ? ToMin(z) : ToNil(z);
   if (IsMax(x)) return IsMax(z) ? 0 : IsAny(z) ? ToMax(z) : ToNil(z);
-  return Settle(z, x, first, last);
+  return Settle(z, x, fold);
 }
 inline std::vector<std::string> TextsOf(const Set& v) { return v.texts; }
 inline std::vector<std::string> TextsOf(const Str& v) { return {v.text}; }
-inline int InverseFold(const Set& z, auto& x, char first, char last) {
+inline int InverseFold(const Set& z, auto& x, Folding fold) {
   if (IsAny(z)) return 0;
   if ((IsNil(z) && IsNil(x)) || (IsMin(z) && IsMin(x)) || (IsMax(z) && IsMax(x))) return 0;
   if (IsNil(z) || IsMin(z) || IsMax(z) || IsNil(x) || IsMin(x) || IsMax(x)) return ToNil(x);
   std::vector<std::string> folds = IsAny(x) ? z.texts : TextsOf(x);
-  for (std::string& text : folds) text = Folded(text, first, last);
+  for (std::string& text : folds) text = fold(text);
   if (!IsAny(x)) return folds == z.texts ? 0 : ToNil(x);
   std::size_t own = 0;
   for (std::size_t i = 0; i < folds.size(); ++i) own += folds[i] == z.texts[i];
   return z.tag == kExact && own == 0 ? ToNil(x) : 0;
 }
-inline int CalcLowerValue(Set& z, auto x) { return Fold(z, x, 'A', 'Z'); }
-inline int CalcUpperValue(Set& z, auto x) { return Fold(z, x, 'a', 'z'); }
-inline int CalcInverseLowerValue(Set z, auto& x) { return InverseFold(z, x, 'A', 'Z'); }
-inline int CalcInverseUpperValue(Set z, auto& x) { return InverseFold(z, x, 'a', 'z'); }
+inline int CalcLowerValue(Set& z, auto x) { return Fold(z, x, Folded<'A', 'Z'>); }
+inline int CalcUpperValue(Set& z, auto x) { return Fold(z, x, Folded<'a', 'z'>); }
+inline int CalcInverseLowerValue(Set z, auto& x) { return InverseFold(z, x, Folded<'A', 'Z'>); }
+inline int CalcInverseUpperValue(Set z, auto& x) { return InverseFold(z, x, Folded<'a', 'z'>); }
 
 // What an entry tests before it goes to the typed form.
 template <class Target, class Body, class... Sources>

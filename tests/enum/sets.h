@@ -2,11 +2,9 @@
 //   Nil  Any  Max  Min    the states that need no text, and "" alone
 //   {a,b}  {a,b,Max}      the texts in any order, and the greatest beside them; {,a} begins with ""
 //   Any{a}  Nil{a}        what Insert leaves of such a value
-//   a*254z                254 times a, then z
 #pragma once
 
 #include <algorithm>
-#include <cctype>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -16,21 +14,9 @@
 
 namespace zor::test {
 
-inline std::string Unpacked(std::string_view text) {
-  std::string plain;
-  while (!text.empty()) {
-    const std::size_t end = std::min(text.find('*'), text.size());
-    plain += text.substr(0, end);
-    text.remove_prefix(std::min(end + 1, text.size()));
-    int count = 0;
-    for (; !text.empty() && std::isdigit(text[0]) != 0; text.remove_prefix(1)) count = 10 * count + text[0] - '0';
-    if (count > 0) plain.append(count - 1, plain.back());
-  }
-  return plain;
-}
-
 struct Set {
   using Held = struct HeldSet;
+  static Set Parse(const char* notation) { return notation; }
   Tag tag = kAnyTag;
   std::vector<std::string> texts;
 
@@ -108,39 +94,5 @@ struct HeldSet {
   ZORVaDoString& Abstract() { return value; }
   ZORVadEnumString value;
 };
-
-using SetRow = Row<0, Set, Set>;      // why, {z, x}, answer, z afterwards, second answer
-using SetInverse = Row<1, Set, Set>;  // x afterwards
-using SingleRow = Row<0, Set, Str>;   // x is a single string
-using SingleInverse = Row<1, Set, Str>;
-using SetsRow = Row<0, Set, Set, Set>;      // z, x, y
-using SetsInverse = Row<1, Set, Set, Set>;  // x afterwards
-
-// An operation on a value and a text, in one call.
-struct TextRow {
-  const char* why;
-  Set z;
-  const char* text;
-  int answer;
-  Set after;
-};
-
-template <std::size_t kCount, class Operation>
-void CheckTexts(const TextRow (&rows)[kCount], Operation operation) {
-  for (const auto& [why, z, text, answer, after] : rows) {
-    HeldSet held(z);
-    const ZORString given = Packed(Unpacked(text));
-    EXPECT_EQ(operation(held.value, given), answer) << why;
-    EXPECT_EQ(held.Now(), after) << why;
-  }
-}
-
-// An operation by its name in one form alone, where the forms differ.
-#define ZOR_ENTRY(Name) \
-  [](auto& target, auto&... operands) { return ZORVaDoString::StaticCast(&target)->Name(AsString(operands)...); }
-#define ZOR_TYPED(Name) [](auto& target, auto&... operands) { return AsSet(target).Name(AsSet(operands)...); }
-
-inline ZORVaDoString& AsString(ZORVaDoString& value) { return value; }
-inline ZORVadEnumString& AsSet(ZORVaDoString& value) { return *ZORVadEnumString::StaticCast(&value); }
 
 }  // namespace zor::test

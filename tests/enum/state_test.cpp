@@ -1,4 +1,4 @@
-// Construction, copies and membership of sets of texts.
+// Construction and copies of sets of texts, and what tells them nothing.
 #include "tests/enum/sets.h"
 
 namespace zor::test {
@@ -57,61 +57,43 @@ TEST(EnumState, Sizes) {
   }
 }
 
-// clang-format off
-const SetRow kAppend[] = {  // why, {z, x}, answer, z afterwards, second answer
-  {"a text that is there",        {"{a,b}", "{b,c}"}, 0, "{a,b,c}", 0},
-  {"all are new",                 {"{b}", "{a,c}"},   1, "{a,b,c}", 0},
-  {"no text, whatever the state", {"{a}", "Max"},     0, "{a}", 0},
-  {"a full value lists",          {"Max", "{a}"},     1, "{a,Max}", 0},
-};
-const SetRow kCopy[] = {
-  {"texts",                       {"{z,Max}", "{a}"}, 1, "{a}", 1},
-  {"a full value brings none",    {"{a}", "Max"},     0, "Max", 0},
-};
-// clang-format on
-
-TEST(EnumState, Append) {
-  CheckRows(kAppend, ZOR_TYPED(Append));
-  CheckRows(kCopy, ZOR_TYPED(Copy));
-  HeldSet held("{a}");
-  EXPECT_EQ(held.value.Append(ZORISVectorImp_String()), 1) << "an empty vector";
-  EXPECT_EQ(HeldSet("Max").value.Assign(HeldSet("Max").value), 1);
+// The three selections leave the value as it was, any other, like a missing or a single operand, makes it Nil.
+TEST(EnumState, Bisect) {
+  for (const int selection : {-1, 0, 1, 2, 3, 4}) {
+    for (const char* z : {"{a,b}", "Any", "Nil", "Max"}) {
+      HeldSet whole(z), alone(z), rest("{c}");
+      HeldSingle single(Text("c"));
+      const auto selected = static_cast<ZORVaDoAny::ValueSelection>(selection);
+      whole.Abstract().Bisect(rest.value, selected);
+      alone.Abstract().Bisect(single.value, selected);
+      EXPECT_EQ(whole.Now(), selection >= 0 && selection <= 3 ? Set(z) : Set("Nil")) << z << selection;
+      EXPECT_EQ(alone.Now(), Set("Nil")) << z << selection;
+      whole.Abstract().Bisect(Missing<ZORVaDoObject>(), selected);
+      EXPECT_EQ(whole.Now(), Set("Nil")) << z << selection;
+      EXPECT_TRUE(rest.Now() == "{c}" && single.Now() == Text("c"));
+    }
+  }
 }
 
-// clang-format off
-const TextRow kContains[] = {  // why, z, text, answer, z afterwards
-  {"the position, from 1",                "{a,b}",   "b",     2,  "{a,b}"},
-  {"none",                                "{a,c}",   "b",     0,  "{a,c}"},
-  {"a full value",                        "Max",     "b",     -1, "Max"},
-  {"the greatest is held by the state",   "{a,Max}", "z*255", 0,  "{a,Max}"},
-  {"no test of an open value's texts",    "Any{a}",  "a",     0,  "Any{a}"},
-};
-const TextRow kInsert[] = {
-  {"in order",                            "{a,c}",   "b",     1,  "{a,b,c}"},
-  {"listed",                              "{a,c}",   "c",     0,  "{a,c}"},
-  {"min is no longer",                    "Min",     "a",     1,  "{,a}"},
-  {"full no longer, the max stays",       "Max",     "a",     1,  "{a,Max}"},
-};
-const TextRow kCutLower[] = {
-  {"the bound stays",                     "{a,b,c}", "b",     2,  "{b,c}"},
-  {"it is not added",                     "{a,c}",   "b",     1,  "{c}"},
-  {"above all texts",                     "{a,c}",   "d",     0,  "Nil"},
-  {"the max remains",                     "{a,Max}", "d",     0,  "Max"},
-};
-const TextRow kCutUpper[] = {
-  {"the bound stays",                     "{a,b,c}", "b",     2,  "{a,b}"},
-  {"it is not added",                     "{a,b,c}", "bb",    2,  "{a,b}"},
-  {"the max goes",                        "{b,d,Max}", "c",   1,  "{b}"},
-  {"but for the greatest bound",          "{a,Max}", "z*255", 1,  "{a,Max}"},
-  {"below all texts",                     "{b}",     "a",     0,  "Nil"},
-};
-// clang-format on
-
-TEST(EnumState, Membership) {
-  CheckTexts(kContains, ZOR_OPERATION(Contains));
-  CheckTexts(kInsert, ZOR_OPERATION(Insert));
-  CheckTexts(kCutLower, ZOR_OPERATION(CutLower));
-  CheckTexts(kCutUpper, ZOR_OPERATION(CutUpper));
+// Neither form of these tells anything, whatever the operands.
+TEST(EnumState, SubStringsAndFormsTellNothing) {
+  for (const char* known : {"{ab}", "Nil", "Any"}) {
+    HeldSet z(known), x("{a,b}");
+    HeldInteger start(Number(0)), end(kAnyNumber);
+    const auto slices = [&](auto& value, auto& operand) {
+      EXPECT_EQ(value.CalcSubString(operand, start.value, end.value), 0);
+      EXPECT_EQ(value.CalcFirstInverseSubString(operand, start.value, end.value), 0);
+      EXPECT_EQ(value.CalcSecondInverseSubString(operand, start.value, end.value), 0);
+      EXPECT_EQ(value.CalcThirdInverseSubString(operand, start.value, end.value), 0);
+    };
+    slices(z.value, x.value);
+    for (ZORVaDoString* operand : {&x.Abstract(), &Missing<ZORVaDoString>()}) {
+      slices(z.Abstract(), *operand);
+      EXPECT_EQ(z.Abstract().CalcStringRepresentation(*operand), 0);
+      EXPECT_EQ(z.Abstract().CalcInverseStringRepresentation(*operand), 0);
+    }
+    EXPECT_TRUE(z.Now() == known && x.Now() == "{a,b}" && start.Now() == Number(0) && end.Now() == kAnyNumber);
+  }
 }
 
 }  // namespace

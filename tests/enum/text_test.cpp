@@ -1,6 +1,4 @@
 // Text and stream forms of sets of texts.
-#include <random>
-
 #include "tests/enum/sets.h"
 
 namespace zor::test {
@@ -26,23 +24,19 @@ const struct {
   {"the empty text is min",              R"("")",                   "Min",       0},
   {"one space is not",                   R"(" ")",                  "{ }",       0},
   {"a text without its end",             R"("ab)",                  "{ab}",      0},
+  {"no text after the brace",            "{",                       "Nil",       0},
+  {"nor behind the quote",               R"({ "a", ")",             "Nil",       0},
   {"in any order",                       R"({ "b", "a" })",         "{a,b}",     0},
   {"without blanks",                     R"({"a","b"}x)",           "{a,b}",     1},
-  {"with more of them",                  "\n{\t\"a\" ,\n\"b\"\r}",  "{a,b}",     0},
   {"equal texts stay",                   R"({ "a", "b", "a" })",    "{a,a,b}",   0},
   {"two empty texts are not min",        R"({ "", "" })",           "{,}",       0},
-  {"one text in braces",                 R"({ "a" })",              "{a}",       0},
   {"no text in braces",                  "{ }",                     "Nil",       0},
   {"no comma",                           R"({ "a" "b" })",          "Nil",       4},
-  {"no quote",                           R"({ "a", b })",           "Nil",       2},
   {"no max in braces",                   R"({ "a", Max })",         "Nil",       4},
   {"no end",                             R"({ "a", "b")",           "Nil",       0},
   {"a comma too many",                   R"({ "a", })",             "Nil",       0},
   {"a word",                             "Maximum",                 "Max",       4},
-  {"another",                            "Anything",                "Any",       5},
-  {"the least",                          " Min",                    "Min",       0},
   {"nil is no word",                     "Nil",                     "Nil",       0},
-  {"nor is another",                     "Mix",                     "Nil",       0},
   {"case matters, nothing is taken",     "nil",                     "Nil",       3},
   {"nothing",                            "",                        "Nil",       0},
   {"a long text is cut",                 '"' + k254 + "r\"",        {kExact, {k254}}, 2},
@@ -141,37 +135,6 @@ TEST(EnumText, HostileStreams) {
       ZORipstream in(whole.substr(0, size));
       held.Abstract().Read(in);
       EXPECT_EQ(held.Now(), Set("Nil")) << size;
-    }
-  }
-}
-
-// In order, no text without a tag that allows it, and no Exact value without texts.
-void ExpectSound(const Set& v, const std::string& from) {
-  ASSERT_TRUE(std::is_sorted(v.texts.begin(), v.texts.end())) << from;
-  ASSERT_EQ(v.texts.empty(), v.tag != kExact) << from;
-  ASSERT_TRUE(v.tag >= kExact && v.tag <= kMaxTag) << from;
-}
-
-TEST(EnumText, AnyBytes) {
-  std::mt19937 random(20);
-  const std::string pieces[] = {
-      "{", "}", "\"", "\"", "\", \"", ",", " ", "a", "b", "Max", "Min", "\n", "\xff", k254, std::string(1, '\0')};
-  HeldSet held("{x}");
-  for (int i = 0; i < 20000; ++i) {
-    std::string text;
-    for (unsigned n = random() % 12; n > 0; --n)
-      text += random() % 8 == 0 ? std::string(1, static_cast<char>(random())) : pieces[random() % std::size(pieces)];
-    if (text.empty()) continue;
-    Input(held.Abstract(), text);
-    ASSERT_NO_FATAL_FAILURE(ExpectSound(held.Now(), text));
-    ZORipstream in(text + text);
-    held.Abstract().Read(in);
-    ASSERT_NO_FATAL_FAILURE(ExpectSound(held.Now(), text));
-  }
-  for (const std::string& whole : {std::string(R"({ "b", "a" })"), std::string(R"("ab")"), std::string("Any")}) {
-    for (std::size_t size = 1; size < whole.size(); ++size) {
-      Input(held.Abstract(), whole.substr(0, size));
-      EXPECT_EQ(held.Now(), whole[0] == '"' ? Set(kExact, {whole.substr(1, size - 1)}) : Set("Nil")) << whole << size;
     }
   }
 }

@@ -70,8 +70,7 @@ TEST(BinaryStream, ReadsBackWhatWasWritten) {
   EXPECT_STREQ(in.Text().get(), "");
   EXPECT_EQ(in.Text().get(), std::string(1000, 'x'));
   EXPECT_STREQ(in.Text().get(), "");
-  EXPECT_FALSE(in.Fail());
-  EXPECT_EQ(in.Left(), 0u);
+  EXPECT_TRUE(!in.Fail() && in.Left() == 0);
 }
 
 TEST(BinaryStream, ObjectsKeepTheirReferences) {
@@ -194,28 +193,26 @@ TEST(BinaryStream, DescriptorsComeBackWithTheirParents) {
   EXPECT_FALSE(in.Fail());
 }
 
+// A descriptor by pointer, whose parent the stream goes on with.
+ZORopstream& BeginDescriptor(ZORopstream& out) {
+  out << 1;
+  out.WriteString("ZORVadEnumInteger_Descriptor");
+  out.WriteString("own");
+  return out << 0;
+}
+
 TEST(BinaryStream, ADescriptorTakesNothingButADescriptorAboveItAsParent) {
   Node node;
   ZORVadSingleInteger value;
-  for (const ZORStreamable* parent :
-       {static_cast<const ZORStreamable*>(&node), static_cast<const ZORStreamable*>(&value)}) {
+  for (const ZORStreamable* parent : std::initializer_list<const ZORStreamable*>{&node, &value}) {
     ZORopstream out;
-    out << 1;
-    out.WriteString("ZORVadEnumInteger_Descriptor");
-    out.WriteString("own");
-    out << 0 << 2;
-    out.WriteObject(parent);
+    (BeginDescriptor(out) << 2).WriteObject(parent);
     Input in(out);
-    const auto* descriptor = static_cast<ZORVaDoObjectDescriptor*>(in.ReadObjectPointer());
-    EXPECT_EQ(descriptor->GetParent(), nullptr);
+    EXPECT_EQ(static_cast<ZORVaDoObjectDescriptor*>(in.ReadObjectPointer())->GetParent(), nullptr);
     EXPECT_TRUE(in.Fail());
   }
   ZORopstream itself;
-  itself << 1;
-  itself.WriteString("ZORVadEnumInteger_Descriptor");
-  itself.WriteString("own");
-  itself << 0 << 1;
-  Input in(itself);
+  Input in(BeginDescriptor(itself) << 1);
   const auto* descriptor = static_cast<ZORVaDoObjectDescriptor*>(in.ReadObjectPointer());
   EXPECT_EQ(ZORVaDoScalar::sDescriptor->IsMatched(descriptor), 0);
 }
@@ -232,22 +229,14 @@ TEST(Registry, FindsTheLaterRecordAndForgetsTheDead) {
   EXPECT_EQ(ZORStreamableClass::Find("Other"), nullptr);
 }
 
-namespace {
-
-struct LineRow {
-  const char* why;
-  std::string text;
-  unsigned int limit;
-  std::string line;
-  std::string left;
-};
-
-const std::string kFull(254, 'x');
-
-}  // namespace
-
 TEST(TextInput, Lines) {
-  const LineRow rows[] = {
+  const std::string full(254, 'x');
+  const struct {
+    const char* why;
+    std::string text;
+    unsigned int limit;
+    std::string line, left;
+  } rows[] = {
       // why, text, limit, line, what is left
       {"the delimiter is taken", "ab\"c", 254, "ab", "c"},
       {"nothing before the delimiter", "\"c", 254, "", "c"},
@@ -255,11 +244,11 @@ TEST(TextInput, Lines) {
       {"no text at all", "", 254, "", ""},
       {"the limit", "abcd", 3, "abc", "d"},
       {"a delimiter right behind the limit is taken", "abc\"d", 3, "abc", "d"},
-      {"the longest quoted text leaves nothing", kFull + "\"", 254, kFull, ""},
-      {"one more leaves its rest", kFull + "y\"", 254, kFull, "y\""},
+      {"the longest quoted text leaves nothing", full + "\"", 254, full, ""},
+      {"one more leaves its rest", full + "y\"", 254, full, "y\""},
       {"no room", "ab", 0, "unchanged", "ab"},
   };
-  for (const LineRow& row : rows) {
+  for (const auto& row : rows) {
     char line[300] = "unchanged";
     ZORistrstream in(row.text.c_str(), 0);
     in.GetLine(line, row.limit, '"');

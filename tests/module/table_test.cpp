@@ -1,6 +1,8 @@
 // The order of the virtual operations, which other modules were compiled against.
 #include <gtest/gtest.h>
 
+#include <type_traits>
+
 #include "enum/ZORVadEnumString.h"
 #include "tests/support/vtable.h"
 
@@ -21,6 +23,11 @@ void ExpectInOrder(const Entry (&entries)[kCount], std::ptrdiff_t first = 2) {
 struct String : ZORVaDoString {
   using ZORVaDoString::IsDerivedFrom;
 };
+using Base = ZORISVectorImp_String;
+struct Vector : Base {
+  using Base::Zero;
+};
+using Iterator = ZORISVectorIteratorImp_String;
 struct TypeOfSingles : ZORVadSingleString::Descriptor {
   using ZORVadSingleString::Descriptor::IsDerivedFrom;
 };
@@ -62,6 +69,24 @@ const Entry kDescriptors[] = {
   {"CreateObject", Slot<Unknown>(&TypeOfSingles::CreateObject)},
   D(DestroyObject), D(GetObjectSize), D(GetNumberOfArguments), D(GetArgumentsSize), D(IsMatched), D(PrintOn),
 };
+
+#define V(name) {#name, Slot(&Vector::name)}
+#define V_OF(name, ...) {#name " " #__VA_ARGS__, Slot<__VA_ARGS__>(&Vector::name)}
+using U = unsigned int;
+using Action = Vector::Action;
+using Found = Vector::Test;
+const Entry kVectors[] = {
+  V_OF(Good, int (Base::*)() const), V_OF(Good, int (Base::*)()), V(Add), V(AddAt), V(AddUnique), V(Detach), V(DetachAt), V(IsEmpty),
+  V_OF(Flush, void (Base::*)(int, U, U)), V_OF(Flush, void (Base::*)(int)),
+  V(Find), V(ClusteredFind), V(FindLowerBound), V(FindUpperBound), V(Limit), V(Top), V(Count), V(GetDelta), V(NextDelta), V(Resize),
+  V_OF(ForEach, void (Base::*)(Action, void*, U, U)), V_OF(ForEach, void (Base::*)(Action, void*)),
+  V_OF(FirstThat, ZORString* (Base::*)(Found, void*, U, U) const), V_OF(FirstThat, ZORString* (Base::*)(Found, void*) const),
+  V_OF(LastThat, ZORString* (Base::*)(Found, void*, U, U) const), V_OF(LastThat, ZORString* (Base::*)(Found, void*) const), V(Zero),
+};
+const Entry kIterators[] = {
+  {"Current", Slot(&Iterator::Current)}, {"Restart", Slot<void (Iterator::*)(U, U)>(&Iterator::Restart)},
+  {"Restart", Slot<void (Iterator::*)()>(&Iterator::Restart)},
+};
 // clang-format on
 
 TEST(Tables, Order) {
@@ -69,6 +94,9 @@ TEST(Tables, Order) {
   ExpectInOrder(kSingles, 2 + static_cast<std::ptrdiff_t>(std::size(kStrings)));
   ExpectInOrder(kSets, 2 + static_cast<std::ptrdiff_t>(std::size(kStrings)));
   ExpectInOrder(kDescriptors);
+  ExpectInOrder(kVectors);
+  ExpectInOrder(kIterators, 0);
+  EXPECT_FALSE(std::has_virtual_destructor_v<Iterator>);
 }
 
 }  // namespace

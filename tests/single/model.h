@@ -27,7 +27,7 @@ inline int Settle(Str& t, const std::string& c) {
 }
 
 // States and sets.
-inline int Assign(Str& z, Str x) { return IsNil(x) || IsAny(x) ? (z.tag = x.tag, 0) : (z = x, 0); }
+inline int Assign(Str& z, Str x) { return IsNil(x) || IsAny(x) ? (z.tag = x.tag, 1) : (z = x, 1); }
 inline int IsIntersected(Str& z, Str x) {
   if (IsNil(z) || IsNil(x)) return 0;
   return IsAny(z) || IsAny(x) || z.text == x.text;
@@ -40,7 +40,7 @@ inline int CalcEqualValue(Str& z, Str x) {
   return Settle(z, x.text);
 }
 inline int CalcInverseEqualValue(Str z, Str& x) { return CalcEqualValue(x, z); }
-inline int Intersect(Str& z, Str x) { return CalcEqualValue(z, x), 0; }
+inline int Intersect(Str& z, Str x) { return CalcEqualValue(z, x); }
 inline int Unite(Str& z, Str x) {
   if (IsAny(z)) return 0;
   if (IsAny(x)) return ToAny(z), 0;
@@ -118,22 +118,13 @@ inline int CalcFirstInverseMinValue(Str z, Str& x, Str y) {
 inline int CalcNextValue(Str& z, Str x) {
   if (IsAny(x)) return 0;
   if (IsMax(x) || IsNil(x)) return ToNil(z);
-  if (x.text.size() < 255) return Settle(z, x.text + ' ');
-  const std::size_t i = x.text.find_last_not_of('z');
-  if (i != std::string::npos) return Settle(z, x.text.substr(0, i) + static_cast<char>(x.text[i] + 1));
-  if (IsAny(z)) return ToMax(z);
-  return z.text == x.text ? 0 : ToNil(z);
+  if (Next(x.text) != x.text) return Settle(z, Next(x.text));
+  return IsAny(z) ? ToMax(z) : z.text == x.text ? 0 : ToNil(z);
 }
 inline int CalcInverseNextValue(Str z, Str& x) {
   if (IsAny(z)) return 0;
   if (IsMin(z) || IsNil(z) || z.text.empty()) return ToNil(x);
-  std::string u = z.text;
-  if (u.back() == ' ') {
-    u.pop_back();
-  } else {
-    --u.back();
-  }
-  return Settle(x, u.size() < 255 ? u + std::string(255 - u.size(), 'z') : u);
+  return Settle(x, Previous(z.text));
 }
 
 // Concatenation and substring.
@@ -203,11 +194,6 @@ inline int CalcThirdInverseSubString(Str z, Str x, Int start, Int& end) {
 }
 
 // Case.
-template <char first, char last>
-std::string Folded(std::string text) {
-  for (char& c : text) c = c >= first && c <= last ? static_cast<char>(c ^ 0x20) : c;
-  return text;
-}
 inline int Fold(Str& z, Str x, std::string (*fold)(std::string)) {
   if (IsNil(x) || IsNil(z)) return ToNil(z);
   if (IsAny(z) && IsAny(x)) return 0;

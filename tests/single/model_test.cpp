@@ -4,30 +4,17 @@
 
 #include "enum/ZORVadEnumString.h"
 #include "tests/single/model.h"
+#include "tests/support/beside.h"
 #include "tests/support/check.h"
 
 using namespace zor::test;
 
-struct Operation {
-  const char* name;
-  int operands;
-  int target;
-  bool guarded;  // answers 0, nothing changed, when an operand is missing or no single string
-  int (*typed)(ZORVadSingleString* const* v);
-  int (*entry)(ZORVaDoString* const* v);
-  int (*model)(Str* v);
-};
-
 // clang-format off
-#define ROW(Name, operands, target, guarded, args, modelArgs) \
-  {#Name, operands, target, guarded, [](ZORVadSingleString* const* v) -> int { return ANSWER(v[0]->Name args); }, \
-   [](ZORVaDoString* const* v) -> int { return ANSWER(v[0]->Name args); }, [](Str* v) { return model::Name modelArgs; }}
-#define TWO(Name, target)        ROW(Name, 2, target, true,  (*v[1]),        (v[0], v[1]))
-#define TWO_OPEN(Name, target)   ROW(Name, 2, target, false, (*v[1]),        (v[0], v[1]))
-#define THREE(Name, target)      ROW(Name, 3, target, true,  (*v[1], *v[2]), (v[0], v[1], v[2]))
+#define TWO(Name, target)   ZOR_BESIDE(Name, 2, target, (*v[1]), (v[0], v[1]), (model::Name(v[0], v[1])))
+#define THREE(Name, target) ZOR_BESIDE(Name, 3, target, (*v[1], *v[2]), (v[0], v[1], v[2]), (model::Name(v[0], v[1], v[2])))
+#define WORDLESS(Name)      ZOR_BESIDE(Name, 2, 0, (*v[1]), (v[0], v[1]), (model::Name(v[0], v[1]), 0))
 
-static const Operation kOperations[] = {
-#define ANSWER(call) call
+static const Operation<Str> kOperations[] = {
   THREE(CalcConcatenation, 0), THREE(CalcFirstInverseConcatenation, 1), THREE(CalcSecondInverseConcatenation, 2),
   THREE(CalcMinValue, 0), THREE(CalcFirstInverseMinValue, 1), THREE(CalcMaxValue, 0), THREE(CalcFirstInverseMaxValue, 1),
   TWO(CalcNextValue, 0), TWO(CalcInverseNextValue, 1), TWO(CalcEqualValue, 0), TWO(CalcInverseEqualValue, 1),
@@ -35,11 +22,9 @@ static const Operation kOperations[] = {
   TWO(CalcNotLessValue, 0), TWO(CalcInverseNotLessValue, 1),
   TWO(CalcNotLessAndUnequalValue, 0), TWO(CalcInverseNotLessAndUnequalValue, 1),
   TWO(CalcLowerValue, 0), TWO(CalcInverseLowerValue, 1), TWO(CalcUpperValue, 0), TWO(CalcInverseUpperValue, 1),
-  TWO_OPEN(CalcUnequalValue, 0), TWO_OPEN(CalcInverseUnequalValue, 1), TWO_OPEN(IsIntersected, 0),
-  TWO_OPEN(CalcStringRepresentation, 0), TWO_OPEN(CalcInverseStringRepresentation, 1),
-#undef ANSWER
-#define ANSWER(call) (static_cast<void>(call), 0)
-  TWO_OPEN(Assign, 0), TWO_OPEN(Intersect, 0), TWO_OPEN(Unite, 0),
+  TWO(CalcUnequalValue, 0), TWO(CalcInverseUnequalValue, 1), TWO(IsIntersected, 0),
+  TWO(CalcStringRepresentation, 0), TWO(CalcInverseStringRepresentation, 1),
+  WORDLESS(Assign), WORDLESS(Intersect), WORDLESS(Unite),
 };
 
 // The last ones are for operations on two strings alone.
@@ -47,7 +32,7 @@ static const Str kValues[] = {
   kNil, {kNilTag, "ab"}, kAny, {kAnyTag, "a"}, kMax, kMin, Text(""), Text("a"), Text("ab"), Text("b"), Text("aba"),
   Times(255, 'z'), Times(254, 'z'), Times(200, 'a'), Times(55, 'a'), Times(56, 'a'),
   Text("A"), Text("aB"), Text("  "), Text("a!"), Text("\"a\""), Text("Max"), Text("\xff!"), Times(255, 'A'),
-  Times(256, 'z'), Times(254, 'z', "y"), Times(254, 'a', "z"), Times(256, 'a', "z"),
+  Times(256, 'z'), Times(254, 'z', "y"), Times(254, 'a', "z"), Times(256, 'a', "z"), {kNilTag, "Min"},
 };
 static constexpr std::size_t kOfThree = 16;
 static const Str kSliced[] = {kNil, kAny, {kAnyTag, "b"}, kMax, kMin, Text(""), Text("a"), Text("bc"), Text("b"), Text("abcbc"),
@@ -56,56 +41,21 @@ static const Int kPositions[] = {kNoNumber, kAnyNumber, Number(INT_MIN), Number(
                           Number(1), Number(2), Number(3), Number(254), Number(255), Number(299), Number(INT_MAX - 1),
                           Number(INT_MAX)};
 // clang-format on
-static constexpr int kPatterns[][3] = {
-    {0, 1, 2}, {0, 0, 2}, {0, 1, 0}, {0, 1, 1}, {0, 0, 0}};  // who is the same object
-
-// Two calls in one form; pattern says which operands are one object.
-template <class Class, class Form>
-static void Compare(const Operation& operation, const Str* v, const int* pattern, Form form) {
-  HeldSingle held[] = {HeldSingle(v[0]), HeldSingle(v[1]), HeldSingle(v[2])};
-  Class* operands[3];
-  for (int i = 0; i < 3; ++i) operands[i] = &held[pattern[i]].value;
-  Str expected[] = {v[0], v[1], v[2]};
-  for (int call = 1; call <= 2; ++call) {
-    Str copies[3];
-    for (int i = 0; i < 3; ++i) copies[i] = expected[pattern[i]];
-    const int answer = operation.model(copies);
-    expected[pattern[operation.target]] = copies[operation.target];
-    ASSERT_EQ((operation.*form)(operands), answer) << "call " << call;
-    for (int i = 0; i < 3; ++i) ASSERT_EQ(held[i].Now(), expected[i]) << "operand " << i << " after call " << call;
-  }
-}
-
 TEST(SingleModel, EveryCombination) {
-  for (const Operation& operation : kOperations) {
-    const std::size_t n = operation.operands == 3 ? kOfThree : std::size(kValues);
-    for (std::size_t i = 0; i < (operation.operands == 3 ? n * n * n : n * n); ++i) {
-      const Str v[] = {kValues[i % n], kValues[i / n % n], kValues[i / n / n]};
-      for (const auto& pattern : kPatterns) {
-        if (operation.operands == 2 && pattern[2] != 2) continue;
-        Compare<ZORVadSingleString>(operation, v, pattern, &Operation::typed);
-        Compare<ZORVaDoString>(operation, v, pattern, &Operation::entry);
-        ASSERT_FALSE(HasFatalFailure()) << v[0] << '.' << operation.name << ' ' << v[1] << ' ' << v[2] << ", objects "
-                                        << pattern[0] << pattern[1] << pattern[2];
-      }
-    }
-  }
+  for (const auto& operation : kOperations) ASSERT_NO_FATAL_FAILURE(CompareAll(operation, kValues, kOfThree));
 }
 
-// An operand is missing, or is a set of strings.
-TEST(SingleModel, Guards) {
-  for (const Operation& operation : kOperations) {
-    for (int i = 2; operation.guarded && i < 2 * operation.operands; ++i) {
-      HeldSingle held[] = {HeldSingle(Text("ab")), HeldSingle(Text("b")), HeldSingle(Text("b"))};
-      ZORVadEnumString set(ZORString("b"));
-      ZORVaDoString* operands[] = {&held[0].value, &held[1].value, &held[2].value};
-      operands[i / 2] = i % 2 == 0 ? nullptr : &set;
-      EXPECT_EQ(operation.entry(operands), 0) << operation.name << ' ' << i;
-      EXPECT_TRUE(held[0].Now() == Text("ab") && held[1].Now() == Text("b") && held[2].Now() == Text("b") &&
-                  set.GetState() == kExact && set.Count() == 1)
-          << operation.name << ' ' << i;
+TEST(SingleModel, WrongOperands) {
+  ZORVadEnumString set(ZORString("b"));
+  for (const Str& z : {Text("ab"), kAny, kMax}) {
+    for (const auto& operation : kOperations) {
+      if (operation.Is("CalcStringRepresentation", "CalcInverseStringRepresentation")) continue;
+      CheckWrongOperands(operation, z, Text("b"), nullptr);
+      CheckWrongOperands(operation, z, Text("b"), &set);
     }
+    CheckIntegers(z);
   }
+  EXPECT_TRUE(set.GetState() == kExact && set.Count() == 1);
 }
 
 // Two calls; both positions may be one object.

@@ -43,15 +43,10 @@ static const struct {
   {"removing the stale text",           kStale,          DO(v.RemoveExactValue("old")),   0, kStale},
   {"removing the text of max",          kMax,            DO(v.RemoveExactValue(ZORVaDoString::ZorVaDoStringMax)), 1, kNil},
 
-  {"assigned from undefined",           ab,              DO(v.Assign(FROM(kAny))),        1, {kAnyTag, "ab"}, 1},
-  {"assigned from max",                 ab,              DO(v.Assign(FROM(kMax))),        1, kMax, 1},
   {"copied from nil",                   ab,              DO(v.Copy(FROM(kNil))),          0, {kNilTag, "ab"}},
   {"copied from a text",                kMax,            DO(v.Copy(ZORString("x"))),      1, x, 1},
   {"characters make it exact",          kNil,            RUN(v = "x"),                    0, x},
   {"its own copy",                      ab,              DO((v.operator=(v), v.Copy(v))),          1, ab, 1},
-  {"its own copy when undefined",       kStale,          DO((v.operator=(v), v.Copy(v))),          0, kStale},
-  {"a set is not assigned",             ab,              RUN(v.Assign(ZORVadEnumString("ab"))), 0, kNil},
-  {"nor is nothing",                    ab,              RUN(v.Assign(Missing<ZORVaDoAny>())), 0, kNil},
   {"a nil value stays as it was",       kStaleNil,       RUN(v.Assign(ZORVadEnumString("ab"))), 0, kStaleNil},
 };
 

@@ -4,6 +4,8 @@
 #include <gtest/gtest.h>
 
 #include <tuple>
+#include <type_traits>
+#include <vector>
 
 #include "tests/support/values.h"
 
@@ -23,27 +25,50 @@ struct Row {
   int again = 0;
 };
 
-// Calls both forms on fresh operands, twice each; operands that are no target must stay as they were.
-template <std::size_t kTarget, class... Operands, class Operation>
-void Check(const Row<kTarget, Operands...>& row, Operation operation) {
-  SCOPED_TRACE(row.why);
+// Calls one form on fresh operands, twice; operands that are no target must stay as they were. It takes any call of
+// such operands, so that compilers meet it once and not for every operation.
+template <std::size_t kTarget, class... Operands>
+void CheckForm(const Row<kTarget, Operands...>& row, const char* form,
+               std::type_identity_t<int (*)(typename Operands::Held&...)> call) {
+  SCOPED_TRACE(form);
   std::tuple<Operands...> expected = row.operands;
   std::get<kTarget>(expected) = row.after;
-  const auto check = [&](const char* form, auto call) {
-    SCOPED_TRACE(form);
-    auto held = std::apply([](auto&... v) { return std::tuple<typename Operands::Held...>(v...); }, row.operands);
-    for (const int answer : {row.answer, row.again}) {
-      EXPECT_EQ(std::apply(call, held), answer);
-      EXPECT_EQ(std::apply([](auto&... v) { return std::tuple<Operands...>(v.Now()...); }, held), expected);
-    }
-  };
-  check("typed form", [&](auto&... held) { return operation(held.Typed()...); });
-  check("entry", [&](auto&... held) { return operation(held.Abstract()...); });
+  auto held = std::apply([](auto&... v) { return std::tuple<typename Operands::Held...>(v...); }, row.operands);
+  for (const int answer : {row.answer, row.again}) {
+    EXPECT_EQ(std::apply(call, held), answer);
+    EXPECT_EQ(std::apply([](auto&... v) { return std::tuple<Operands...>(v.Now()...); }, held), expected);
+  }
 }
 
-template <class Row, std::size_t kCount, class Operation>
-void CheckRows(const Row (&rows)[kCount], Operation operation) {
-  for (const Row& row : rows) Check(row, operation);
+template <std::size_t kTarget, class... Operands, class Operation>
+void Check(const Row<kTarget, Operands...>& row, Operation) {
+  SCOPED_TRACE(row.why);
+  CheckForm(row, "typed form", [](typename Operands::Held&... held) -> int { return Operation()(held.Typed()...); });
+  CheckForm(row, "entry", [](typename Operands::Held&... held) -> int { return Operation()(held.Abstract()...); });
 }
+
+// A row of any operation: its operands and what becomes of the target as notations.
+struct Example {
+  const char *why, *name;
+  void (*check)(const Example& example);
+  std::vector<const char*> operands;
+  int answer;
+  const char* after;
+  int again = 0;
+};
+
+template <std::size_t kTarget, class... Operands, class Operation>
+void CheckExample(const Example& example, Operation operation) {
+  SCOPED_TRACE(example.name);
+  auto next = example.operands.begin();
+  const std::tuple<Operands...> operands{Operands::Parse(*next++)...};
+  const auto after = std::tuple_element_t<kTarget, std::tuple<Operands...>>::Parse(example.after);
+  Check<kTarget, Operands...>({example.why, operands, example.answer, after, example.again}, operation);
+}
+
+// The name of an operation and its check, for operands of these kinds.
+#define ZOR_EXAMPLE(Name, target, ...) ZOR_EXAMPLE_OF(Name, ZOR_OPERATION(Name), target, __VA_ARGS__)
+#define ZOR_EXAMPLE_OF(Name, operation, target, ...) \
+#Name, [](const Example& example) { CheckExample<target, __VA_ARGS__>(example, operation); }
 
 }  // namespace zor::test

@@ -11,7 +11,6 @@ inline ZORString* New(char letter) { return new ZORString(ZORChar(letter), 1); }
 
 // A vector that owns its strings, so that the leak checker sees the ones that got lost.
 struct Strings : ZORISVectorImp_String {
-  using ZORISVectorImp_String::Zero;
   using ZORISVectorImp_String::ZORISVectorImp_String;
 
   explicit Strings(const std::string& letters) : ZORISVectorImp_String(20, 20u) {

@@ -49,17 +49,5 @@ TEST(EnumCost, SameObjects) {
   Expect("folds", 1000, 0, ZOR_OPERATION(CalcLowerValue), Set("{a,b}"), Set("{A,B,C}"));
 }
 
-#ifndef ZOR_HAS_OWN_MALLOC
-// A set that cannot have its places ends the process with a message, not by a wild write.
-TEST(EnumCostDeathTest, NoMemory) {
-  const HeldSet held("{a,b}");
-  const auto copy = [&] {
-    sNoMemory = true;
-    const ZORVadEnumString refused(held.value);
-  };
-  EXPECT_DEATH(copy(), "no memory for a set");
-}
-#endif
-
 }  // namespace
 }  // namespace zor::test

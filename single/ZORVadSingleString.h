@@ -94,7 +94,7 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
   ZORString mText;
 };
 
-inline int ZORVadSingleString::IsFull() const { return mState == ZorStringMax; }
+ZOR_EXPORT inline int ZORVadSingleString::IsFull() const { return mState == ZorStringMax; }
 
 // The common end of the forward operations: an Undefined value takes the text, an equal text stays, any other is a
 // contradiction.

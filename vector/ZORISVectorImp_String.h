@@ -115,16 +115,16 @@ class ZOR_EXPORT ZORISVectorImp_String {
   int mGood;
 };
 
-// Inline, yet defined behind the class: so they stay exported to programs that do not inline them.
-inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) { return mItems[pos]; }
-inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) const { return mItems[pos]; }
-inline int ZORISVectorImp_String::Good() const { return mGood; }
-inline int ZORISVectorImp_String::Good() { return mGood; }
-inline int ZORISVectorImp_String::IsEmpty() const { return mTop == 0; }
-inline unsigned int ZORISVectorImp_String::Limit() const { return mLimit; }
-inline unsigned int ZORISVectorImp_String::Top() const { return mTop; }
-inline unsigned int ZORISVectorImp_String::Count() const { return mTop; }
-inline unsigned int ZORISVectorImp_String::GetDelta() const { return mDelta; }
+// Inline, and exported to programs that do not inline them.
+ZOR_EXPORT inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) { return mItems[pos]; }
+ZOR_EXPORT inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) const { return mItems[pos]; }
+ZOR_EXPORT inline int ZORISVectorImp_String::Good() const { return mGood; }
+ZOR_EXPORT inline int ZORISVectorImp_String::Good() { return mGood; }
+ZOR_EXPORT inline int ZORISVectorImp_String::IsEmpty() const { return mTop == 0; }
+ZOR_EXPORT inline unsigned int ZORISVectorImp_String::Limit() const { return mLimit; }
+ZOR_EXPORT inline unsigned int ZORISVectorImp_String::Top() const { return mTop; }
+ZOR_EXPORT inline unsigned int ZORISVectorImp_String::Count() const { return mTop; }
+ZOR_EXPORT inline unsigned int ZORISVectorImp_String::GetDelta() const { return mDelta; }
 
 // A cursor over a vector, which it does not own. The end of the walk is fixed when it is made or restarted: strings
 // added behind it meanwhile stay outside. It must lie within the vector's limit.

@@ -1,7 +1,5 @@
 // Concatenation and substring of single strings.
-#include <algorithm>
 #include <cstdint>
-#include <string_view>
 
 #include "module/alphabet.h"
 #include "module/guard.h"

@@ -1,6 +1,6 @@
-// Counts what is allocated, by texts and by operator new alike. For one source file of a program. Where
-// the address sanitizer has a malloc of its own, nothing is counted. Hidden from the libraries, which the
-// build makes the default, it would see nothing of theirs.
+// Counts what is allocated, by texts and by operator new alike. For one source file of a program. Where the address
+// sanitizer has a malloc of its own, nothing is counted. Hidden from the libraries, which the build makes the default,
+// it would see nothing of theirs.
 #pragma once
 
 #include <cstdlib>

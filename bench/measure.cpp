@@ -4,7 +4,7 @@
 
 #include <cstdlib>
 
-#include "runner/session.h"
+#include "network/session.h"
 #include "tests/support/allocations.h"
 
 namespace zor::bench {

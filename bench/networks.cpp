@@ -7,10 +7,10 @@
 
 #include "bench/measure.h"
 #include "bench/problems.h"
-#include "runner/propagation.h"
-#include "runner/reader.h"
-#include "runner/session.h"
-#include "runner/store.h"
+#include "language/reader.h"
+#include "network/propagation.h"
+#include "network/session.h"
+#include "network/store.h"
 
 namespace zor::bench {
 
@@ -26,7 +26,7 @@ struct Zornet {
   static void Run(State& state, const Problem& problem) {
     const auto solve = [&](std::size_t) {
       zornet::Diagnostics diagnostics;
-      const zornet::Model model = zornet::Read(zornet::Source("problem", problem.network), diagnostics);
+      const zornet::Model model = zornet::Read(zornet::Source("problem", problem.network), diagnostics).model;
       zornet::Store store(ModuleInUse().Types(), model);
       if (diagnostics.Failed() || zornet::Propagation(store, {}).Run() != zornet::Outcome::Settled) std::abort();
     };

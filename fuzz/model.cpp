@@ -3,13 +3,13 @@
 #include <sstream>
 
 #include "fuzz/support.h"
-#include "runner/graph.h"
-#include "runner/log.h"
-#include "runner/raw.h"
-#include "runner/reader.h"
-#include "runner/report.h"
-#include "runner/search.h"
-#include "runner/session.h"
+#include "language/reader.h"
+#include "network/log.h"
+#include "network/search.h"
+#include "network/session.h"
+#include "zornet/graph.h"
+#include "zornet/raw.h"
+#include "zornet/report.h"
 
 namespace {
 
@@ -20,8 +20,8 @@ constexpr std::uint64_t kSolutions = 3;
 
 class Run {
  public:
-  Run(const Source& source, const Model& model, Report& report)
-      : mModel(model), mReport(report), mNames(source, model) {}
+  Run(const Source& source, const ReadModel& read, Report& report)
+      : mModel(read.model), mReport(report), mNames(source, read) {}
 
   Summary Solve(bool explains);
 
@@ -91,7 +91,7 @@ void CheckObjects(std::istringstream lines) {
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const Source source("fuzz.szn", std::string(data, data + size));
   Diagnostics diagnostics;
-  const Model model = Read(source, diagnostics);
+  const ReadModel model = Read(source, diagnostics);
   std::ostringstream objects, results, remarks;
   const auto json = MakeJsonReport(source, model, objects);
   const auto text = MakeTextReport(source, model, {true, true, true, false}, results, remarks);

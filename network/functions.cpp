@@ -1,0 +1,195 @@
+#include "network/functions.h"
+
+#include <algorithm>
+
+namespace zornet {
+
+namespace {
+
+Operation ForwardOf(Meaning meaning) {
+  switch (meaning) {
+    case Meaning::Concatenation:
+      return Operation::Concatenation;
+    case Meaning::Slice:
+      return Operation::Slice;
+    case Meaning::Length:
+      return Operation::Length;
+    case Meaning::Lower:
+      return Operation::Lower;
+    case Meaning::Upper:
+      return Operation::Upper;
+    case Meaning::Minimum:
+      return Operation::Minimum;
+    case Meaning::Maximum:
+      return Operation::Maximum;
+    case Meaning::Successor:
+      return Operation::Successor;
+    default:
+      return Operation::TextForm;
+  }
+}
+
+std::size_t LongestOf(const Listing& listing) {
+  std::size_t longest = 0;
+  for (const ZORString& text : listing.texts) longest = std::max(longest, ToView(text).size());
+  return longest;
+}
+
+}  // namespace
+
+Functions::Functions(Store& store, std::size_t budget)
+    : mStore(store),
+      mTruth(store.Types()),
+      mSupports(store, mTruth, budget),
+      mX(store.Types(), Sort::TextSet),
+      mY(store.Types(), Sort::TextSet),
+      mZ(store.Types(), Sort::TextSet) {}
+
+// Exact inputs give the result by one forward operation. A result of which nothing is known takes what the module
+// makes of the sets of inputs; everything else is a matter of supports, or of the sets again when these are too many.
+Progress Functions::Narrow(const Constraint& constraint) {
+  if (HasExactInputs(constraint)) {
+    ComputeExact(constraint);
+    return Progress::Done;
+  }
+  if (constraint.kind->meaning == Meaning::Length) BoundLength(constraint.Result());
+  if (mStore.HasFailed()) return Progress::Waits;
+  if (constraint.kind->meaning == Meaning::Successor && constraint.arguments[0] == constraint.Result()) {
+    mStore.StartOperation(Operation::Successor);
+    MeetResult(constraint, {GreatestText(), 0});  // the one text that is its own
+    return Progress::Done;
+  }
+  if (mStore[constraint.Result()].IsUndefined() && ComputeSets(constraint)) return Progress::Waits;
+  if (mSupports.Narrow(constraint)) return Progress::Waits;
+  ComputeSets(constraint);
+  return Progress::Again;  // where the result is an input too
+}
+
+bool Functions::HasExactInputs(const Constraint& constraint) const {
+  for (int i = 0; i < constraint.kind->Inputs(); ++i) {
+    if (!mStore[constraint.arguments[static_cast<std::size_t>(i)]].IsOne()) return false;
+  }
+  return true;
+}
+
+void Functions::ComputeExact(const Constraint& constraint) {
+  std::array<Exact, kMostArguments> inputs{};
+  std::array<ZORString, kMostArguments> texts;
+  for (int i = 0; i < constraint.kind->Inputs(); ++i) {
+    const auto at = static_cast<std::size_t>(i);
+    const Value& value = mStore[constraint.arguments[at]];
+    inputs[at].sort = value.Sort();
+    if (IsText(value.Sort())) {
+      texts[at] = value.LowestText();
+      inputs[at].text = &texts[at];
+    } else {
+      inputs[at].number = value.LowestNumber();
+    }
+  }
+  mStore.StartOperation(ForwardOf(constraint.kind->meaning));
+  Answer answer;
+  if (!mTruth.Compute(*constraint.kind, inputs.data(), answer)) return mStore.Fail(constraint.Result());
+  MeetResult(constraint, answer);
+}
+
+void Functions::MeetResult(const Constraint& constraint, const Answer& answer) {
+  Value& outcome = mStore.FreshLike(constraint.Result());
+  if (IsText(outcome.Sort())) {
+    outcome.SetText(answer.text);
+  } else {
+    outcome.SetNumber(answer.number);
+  }
+  mStore.Meet(constraint.Result(), outcome);
+}
+
+// False when the module has no such operation on sets, or when it would not tell all.
+bool Functions::ComputeSets(const Constraint& constraint) {
+  const Kind& kind = *constraint.kind;
+  if (kind.meaning == Meaning::Slice || kind.meaning == Meaning::TextForm) return false;
+  const int first = constraint.arguments[0], second = constraint.arguments[1];
+  if (kind.Inputs() == 2 && first == second) return false;  // pairs of equal texts are fewer than all pairs
+  if (!mStore[first].IsKnown() || (kind.Inputs() == 2 && !mStore[second].IsKnown())) return false;
+  const Value& x = AsSet(first, mX);
+  if (kind.meaning == Meaning::Length) {
+    Value& lengths = mStore.FreshLike(constraint.Result());
+    mStore.StartOperation(Operation::Length);
+    x.Text().CalcLength(lengths.Integer());
+    mStore.Meet(constraint.Result(), lengths);
+    return true;
+  }
+  const Value& y = kind.Inputs() == 2 ? AsSet(second, mY) : x;
+  mZ.Reset();
+  if (!CallSets(constraint, x, y, mZ)) return false;
+  if (mZ.IsUndefined()) return false;  // more texts than an operation on sets lists
+  MeetSet(constraint.Result(), mZ);
+  return true;
+}
+
+bool Functions::CallSets(const Constraint& constraint, const Value& x, const Value& y, Value& result) {
+  const Meaning meaning = constraint.kind->meaning;
+  if (meaning == Meaning::Concatenation && MayOverflow(constraint)) return false;
+  // Of a set with "" alone the module takes one space for the lower bound, and would put it into the result.
+  const bool leastBound = x.LowestText().GetLengthInChar() == 0 && y.LowestText().GetLengthInChar() == 0;
+  if (meaning == Meaning::Maximum && leastBound) return false;
+  mStore.StartOperation(ForwardOf(meaning));
+  ZORVaDoString& z = result.Text();
+  switch (meaning) {
+    case Meaning::Concatenation:
+      z.CalcConcatenation(x.Text(), y.Text());
+      break;
+    case Meaning::Lower:
+      z.CalcLowerValue(x.Text());
+      break;
+    case Meaning::Upper:
+      z.CalcUpperValue(x.Text());
+      break;
+    case Meaning::Minimum:
+      z.CalcMinValue(x.Any(), y.Any());
+      break;
+    case Meaning::Maximum:
+      z.CalcMaxValue(x.Any(), y.Any());
+      break;
+    default:
+      z.CalcNextValue(x.Text());
+      break;
+  }
+  return true;
+}
+
+// Sets list a concatenation of any length, where it should become the greatest text.
+bool Functions::MayOverflow(const Constraint& constraint) {
+  const std::size_t longest = LongestOf(mStore.List(constraint.arguments[0]));
+  return longest + LongestOf(mStore.List(constraint.arguments[1])) > kTextLimit;
+}
+
+const Value& Functions::AsSet(int variable, Value& set) {
+  const Value& value = mStore[variable];
+  if (value.Sort() == Sort::TextSet) return value;
+  set.Text().SetExactValue(value.LowestText());
+  return set;
+}
+
+void Functions::MeetSet(int variable, const Value& set) {
+  if (mStore[variable].Sort() == Sort::TextSet) return mStore.Meet(variable, set);
+  Value& outcome = mStore.CopyOf(variable);
+  set.Text().CalcInverseEqualValue(outcome.Any());
+  mStore.Meet(variable, outcome);
+}
+
+// Of a text of which nothing is known the length is known all the same to be possible.
+void Functions::BoundLength(int number) {
+  const Value& held = mStore[number];
+  if (!held.IsKnown()) return;
+  Value& outcome = mStore.FreshLike(number);
+  if (held.Sort() == Sort::Interval) {
+    outcome.SetNumbers({0, static_cast<ZORLong>(kTextLimit)});
+  } else {
+    std::vector<ZORLong> possible = held.Numbers();
+    std::erase_if(possible, [](ZORLong n) { return n < 0 || n > static_cast<ZORLong>(kTextLimit); });
+    outcome.SetNumbers(possible);
+  }
+  mStore.StartOperation(Operation::Length);
+  mStore.Meet(number, outcome);
+}
+
+}  // namespace zornet

@@ -1,0 +1,35 @@
+// Narrowing of the constraints whose last argument is a function of the others.
+#pragma once
+
+#include "network/relations.h"
+#include "network/store.h"
+#include "network/supports.h"
+#include "network/truth.h"
+
+namespace zornet {
+
+class Functions {
+ public:
+  Functions(Store& store, std::size_t budget);
+
+  Progress Narrow(const Constraint& constraint);
+
+ private:
+  bool HasExactInputs(const Constraint& constraint) const;
+  void ComputeExact(const Constraint& constraint);
+  void MeetResult(const Constraint& constraint, const Answer& answer);
+
+  bool ComputeSets(const Constraint& constraint);
+  bool CallSets(const Constraint& constraint, const Value& x, const Value& y, Value& result);
+  bool MayOverflow(const Constraint& constraint);
+  const Value& AsSet(int variable, Value& set);
+  void MeetSet(int variable, const Value& set);
+  void BoundLength(int number);
+
+  Store& mStore;
+  Truth mTruth;
+  Supports mSupports;
+  Value mX, mY, mZ;  // sets
+};
+
+}  // namespace zornet

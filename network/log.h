@@ -1,0 +1,33 @@
+// Remembers every narrowing with what it followed from, and tells why a variable is what it is.
+#pragma once
+
+#include <vector>
+
+#include "network/store.h"
+
+namespace zornet {
+
+class Log : public Watcher {
+ public:
+  explicit Log(const Model& model) : mModel(model), mLast(model.variables.size(), kNone) {}
+
+  void Narrowed(const Narrowing& narrowing) override;
+
+  struct Explanation {
+    std::vector<int> declared;                 // variables that took part with what they started with
+    std::vector<const Narrowing*> narrowings;  // in the order in which they happened
+  };
+  Explanation Explain(int variable) const;
+
+ private:
+  struct Entry {
+    Narrowing narrowing;
+    std::vector<int> causes;  // entries
+  };
+
+  const Model& mModel;
+  std::vector<Entry> mEntries;
+  std::vector<int> mLast;  // entry of each variable
+};
+
+}  // namespace zornet

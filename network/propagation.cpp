@@ -1,0 +1,96 @@
+#include "network/propagation.h"
+
+namespace zornet {
+
+namespace {
+
+constexpr std::uint64_t kProgressSteps = 256;
+
+}  // namespace
+
+Propagation::Propagation(Store& store, const Limits& limits)
+    : mStore(store), mModel(store.Model()), mLimits(limits), mRelations(store), mFunctions(store, limits.budget) {
+  Connect();
+  mStates.resize(mModel.constraints.size(), Idle);
+  mQueue.resize(mModel.constraints.size());
+  for (std::size_t i = 0; i < mModel.constraints.size(); ++i) Wake(static_cast<int>(i));
+}
+
+void Propagation::Connect() {
+  mFirstReader.resize(mModel.variables.size() + 1, 0);
+  const auto each = [this](auto visit) {
+    for (std::size_t c = 0; c < mModel.constraints.size(); ++c) {
+      const Constraint& constraint = mModel.constraints[c];
+      for (int i = 0; i < constraint.kind->arity; ++i) {
+        visit(static_cast<int>(c), static_cast<std::size_t>(constraint.arguments[static_cast<std::size_t>(i)]));
+      }
+    }
+  };
+  each([this](int, std::size_t variable) { ++mFirstReader[variable + 1]; });
+  for (std::size_t v = 1; v < mFirstReader.size(); ++v) mFirstReader[v] += mFirstReader[v - 1];
+  mReaders.resize(mFirstReader.back());
+  std::vector<std::size_t> next(mFirstReader.begin(), mFirstReader.end() - 1);
+  each([&](int constraint, std::size_t variable) { mReaders[next[variable]++] = constraint; });
+}
+
+Outcome Propagation::Run() {
+  WakeReaders(kNone);
+  while (mWaiting != 0) {
+    if (mSteps >= mLimits.steps) return Outcome::StepLimit;
+    ++mSteps;
+    if (mTeller && mSteps % kProgressSteps == 0) mTeller(mSteps, mWaiting);
+    const int constraint = Next();
+    const auto progress = Narrow(constraint);
+    if (mStore.HasFailed()) return Outcome::Contradiction;
+    WakeReaders(progress == Progress::Again ? kNone : constraint);
+  }
+  return Outcome::Settled;
+}
+
+Progress Propagation::Narrow(int constraint) {
+  const Constraint& what = mModel.constraints[static_cast<std::size_t>(constraint)];
+  mStore.StartConstraint(constraint);
+  const auto progress = what.kind->IsRelation() ? mRelations.Narrow(what) : mFunctions.Narrow(what);
+  if (progress == Progress::Done) {
+    mStates[static_cast<std::size_t>(constraint)] = Finished;
+    mFinished.push_back(constraint);
+  }
+  return progress;
+}
+
+// A constraint that finds in one pass all that it can find is not woken by its own changes.
+void Propagation::WakeReaders(int except) {
+  for (const int variable : mStore.Touched()) {
+    const auto at = static_cast<std::size_t>(variable);
+    for (std::size_t i = mFirstReader[at]; i < mFirstReader[at + 1]; ++i) {
+      if (mReaders[i] != except) Wake(mReaders[i]);
+    }
+  }
+  mStore.Touched().clear();
+}
+
+void Propagation::Wake(int constraint) {
+  State& state = mStates[static_cast<std::size_t>(constraint)];
+  if (state != Idle) return;
+  state = Waiting;
+  mQueue[(mHead + mWaiting++) % mQueue.size()] = constraint;
+}
+
+int Propagation::Next() {
+  const int constraint = mQueue[mHead];
+  mHead = (mHead + 1) % mQueue.size();
+  --mWaiting;
+  mStates[static_cast<std::size_t>(constraint)] = Idle;
+  return constraint;
+}
+
+void Propagation::Undo() {
+  while (mWaiting != 0) Next();
+  while (mFinished.size() > mMarks.back()) {
+    mStates[static_cast<std::size_t>(mFinished.back())] = Idle;
+    mFinished.pop_back();
+  }
+  mMarks.pop_back();
+}
+
+}  // namespace zornet

@@ -1,0 +1,66 @@
+// Narrows a network until nothing changes any more: constraints wait in a queue and are woken by the variables that
+// they read. It ends, since every change leaves less in a variable, and it loses no solution (see Store and Truth).
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <vector>
+
+#include "network/functions.h"
+#include "network/relations.h"
+#include "network/store.h"
+
+namespace zornet {
+
+struct Limits {
+  std::size_t budget = 65536;         // combinations that the supports of one constraint may try
+  std::uint64_t steps = 100'000'000;  // passes over a constraint
+};
+
+enum class Outcome { Settled, Contradiction, StepLimit };
+
+class Propagation {
+ public:
+  Propagation(Store& store, const Limits& limits);
+
+  Outcome Run();
+
+  // Reports now and then, with the steps made and the constraints waiting.
+  using Teller = std::function<void(std::uint64_t steps, std::size_t waiting)>;
+  void OnProgress(Teller teller) { mTeller = std::move(teller); }
+
+  std::uint64_t Steps() const { return mSteps; }
+
+  // As in Store, for what is settled and what waits.
+  void Mark() { mMarks.push_back(mFinished.size()); }
+  void Undo();
+
+ private:
+  void Connect();
+  void Wake(int constraint);
+  void WakeReaders(int except);
+  Progress Narrow(int constraint);
+  int Next();
+
+  Store& mStore;
+  const Model& mModel;
+  Limits mLimits;
+  Relations mRelations;
+  Functions mFunctions;
+  Teller mTeller;
+
+  // Constraints that read a variable: mReaders[mFirstReader[v]] and those up to mFirstReader[v + 1].
+  std::vector<int> mReaders;
+  std::vector<std::size_t> mFirstReader;
+
+  enum State : char { Idle, Waiting, Finished };
+  std::vector<State> mStates;  // of the constraints
+  std::vector<int> mQueue;     // a ring with a place for each constraint
+  std::size_t mHead = 0;
+  std::size_t mWaiting = 0;
+  std::vector<int> mFinished;  // in the order in which they were
+  std::vector<std::size_t> mMarks;
+  std::uint64_t mSteps = 0;
+};
+
+}  // namespace zornet

@@ -1,0 +1,246 @@
+#include "network/relations.h"
+
+namespace zornet {
+
+namespace {
+
+bool TouchesLeast(const Value& value) { return IsLeastSomewhere(value.LowestText()); }
+
+// Not (x < y) is y <= x.
+Meaning Opposite(Meaning meaning) {
+  switch (meaning) {
+    case Meaning::Equal:
+      return Meaning::Unequal;
+    case Meaning::Unequal:
+      return Meaning::Equal;
+    case Meaning::NotAbove:
+      return Meaning::Below;
+    default:
+      return Meaning::NotAbove;
+  }
+}
+
+Operation RelationOf(Meaning meaning) {
+  switch (meaning) {
+    case Meaning::Equal:
+      return Operation::IsEqual;
+    case Meaning::NotAbove:
+      return Operation::IsLessOrEqual;
+    default:
+      return Operation::IsLess;
+  }
+}
+
+bool IsOrder(Meaning meaning) { return meaning == Meaning::NotAbove || meaning == Meaning::Below; }
+
+}  // namespace
+
+Relations::Relations(Store& store)
+    : mStore(store),
+      mSingle(store.Types(), Sort::Text),
+      mOther(store.Types(), Sort::Text),
+      mSet(store.Types(), Sort::TextSet),
+      mTruth(store.Types(), Sort::Boolean) {}
+
+Progress Relations::Narrow(const Constraint& constraint) {
+  const Meaning meaning = constraint.kind->meaning;
+  const int x = constraint.arguments[constraint.kind->mirrored ? 1 : 0];
+  const int y = constraint.arguments[constraint.kind->mirrored ? 0 : 1];
+  if (!constraint.kind->truth) return Post(meaning, x, y);
+  const int truth = constraint.arguments[2];
+  if (!mStore[truth].IsOne()) return Decide(meaning, x, y, truth);
+  if (mStore[truth].LowestNumber() != 0) return Post(meaning, x, y);
+  return IsOrder(meaning) ? Post(Opposite(meaning), y, x) : Post(Opposite(meaning), x, y);
+}
+
+Progress Relations::Post(Meaning meaning, int x, int y) {
+  if (x == y) return Reflexive(meaning, x);
+  switch (meaning) {
+    case Meaning::Equal:
+      return Equal(x, y);
+    case Meaning::Unequal:
+      return Unequal(x, y);
+    default:
+      return Ordered(x, y, meaning == Meaning::Below);
+  }
+}
+
+Progress Relations::Reflexive(Meaning meaning, int x) {
+  mStore.StartOperation(meaning == Meaning::Unequal ? Operation::Unequal : Operation::NotAbove);
+  if (!Truth::Relates(meaning, ZORString(), ZORString())) mStore.Fail(x);
+  return Progress::Done;
+}
+
+Progress Relations::Equal(int x, int y) {
+  Equate(x, y);
+  if (!mStore.HasFailed()) Equate(y, x);
+  return mStore[x].IsOne() && mStore[y].IsOne() ? Progress::Done : Progress::Waits;
+}
+
+void Relations::Equate(int target, int other) {
+  if (!mStore[other].IsKnown()) return;
+  const Sort from = mStore[other].Sort(), to = mStore[target].Sort();
+  if (from == to) {
+    mStore.StartOperation(Operation::Equal);
+    mStore.Meet(target, mStore[other]);
+  } else if (to == Sort::TextSet) {
+    Value& outcome = mStore.Fresh(to);
+    mStore.StartOperation(Operation::Equal);
+    outcome.Text().CalcEqualValue(OperandFor(other, mOther).Any());
+    mStore.Meet(target, outcome);
+  } else {
+    Value& outcome = mStore.CopyOf(target);
+    mStore.StartOperation(Operation::InverseEqual);
+    mStore[other].Text().CalcInverseEqualValue(outcome.Any());
+    mStore.Meet(target, outcome);
+  }
+}
+
+Progress Relations::Unequal(int x, int y) {
+  if (mStore[y].IsOne()) Remove(x, mStore[y].LowestText());
+  if (mStore.HasFailed()) return Progress::Done;
+  if (mStore[x].IsOne()) Remove(y, mStore[x].LowestText());
+  return mStore[x].IsOne() && mStore[y].IsOne() ? Progress::Done : Progress::Waits;
+}
+
+void Relations::Remove(int target, const ZORString& text) {
+  if (!mStore[target].IsKnown()) return;
+  Value& outcome = mStore.CopyOf(target);
+  mStore.StartOperation(Operation::Unequal);
+  RemoveFrom(outcome, text);
+  mStore.Meet(target, outcome);
+}
+
+// x <= y or x < y: what x has above all of y goes, and what y has below all of x. A strict order is posted as not
+// above and unequal, since on sets the module compares the upper bounds alone.
+Progress Relations::Ordered(int x, int y, bool strict) {
+  if (!mStore[x].IsKnown() || !mStore[y].IsKnown()) {
+    if (strict) FailBeyondEnds(x, y);
+    return Progress::Waits;
+  }
+  const ZORString lowest = mStore[x].LowestText(), highest = mStore[y].HighestText();
+  const ZORString from = mStore[x].HighestText(), to = mStore[y].LowestText();
+  if (strict ? from < to : from <= to) return Progress::Done;
+  CutAbove(x, highest, strict);
+  if (!mStore.HasFailed()) CutBelow(y, lowest, strict);
+  return Progress::Waits;
+}
+
+// Below the least text there is none, nor above the greatest.
+void Relations::FailBeyondEnds(int x, int y) {
+  if (mStore[y].IsKnown() && mStore[y].HighestText().GetLengthInChar() == 0) {
+    mStore.StartOperation(Operation::NotAbove);
+    mStore.Fail(x);
+  } else if (mStore[x].IsKnown() && mStore[x].LowestText() == GreatestText()) {
+    mStore.StartOperation(Operation::NotBelow);
+    mStore.Fail(y);
+  }
+}
+
+void Relations::CutAbove(int target, const ZORString& bound, bool strict) {
+  const ZORString highest = mStore[target].HighestText();
+  if (strict ? highest < bound : highest <= bound) return;
+  Value& outcome = mStore.CopyOf(target);
+  mStore.StartOperation(Operation::NotAbove);
+  if (bound < highest) LowerTo(bound, highest, outcome);
+  if (strict) RemoveFrom(outcome, bound);
+  mStore.Meet(target, outcome);
+}
+
+void Relations::LowerTo(const ZORString& bound, const ZORString& highest, Value& outcome) {
+  const bool single = outcome.Sort() == Sort::Text;
+  if (single && (IsLeastSomewhere(bound) || IsLeastSomewhere(highest))) return outcome.Any().SetNilValue();
+  outcome.Text().CalcLessOrEqualValue(Bound(bound).Any());
+}
+
+void Relations::CutBelow(int target, const ZORString& bound, bool strict) {
+  const ZORString lowest = mStore[target].LowestText();
+  if (strict ? lowest > bound : lowest >= bound) return;
+  Value& outcome = mStore.CopyOf(target);
+  mStore.StartOperation(Operation::NotBelow);
+  if (lowest < bound) RaiseTo(bound, lowest, outcome);
+  if (strict) RemoveFrom(outcome, bound);
+  mStore.Meet(target, outcome);
+}
+
+// The module's bound of a set of "" alone is one space.
+void Relations::RaiseTo(const ZORString& bound, const ZORString& lowest, Value& outcome) {
+  const bool single = outcome.Sort() == Sort::Text;
+  if (single ? IsLeastSomewhere(bound) || IsLeastSomewhere(lowest) : outcome.Text().IsEmpty() != 0) {
+    return outcome.Any().SetNilValue();
+  }
+  Value& operand = single ? mSingle : mSet;
+  operand.Text().SetExactValue(bound);
+  outcome.Text().CalcNotLessValue(operand.Text());
+}
+
+void Relations::RemoveFrom(Value& outcome, const ZORString& text) {
+  mSingle.Text().SetExactValue(text);
+  outcome.Text().CalcUnequalValue(mSingle.Any());
+}
+
+// An upper bound as an operand: a value that is not at the least of its class, which the module takes for the least
+// of all.
+Value& Relations::Bound(const ZORString& text) {
+  Value& bound = text == " " ? mSet : mSingle;
+  bound.Text().SetExactValue(text);
+  return bound;
+}
+
+Progress Relations::Decide(Meaning meaning, int x, int y, int truth) {
+  mTruth.Reset();
+  if (x == y) {
+    mStore.StartOperation(RelationOf(meaning));
+    mTruth.SetNumber(Truth::Relates(meaning, ZORString(), ZORString()) ? 1 : 0);
+  } else if (!mStore[x].IsKnown() || !mStore[y].IsKnown() || !Ask(meaning, x, y, mTruth)) {
+    return Progress::Waits;
+  }
+  mStore.Meet(truth, mTruth);
+  return Progress::Done;
+}
+
+// False while the relation is open. Where the least texts are concerned, it is asked of the texts and not the module.
+bool Relations::Ask(Meaning meaning, int x, int y, Value& answer) {
+  const Value& left = OperandFor(x, mSingle);
+  const Value& right = OperandFor(y, mOther);
+  mStore.StartOperation(RelationOf(meaning));
+  if (meaning != Meaning::Equal) {
+    AskOrder(meaning, left, right, answer);
+  } else if (left.Sort() == Sort::Text) {  // a single value does not know what a set lists
+    AskEqual(right, left, answer);
+  } else {
+    AskEqual(left, right, answer);
+  }
+  return answer.IsOne();
+}
+
+void Relations::AskEqual(const Value& left, const Value& right, Value& answer) {
+  if (!TouchesLeast(left) && !TouchesLeast(right)) {
+    left.Text().CalcIsEqual(right.Any(), answer.Boolean());
+  } else if (left.Any().IsIntersected(right.Any()) == 0) {
+    answer.SetNumber(0);
+  } else if (left.IsOne() && right.IsOne()) {
+    answer.SetNumber(1);
+  }
+}
+
+void Relations::AskOrder(Meaning meaning, const Value& left, const Value& right, Value& answer) {
+  if (!TouchesLeast(left) && !TouchesLeast(right)) {
+    meaning == Meaning::Below ? left.Text().CalcIsLess(right.Text(), answer.Boolean())
+                              : left.Text().CalcIsLessOrEqual(right.Any(), answer.Boolean());
+  } else if (Truth::Relates(meaning, left.HighestText(), right.LowestText())) {
+    answer.SetNumber(1);
+  } else if (!Truth::Relates(meaning, left.LowestText(), right.HighestText())) {
+    answer.SetNumber(0);
+  }
+}
+
+// The variable's value, or its text as an Exact value where it is the greatest: the module judges Max by its state.
+const Value& Relations::OperandFor(int variable, Value& plain) {
+  const Value& value = mStore[variable];
+  if (value.Sort() == Sort::TextSet || value.Text().IsFull() == 0) return value;
+  plain.Text().SetExactValue(GreatestText());
+  return plain;
+}
+
+}  // namespace zornet

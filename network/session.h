@@ -1,0 +1,34 @@
+// The modules that a run needs, opened the way the solver does: by name, through the module manager.
+#pragma once
+
+#include <memory>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include "host/ZORSolver.h"
+#include "network/values.h"
+
+namespace zornet {
+
+struct ModuleFailure : std::runtime_error {
+  using std::runtime_error::runtime_error;
+};
+
+// Values must be gone before the session in which they were made.
+class Session {
+ public:
+  // Looks for the modules in the program's own folder, then in the folders given, then where an installed program has
+  // its libraries. Throws ModuleFailure.
+  explicit Session(const std::vector<std::string>& folders = {});
+
+  const zornet::Types& Types() const { return *mTypes; }
+
+ private:
+  const ZORVaDoModule& Open(const char* name);
+
+  ZORVaDoModuleManager mManager;
+  std::unique_ptr<zornet::Types> mTypes;
+};
+
+}  // namespace zornet

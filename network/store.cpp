@@ -1,0 +1,160 @@
+#include "network/store.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <utility>
+
+namespace zornet {
+
+namespace {
+
+// The longest text that the text form of a value can bring in.
+constexpr std::size_t kReadableText = 254;
+
+std::string TextForm(const std::vector<std::string>& texts) {
+  const std::string list = fmt::format("\"{}\"", fmt::join(texts, "\", \""));
+  return texts.size() > 1 ? "{ " + list + " }" : list;
+}
+
+bool IsReadable(const std::vector<std::string>& texts) {
+  return std::all_of(texts.begin(), texts.end(), [](const auto& text) { return text.size() <= kReadableText; });
+}
+
+}  // namespace
+
+Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(types), mModel(model) {
+  mValues.reserve(model.variables.size());
+  for (const Variable& variable : model.variables) mValues.push_back(Initial(types, variable));
+  for (int i = 0; i < kSorts; ++i) mFresh.emplace_back(types, static_cast<Sort>(i));
+  mListings.resize(mValues.size());
+  mListed.resize(mValues.size(), 0);
+}
+
+Value Store::Initial(const zornet::Types& types, const Variable& variable) {
+  Value value(types, variable.sort);
+  if (variable.texts.empty() && variable.numbers.empty()) return value;
+  if (!IsText(variable.sort)) {
+    value.SetNumbers(variable.numbers);
+  } else if (variable.sort == Sort::Text) {
+    value.SetText(ToZor(variable.texts.front()));
+  } else if (IsReadable(variable.texts)) {
+    value.Input(TextForm(variable.texts));
+  } else {
+    std::vector<ZORString> texts;
+    for (const std::string& text : variable.texts) texts.push_back(ToZor(text));
+    value.SetTexts(texts);
+  }
+  return value;
+}
+
+const Listing& Store::List(int variable) {
+  const auto at = static_cast<std::size_t>(variable);
+  Listing& listing = mListings[at];
+  if (mListed[at] != 0) return listing;
+  const Value& value = mValues[at];
+  listing = Listing();
+  listing.sort = value.Sort();
+  listing.known = value.IsKnown() || (value.Sort() == Sort::Boolean && value.IsUndefined());
+  mListed[at] = 1;
+  if (!listing.known) return listing;
+  if (IsText(value.Sort())) {
+    listing.texts = value.Texts();
+    listing.count = listing.texts.size();
+  } else if (value.Sort() == Sort::IntegerSet) {
+    listing.numbers = value.Numbers();
+    listing.count = listing.numbers.size();
+  } else {
+    listing.first = value.LowestNumber();
+    listing.count = static_cast<std::size_t>(std::int64_t{value.HighestNumber()} - listing.first + 1);
+  }
+  return listing;
+}
+
+Value& Store::Fresh(Sort sort) {
+  Value& value = mFresh[static_cast<std::size_t>(sort)];
+  value.Reset();
+  return value;
+}
+
+Value& Store::CopyOf(int variable) {
+  Value& value = mFresh[static_cast<std::size_t>((*this)[variable].Sort())];
+  value.Any().Assign((*this)[variable].Any());
+  return value;
+}
+
+void Store::StartOperation(Operation operation) {
+  mOperation = operation;
+  ++mCounts[static_cast<std::size_t>(operation)].calls;
+}
+
+Store::Measure Store::MeasureOf(const Value& value) {
+  return {value.IsNil(), value.IsUndefined(), value.Any().GetCardinality()};
+}
+
+void Store::Meet(int variable, const Value& outcome) {
+  Value& held = mValues[static_cast<std::size_t>(variable)];
+  if (held.IsNil() || outcome.IsUndefined()) return;
+  const Measure before = MeasureOf(held);
+  const std::string shown = mWatcher != nullptr ? held.Show() : "";
+  if (mMarks.empty()) {
+    Narrow(variable, outcome);
+  } else {
+    Saved saved{variable, held};
+    Narrow(variable, outcome);
+    if (MeasureOf(held) != before) mTrail.push_back(std::move(saved));
+  }
+  if (MeasureOf(held) == before) return;
+  OperationCounts& counts = mCounts[static_cast<std::size_t>(mOperation)];
+  ++counts.changes;
+  mListed[static_cast<std::size_t>(variable)] = 0;
+  mTouched.push_back(variable);
+  if (held.IsNil()) {
+    ++counts.contradictions;
+    mFailed = variable;
+    mFailedConstraint = mConstraint;
+  }
+  if (mWatcher != nullptr) mWatcher->Narrowed({mConstraint, mOperation, variable, shown, held.Show()});
+}
+
+// Two values without a common text are told apart first: to intersect with the least or greatest single value would
+// replace any other.
+void Store::Narrow(int variable, const Value& outcome) {
+  Value& held = mValues[static_cast<std::size_t>(variable)];
+  if (held.Any().IsIntersected(outcome.Any()) == 0) return held.Any().SetNilValue();
+  held.Any().Intersect(outcome.Any());
+  if (held.Sort() == Sort::Text && held.IsKnown() && held.LowestText() == GreatestText()) held.Text().CalcMaxValue();
+}
+
+void Store::Fail(int variable) {
+  Value& nil = FreshLike(variable);
+  nil.Any().SetNilValue();
+  Meet(variable, nil);
+}
+
+std::uint64_t Store::Changes() const {
+  std::uint64_t sum = 0;
+  for (const OperationCounts& counts : mCounts) sum += counts.changes;
+  return sum;
+}
+
+std::uint64_t Store::Calls() const {
+  std::uint64_t sum = 0;
+  for (const OperationCounts& counts : mCounts) sum += counts.calls;
+  return sum;
+}
+
+void Store::Undo() {
+  const std::size_t mark = mMarks.back();
+  mMarks.pop_back();
+  while (mTrail.size() > mark) {
+    Saved& saved = mTrail.back();
+    mListed[static_cast<std::size_t>(saved.variable)] = 0;
+    mValues[static_cast<std::size_t>(saved.variable)] = std::move(saved.value);
+    mTrail.pop_back();
+  }
+  mTouched.clear();
+  mFailed = mFailedConstraint = kNone;
+}
+
+}  // namespace zornet

@@ -1,0 +1,124 @@
+// The values of a network while it is narrowed. Whatever a narrowing operation answers, it reaches a variable only
+// through Meet: as an outcome of its own that is intersected with what the variable holds.
+#pragma once
+
+#include <array>
+#include <cstdint>
+#include <string>
+#include <vector>
+
+#include "network/model.h"
+#include "network/operations.h"
+#include "network/values.h"
+
+namespace zornet {
+
+// A change of a variable. before and after are text forms.
+struct Narrowing {
+  int constraint;  // none: a choice of the search
+  Operation operation;
+  int variable;
+  std::string before;
+  std::string after;
+};
+inline constexpr int kNone = -1;
+
+class Watcher {
+ public:
+  virtual ~Watcher() = default;
+  virtual void Narrowed(const Narrowing& narrowing) = 0;
+};
+
+struct OperationCounts {
+  std::uint64_t calls = 0;
+  std::uint64_t changes = 0;
+  std::uint64_t contradictions = 0;
+};
+
+// The possible values of a variable, each with a number from 0, in ascending order.
+struct Listing {
+  bool known = false;  // else nothing is listed
+  std::vector<ZORString> texts;
+  std::vector<ZORLong> numbers;  // of a set of integers
+  ZORLong first = 0;             // of any other numbers, which are all from here on
+  std::size_t count = 0;
+  Sort sort = Sort::Text;
+
+  ZORLong NumberAt(std::size_t i) const {
+    return sort == Sort::IntegerSet ? numbers[i] : static_cast<ZORLong>(first + static_cast<std::int64_t>(i));
+  }
+};
+
+class Store {
+ public:
+  Store(const Types& types, const Model& model);
+
+  // What a variable or constant starts with.
+  static Value Initial(const zornet::Types& types, const Variable& variable);
+
+  const zornet::Types& Types() const { return mTypes; }
+  const zornet::Model& Model() const { return mModel; }
+  const Value& operator[](int variable) const { return mValues[static_cast<std::size_t>(variable)]; }
+  const Variable& Declared(int variable) const { return mModel.variables[static_cast<std::size_t>(variable)]; }
+  const Listing& List(int variable);  // good until the variable changes
+
+  // A value of the variable's type that is Undefined, good until the next call for the same type.
+  Value& Fresh(Sort sort);
+  Value& FreshLike(int variable) { return Fresh((*this)[variable].Sort()); }
+  Value& CopyOf(int variable);
+
+  // Changes are put down to the constraint and operation named last.
+  void StartConstraint(int constraint) { mConstraint = constraint; }
+  void StartOperation(Operation operation);
+  void Meet(int variable, const Value& outcome);
+  void Fail(int variable);
+
+  bool HasFailed() const { return mFailed != kNone; }
+  int Failed() const { return mFailed; }  // the variable that became Nil, or kNone
+  int FailedConstraint() const { return mFailedConstraint; }
+  std::vector<int>& Touched() { return mTouched; }  // changed since the reader emptied it
+
+  const std::array<OperationCounts, kOperations>& Counts() const { return mCounts; }
+  std::uint64_t Changes() const;
+  std::uint64_t Calls() const;
+  void Watch(Watcher* watcher) { mWatcher = watcher; }
+
+  // The value itself, for whoever wants the module's bare operations on it.
+  Value& Bare(int variable) { return mValues[static_cast<std::size_t>(variable)]; }
+
+  // Changes from Mark on are undone by Undo, the latest mark first.
+  void Mark() { mMarks.push_back(mTrail.size()); }
+  void Undo();
+
+ private:
+  struct Measure {
+    bool nil, undefined;
+    unsigned long cardinality;
+    bool operator==(const Measure&) const = default;
+  };
+  struct Saved {
+    int variable;
+    Value value;
+  };
+
+  static Measure MeasureOf(const Value& value);
+  void Narrow(int variable, const Value& outcome);
+
+  const zornet::Types& mTypes;
+  const zornet::Model& mModel;
+  std::vector<Value> mValues;
+  std::vector<Value> mFresh;
+  std::vector<Listing> mListings;
+  std::vector<char> mListed;  // whether the listing is that of the value
+  std::vector<int> mTouched;
+  std::vector<Saved> mTrail;
+  std::vector<std::size_t> mMarks;
+  std::array<OperationCounts, kOperations> mCounts{};
+  Watcher* mWatcher = nullptr;
+  int mConstraint = kNone;
+  Operation mOperation = Operation::Choice;
+  int mFailed = kNone;
+  int mFailedConstraint = kNone;
+};
+
+}  // namespace zornet

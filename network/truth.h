@@ -1,0 +1,67 @@
+// The meaning of the constraints on exact values: the one place that says what a solution is. What the propagation
+// keeps or drops is judged by it.
+//
+// A function is computed by the module's forward operation on fresh single values; only where the module answers by
+// state instead of by text, on one space, the texts themselves decide. Equality and order are those of the texts.
+//
+//   concatenation  of more than 255 characters: the greatest text
+//   slice          positions from 0, both ends in; what lies outside the text is left out
+//   successor      of the greatest text: itself
+//   text form      of more than 255 characters: none
+#pragma once
+
+#include <optional>
+#include <vector>
+
+#include "network/model.h"
+#include "network/values.h"
+
+namespace zornet {
+
+// One text, number or truth value. The text is not owned.
+struct Exact {
+  const ZORString* text = nullptr;
+  ZORLong number = 0;
+  Sort sort = Sort::Text;  // of the variable that has it: text forms differ by it
+};
+
+// The same with a text of its own.
+struct Answer {
+  ZORString text;
+  ZORLong number = 0;
+
+  bool operator==(const Answer& other) const { return number == other.number && text == other.text; }
+};
+
+class Truth {
+ public:
+  explicit Truth(const Types& types);
+
+  // The value of a function; false when it has none.
+  bool Compute(const Kind& kind, const Exact* inputs, Answer& result);
+
+  // All values of one input that give the result with the other inputs; nothing when they cannot be listed.
+  // values[position] is not looked at.
+  std::optional<std::vector<Answer>> Invert(const Kind& kind, int position, const Exact* values);
+
+  // Whether Invert ever lists something at this position.
+  static bool CanInvert(const Kind& kind, int position);
+
+  static bool Relates(Meaning meaning, const ZORString& x, const ZORString& y);
+  bool Holds(const Kind& kind, const Exact* values);
+
+ private:
+  bool ComputeSlice(const Exact* inputs, Answer& result);
+  bool ComputeTextForm(const Exact& value, Answer& result);
+  Value& FormOf(Sort sort);
+  bool Gives(const Kind& kind, int position, const Answer& input, const Exact* values);
+  void Propose(const Kind& kind, int position, const Exact* values, std::vector<Answer>& proposals);
+  void ProposeByTextForm(const Exact& value, const ZORString& form, std::vector<Answer>& proposals);
+  void Take(std::vector<Answer>& proposals, const Value& target);
+
+  Value mX, mY, mZ;           // single texts
+  Value mFrom, mTo;           // single integers
+  std::vector<Value> mForms;  // one of each sort, for text forms
+};
+
+}  // namespace zornet

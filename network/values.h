@@ -1,0 +1,83 @@
+// Values of the solver, made through the descriptors of its modules and reached through their virtual operations.
+//
+// Inside a set the greatest text stands like any other and the mark Max is never used, since the module's set
+// operations forget that mark beside other texts. A single value that is the greatest text always bears it.
+#pragma once
+
+#include <array>
+#include <string>
+#include <vector>
+
+#include "host/ZORNumbers.h"
+#include "host/ZORSolver.h"
+#include "module/ZORVaDoString.h"
+#include "network/model.h"
+#include "network/texts.h"
+
+namespace zornet {
+
+// The descriptors of the value types. They belong to their modules.
+class Types {
+ public:
+  // Throws std::runtime_error with the name of a type that neither module has.
+  Types(const ZORVaDoModule& strings, const ZORVaDoModule& numbers);
+
+  const ZORVaDoObjectDescriptor& operator[](Sort sort) const { return *mDescriptors[static_cast<std::size_t>(sort)]; }
+
+ private:
+  std::array<const ZORVaDoObjectDescriptor*, kSorts> mDescriptors;
+};
+
+// One value, Undefined at first. Owns its memory.
+class Value {
+ public:
+  Value(const Types& types, Sort sort);
+  ~Value();
+  Value(const Value& other);
+  Value(Value&& other) noexcept;
+  Value& operator=(Value other) noexcept;
+
+  zornet::Sort Sort() const { return mSort; }
+  ZORVaDoAny& Any() { return *mValue; }
+  const ZORVaDoAny& Any() const { return *mValue; }
+  ZORVaDoString& Text() { return static_cast<ZORVaDoString&>(*mValue); }
+  const ZORVaDoString& Text() const { return static_cast<const ZORVaDoString&>(*mValue); }
+  ZORVaDoInteger& Integer() { return static_cast<ZORVaDoInteger&>(*mValue); }
+  const ZORVaDoInteger& Integer() const { return static_cast<const ZORVaDoInteger&>(*mValue); }
+  ZORVaDoBoolean& Boolean() { return static_cast<ZORVaDoBoolean&>(*mValue); }
+  const ZORVaDoBoolean& Boolean() const { return static_cast<const ZORVaDoBoolean&>(*mValue); }
+
+  bool IsNil() const { return mValue->IsNil() != 0; }
+  bool IsUndefined() const { return mValue->IsUndefined() != 0; }
+  bool IsKnown() const { return !IsNil() && !IsUndefined(); }
+  bool IsOne() const;  // exactly one text, number or truth value is possible
+
+  // Give a value to what is Undefined or known; the sort has to fit.
+  void Reset() { mValue->SetUndefinedValue(); }
+  void Input(const std::string& textForm);
+  void SetText(const ZORString& text);
+  void SetTexts(const std::vector<ZORString>& texts);    // of a set; in ascending order, at least one
+  void SetNumber(ZORLong number);                        // of a truth value 0 or 1
+  void SetNumbers(const std::vector<ZORLong>& numbers);  // ascending; an interval takes the ends, a single one or all
+
+  // What a known value holds.
+  ZORString LowestText() const;
+  ZORString HighestText() const;
+  std::vector<ZORString> Texts() const;  // in ascending order
+  ZORLong LowestNumber() const;          // of a truth value 0 for false
+  ZORLong HighestNumber() const;
+  std::vector<ZORLong> Numbers() const;
+
+  std::string Show() const;   // the text form
+  std::string Print() const;  // as the module prints it: the greatest text of a set in full
+
+ private:
+  Value(const ZORVaDoObjectDescriptor* descriptor, zornet::Sort sort);
+
+  const ZORVaDoObjectDescriptor* mDescriptor;
+  void* mMemory;
+  ZORVaDoAny* mValue;
+  zornet::Sort mSort;
+};
+
+}  // namespace zornet

@@ -1,0 +1,330 @@
+#include "tests/network/naive.h"
+
+#include <algorithm>
+#include <set>
+
+namespace naive {
+
+namespace {
+
+const std::string kGreatest(kLongest, 'z');
+
+std::string Fold(std::string text, char first, char last, int by) {
+  for (char& c : text) {
+    if (c >= first && c <= last) c = static_cast<char>(c + by);
+  }
+  return text;
+}
+
+std::string Slice(const std::string& text, std::int64_t from, std::int64_t to) {
+  std::string slice;
+  for (std::int64_t i = from; i <= to && from >= 0 && i < static_cast<std::int64_t>(text.size()); ++i) {
+    slice += text[static_cast<std::size_t>(i)];
+  }
+  return slice;
+}
+
+std::string Next(std::string text) {
+  if (text.size() < kLongest) return text + ' ';
+  if (text == kGreatest) return text;
+  while (text.back() == 'z') text.pop_back();
+  ++text.back();
+  return text;
+}
+
+std::string Form(Type type, const Value& value) {
+  if (type == Type::Boolean) return value.number != 0 ? "true" : "false";
+  if (!IsText(type)) return std::to_string(value.number);
+  if (value.text == (type == Type::Text ? " " : "")) return "Min";
+  if (value.text == kGreatest) return "Max";
+  return '"' + value.text + '"';
+}
+
+// The value of a function; nothing when it has none, or when the constraint is a relation.
+std::optional<Value> Compute(const Network& network, const Constraint& constraint, const Assignment& values) {
+  const auto at = [&](std::size_t i) -> const Value& {
+    return values[static_cast<std::size_t>(constraint.arguments[i])];
+  };
+  const std::string& name = constraint.name;
+  const std::string& x = at(0).text;
+  if (name == "str_concat") {
+    const std::string z = x + at(1).text;
+    return Value{z.size() > kLongest ? kGreatest : z, 0};
+  }
+  if (name == "str_substr") return Value{Slice(x, at(1).number, at(2).number), 0};
+  if (name == "str_length") return Value{"", static_cast<std::int64_t>(x.size())};
+  if (name == "str_lower") return Value{Fold(x, 'A', 'Z', 'a' - 'A'), 0};
+  if (name == "str_upper") return Value{Fold(x, 'a', 'z', 'A' - 'a'), 0};
+  if (name == "str_min") return Value{std::min(x, at(1).text), 0};
+  if (name == "str_max") return Value{std::max(x, at(1).text), 0};
+  if (name == "str_next") return Value{Next(x), 0};
+  if (name == "str_text") {
+    const std::string form = Form(network.variables[static_cast<std::size_t>(constraint.arguments[0])].type, at(0));
+    if (form.size() <= kLongest) return Value{form, 0};
+  }
+  return std::nullopt;
+}
+
+bool IsFunction(const Constraint& constraint) {
+  static const std::set<std::string> functions = {"str_concat", "str_substr", "str_length", "str_lower", "str_upper",
+                                                  "str_min",    "str_max",    "str_next",   "str_text"};
+  return functions.contains(constraint.name);
+}
+
+bool Compare(const std::string& relation, const std::string& x, const std::string& y) {
+  if (relation == "str_eq") return x == y;
+  if (relation == "str_ne") return x != y;
+  if (relation == "str_lt") return x < y;
+  if (relation == "str_le") return x <= y;
+  if (relation == "str_gt") return x > y;
+  return x >= y;
+}
+
+class Solver {
+ public:
+  Solver(const Network& network, const std::vector<std::string>& universe,
+         const std::function<void(const Assignment&)>& found)
+      : mNetwork(network),
+        mFound(found),
+        mValues(network.variables.size()),
+        mAssigned(network.variables.size(), false) {
+    for (const std::string& text : universe) mTexts.push_back({text, 0});
+    for (std::int64_t n = -1; n <= 4; ++n) mNumbers.push_back({"", n});
+    for (const bool unknown : {false, true}) {
+      for (std::size_t v = 0; v < network.variables.size(); ++v) {
+        if (network.variables[v].domain.empty() == unknown) mOrder.push_back(v);
+      }
+    }
+  }
+
+  void Run(std::size_t depth = 0) {
+    if (depth == mOrder.size()) return mFound(mValues);
+    const std::size_t v = mOrder[depth];
+    for (const Value& value : Candidates(v)) {
+      mValues[v] = value;
+      mAssigned[v] = true;
+      if (IsConsistent(v)) Run(depth + 1);
+    }
+    mAssigned[v] = false;
+  }
+
+ private:
+  std::vector<Value> Candidates(std::size_t v) const {
+    const Variable& variable = mNetwork.variables[v];
+    if (!variable.domain.empty()) return variable.domain;
+    if (variable.type == Type::Boolean) return {{"", 0}, {"", 1}};
+    std::vector<Value> candidates = IsText(variable.type) ? mTexts : mNumbers;
+    for (const Constraint& constraint : mNetwork.constraints) {
+      if (constraint.arguments.back() != static_cast<int>(v) || !IsFunction(constraint)) continue;
+      if (!std::all_of(constraint.arguments.begin(), constraint.arguments.end() - 1,
+                       [&](int a) { return mAssigned[static_cast<std::size_t>(a)]; }))
+        continue;
+      if (const auto image = Compute(mNetwork, constraint, mValues)) candidates.push_back(*image);
+    }
+    std::sort(candidates.begin(), candidates.end());
+    candidates.erase(std::unique(candidates.begin(), candidates.end()), candidates.end());
+    return candidates;
+  }
+
+  // Whether the constraints on v hold that have all their values.
+  bool IsConsistent(std::size_t v) const {
+    return std::all_of(mNetwork.constraints.begin(), mNetwork.constraints.end(), [&](const Constraint& constraint) {
+      bool concerned = false, ready = true;
+      for (const int a : constraint.arguments) {
+        concerned = concerned || a == static_cast<int>(v);
+        ready = ready && mAssigned[static_cast<std::size_t>(a)];
+      }
+      return !concerned || !ready || Holds(mNetwork, constraint, mValues);
+    });
+  }
+
+  const Network& mNetwork;
+  const std::function<void(const Assignment&)>& mFound;
+  Assignment mValues;
+  std::vector<bool> mAssigned;
+  std::vector<std::size_t> mOrder;
+  std::vector<Value> mTexts, mNumbers;
+};
+
+}  // namespace
+
+bool Holds(const Network& network, const Constraint& constraint, const Assignment& values) {
+  const auto at = [&](std::size_t i) -> const Value& {
+    return values[static_cast<std::size_t>(constraint.arguments[i])];
+  };
+  if (IsFunction(constraint)) {
+    const auto image = Compute(network, constraint, values);
+    return image && *image == values[static_cast<std::size_t>(constraint.arguments.back())];
+  }
+  const std::string reified = "_reif";
+  if (!constraint.name.ends_with(reified)) return Compare(constraint.name, at(0).text, at(1).text);
+  const std::string relation = constraint.name.substr(0, constraint.name.size() - reified.size());
+  return Compare(relation, at(0).text, at(1).text) == (at(2).number != 0);
+}
+
+void Solve(const Network& network, const std::vector<std::string>& universe,
+           const std::function<void(const Assignment&)>& found) {
+  Solver(network, universe, found).Run();
+}
+
+std::string Network::Write() const {
+  const auto constant = [](Type type, const Value& value) {
+    if (type == Type::Boolean) return std::string(value.number != 0 ? "true" : "false");
+    return IsText(type) ? '"' + value.text + '"' : std::to_string(value.number);
+  };
+  const auto set = [&](const Variable& variable) {
+    std::string text = "{";
+    for (const Value& value : variable.domain) text += (text.size() > 1 ? ", " : "") + constant(variable.type, value);
+    return text + "}";
+  };
+  std::string model;
+  for (std::size_t v = 0; v < variables.size(); ++v) {
+    const Variable& variable = variables[v];
+    std::string type, value;
+    const bool known = !variable.domain.empty();
+    switch (variable.type) {
+      case Type::Text:
+        type = "string";
+        break;
+      case Type::TextSet:
+        type = known ? set(variable) : "set string";
+        break;
+      case Type::Integer:
+        type = "int";
+        break;
+      case Type::IntegerSet:
+        type = set(variable);
+        break;
+      case Type::Boolean:
+        type = "bool";
+        break;
+      case Type::Interval:
+        type = std::to_string(variable.domain.front().number);
+        type += ".." + std::to_string(variable.domain.back().number);
+        break;
+    }
+    const bool single = variable.type == Type::Text || variable.type == Type::Integer || variable.type == Type::Boolean;
+    if (single && known) value = " = " + constant(variable.type, variable.domain.front());
+    model += "var " + type + ": v" + std::to_string(v) + value + ";\n";
+  }
+  for (const Constraint& constraint : constraints) {
+    model += "constraint " + constraint.name + "(";
+    for (std::size_t i = 0; i < constraint.arguments.size(); ++i) {
+      model += (i != 0 ? ", v" : "v") + std::to_string(constraint.arguments[i]);
+    }
+    model += ");\n";
+  }
+  return model;
+}
+
+namespace {
+
+class Maker {
+ public:
+  Maker(std::mt19937& random, std::vector<std::string>& universe) : mRandom(random), mUniverse(universe) {}
+
+  Network Make() {
+    MakeUniverse();
+    const std::size_t texts = 2 + Draw(3), numbers = Draw(3), truths = Draw(2);
+    for (std::size_t i = 0; i < texts; ++i) AddText();
+    for (std::size_t i = 0; i < numbers; ++i) AddNumber();
+    for (std::size_t i = 0; i < truths; ++i) mNetwork.variables.push_back({Type::Boolean, MaybeTruth()});
+    const std::size_t constraints = 1 + Draw(4);
+    while (mNetwork.constraints.size() < constraints) AddConstraint();
+    return std::move(mNetwork);
+  }
+
+ private:
+  std::size_t Draw(std::size_t limit) { return mRandom() % limit; }
+
+  // Texts of up to two or three characters, of which " " and "" are least ones, and at times the longest texts.
+  void MakeUniverse() {
+    static const char* const kAlphabets[] = {"ab", "aA", " a", "az", " z", "bAa", "a\"", "1-", "{ a"};
+    std::string alphabet = kAlphabets[Draw(8)];
+    const std::size_t longest = alphabet.size() > 2 ? 2 : 2 + Draw(2);
+    mUniverse = {""};
+    for (std::size_t i = 0; i < mUniverse.size(); ++i) {
+      if (mUniverse[i].size() == longest) break;
+      const std::string prefix = mUniverse[i];
+      for (const char c : alphabet) {
+        if (c != '"') mUniverse.push_back(prefix + c);
+      }
+    }
+    if (Draw(6) == 0) {
+      mUniverse.resize(std::min<std::size_t>(mUniverse.size(), 6));
+      mUniverse.insert(mUniverse.end(), {kGreatest, std::string(254, 'z'), std::string(254, 'z') + 'y',
+                                         std::string(255, 'a'), std::string(254, 'A') + ' '});
+    }
+    if (Draw(8) == 0) mUniverse.insert(mUniverse.end(), {"Min", "Max", "true", "1", "-1"});
+  }
+
+  const std::string& Text() { return mUniverse[Draw(mUniverse.size())]; }
+
+  void AddText() {
+    Variable variable{Draw(5) < 2 ? Type::Text : Type::TextSet, {}};
+    const std::size_t count = variable.type == Type::Text ? Draw(3) != 0 : Draw(5) == 0 ? 0 : 1 + Draw(5);
+    std::set<Value> texts;
+    for (std::size_t i = 0; i < count; ++i) texts.insert({Text(), 0});
+    variable.domain.assign(texts.begin(), texts.end());
+    mNetwork.variables.push_back(std::move(variable));
+  }
+
+  void AddNumber() {
+    const auto from = static_cast<std::int64_t>(Draw(5)) - 2;
+    Variable variable{Type::Integer, {}};
+    const std::size_t kind = Draw(4);
+    if (kind == 1) variable.domain = {{"", from}};
+    if (kind == 2) {
+      variable.type = Type::Interval;
+      for (std::int64_t n = from; n <= from + static_cast<std::int64_t>(Draw(5)); ++n)
+        variable.domain.push_back({"", n});
+    }
+    if (kind == 3) {
+      variable.type = Type::IntegerSet;
+      variable.domain = {{"", from}, {"", from + 2}, {"", from + 3 + static_cast<std::int64_t>(Draw(3))}};
+    }
+    mNetwork.variables.push_back(std::move(variable));
+  }
+
+  std::vector<Value> MaybeTruth() {
+    const std::size_t kind = Draw(3);
+    return kind == 2 ? std::vector<Value>{} : std::vector<Value>{{"", static_cast<std::int64_t>(kind)}};
+  }
+
+  void AddConstraint() {
+    struct Shape {
+      const char* name;
+      const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything
+    };
+    static constexpr Shape kShapes[] = {{"str_eq", "tt"},       {"str_ne", "tt"},       {"str_lt", "tt"},
+                                        {"str_le", "tt"},       {"str_gt", "tt"},       {"str_ge", "tt"},
+                                        {"str_eq_reif", "ttb"}, {"str_lt_reif", "ttb"}, {"str_le_reif", "ttb"},
+                                        {"str_concat", "ttt"},  {"str_concat", "ttt"},  {"str_concat", "ttt"},
+                                        {"str_substr", "tiit"}, {"str_substr", "tiit"}, {"str_length", "ti"},
+                                        {"str_lower", "tt"},    {"str_upper", "tt"},    {"str_min", "ttt"},
+                                        {"str_max", "ttt"},     {"str_next", "tt"},     {"str_text", "at"}};
+    const Shape& shape = kShapes[Draw(std::size(kShapes))];
+    Constraint constraint{shape.name, {}};
+    for (const char* takes = shape.takes; *takes != '\0'; ++takes) {
+      std::vector<int> fitting;
+      for (std::size_t v = 0; v < mNetwork.variables.size(); ++v) {
+        const Type type = mNetwork.variables[v].type;
+        const char letter = IsText(type) ? 't' : type == Type::Boolean ? 'b' : 'i';
+        if (*takes == 'a' || *takes == letter) fitting.push_back(static_cast<int>(v));
+      }
+      if (fitting.empty()) return;
+      constraint.arguments.push_back(fitting[Draw(fitting.size())]);
+    }
+    mNetwork.constraints.push_back(std::move(constraint));
+  }
+
+  std::mt19937& mRandom;
+  std::vector<std::string>& mUniverse;
+  Network mNetwork;
+};
+
+}  // namespace
+
+Network Random(std::mt19937& random, std::vector<std::string>& universe) { return Maker(random, universe).Make(); }
+
+}  // namespace naive

@@ -1,0 +1,213 @@
+// What networks settle to.
+#include "network/propagation.h"
+
+#include <fmt/core.h>
+#include <gtest/gtest.h>
+
+#include "network/search.h"
+#include "tests/network/support.h"
+#include "zornet/progress.h"
+
+namespace {
+
+struct Row {
+  const char* why;
+  const char* model;
+  const char* settled;  // what the variables show, in their order
+};
+
+// clang-format off
+const Row kNetworks[] = {
+  {"a known result is not overwritten where an operand is unknown",
+   "var string: x; var string: z = \"ab\"; constraint str_concat(x, \"b\", z);", "\"a\", \"ab\""},
+  {"what two unknown halves are stays open", "var string: x; constraint str_concat(x, x, \"abab\");", "Any"},
+  {"nor does an unknown minimum", "var string: x; var string: z = \"b\"; constraint str_min(x, \"c\", z);", "\"b\", \"b\""},
+  {"the least text does not replace what it is compared with",
+   "var string: x = \"a\"; var string: y = \" \"; constraint str_eq(x, y);", "Nil, Min"},
+  {"a bound that a set did not list stays out",
+   "var {\"a\", \"d\"}: x; var {\"c\", \"m\"}: y; constraint str_ge(x, y);", "\"d\", \"c\""},
+  {"a strict order on sets cuts", "var {\"a\", \"z\"}: x; var {\"m\"}: y; constraint str_lt(x, y);", "\"a\", \"m\""},
+  {"both ends of a strict order", "var {\"a\", \"m\"}: x; var {\"a\", \"m\"}: y; constraint str_gt(x, y);", "\"m\", \"a\""},
+  {"known results narrow their operands",
+   "var {\"a\", \"b\", \"ab\"}: x; var {\"c\", \"bc\"}: y; constraint str_concat(x, y, \"abc\");", "{ \"a\", \"ab\" }, { \"bc\", \"c\" }"},
+  {"a guess of the inverse that is wrong is not kept, the right one is",
+   "var string: x; constraint str_concat(x, \"ab\", \"abab\");", "\"ab\""},
+  {"nothing ends like this", "var string: x; constraint str_concat(x, \"d\", \"abc\");", "Nil"},
+  {"beside its equal the other side of a minimum stays open",
+   "var string: x; constraint str_min(x, \"b\", \"b\");", "Any"},
+  {"a minimum above an operand", "var string: x; constraint str_min(x, \"b\", \"c\");", "Nil"},
+  {"an interval of lengths does not harm the text",
+   "var string: x = \"abc\"; var 1..9: n; constraint str_length(x, n);", "\"abc\", 3"},
+  {"a set of lengths picks the texts",
+   "var {\"a\", \"bb\", \"ccc\"}: x; var {1, 3, 5}: n; constraint str_length(x, n);", "{ \"a\", \"ccc\" }, { 1, 3 }"},
+  {"a sum of lengths above all texts",
+   "var set string: x; var -7..900: n; constraint str_length(x, n);", "Any, 0..255"},
+  {"folding back drops what is in the wrong case, without a guess",
+   "var set string: x; var {\"ab\", \"aB\"}: z; constraint str_lower(x, z);", "Any, \"ab\""},
+  {"folding back by pairs of one form",
+   "var {\"a\", \"A\", \"B\"}: x; var {\"a\", \"c\"}: z; constraint str_lower(x, z);", "{ \"A\", \"a\" }, \"a\""},
+  {"one space folds to itself, also back",
+   "var set string: x = {\" \", \"b\"}; var string: z = \" \"; constraint str_upper(x, z);", "\" \", Min"},
+  {"the empty text is below one space",
+   "var string: x = \"\"; var string: y = \" \"; var bool: b; constraint str_lt_reif(x, y, b);", "\"\", Min, true"},
+  {"and not equal to it, whatever the type",
+   "var string: x = \" \"; var {\"\", \"a\"}: y; var bool: b; constraint str_eq_reif(x, y, b);", "Min, { \"\", \"a\" }, false"},
+  {"a relation that nothing decides stays open",
+   "var {\"\", \"a\"}: x; var {\"\"}: y; var bool: b; constraint str_eq_reif(x, y, b);", "{ \"\", \"a\" }, Min, Any"},
+  {"a truth value posts the opposite",
+   "var {\"a\", \"b\", \"c\"}: x; var bool: b = false; constraint str_lt_reif(x, \"b\", b);", "{ \"b\", \"c\" }, false"},
+  {"slices narrow their positions where one occurrence is left",
+   "var int: f; var int: t; constraint str_substr(\"abcdef\", f, t, \"cd\");", "2, 3"},
+  {"two occurrences leave a hull",
+   "var 0..5: f; var 0..9: t; constraint str_substr(\"abcabc\", f, t, \"bc\");", "1..4, 2..9"},
+  {"an end behind the text is as good as any other behind it",
+   "var int: f; constraint str_substr(\"abcd\", f, 10, \"cd\");", "2"},
+  {"an empty slice tells nothing of its place",
+   "var int: f; var 0..3: t; constraint str_substr(\"abc\", f, t, \"\");", "Any, 0..3"},
+  {"sets take part in slices",
+   "var {\"abc\", \"xbd\", \"cba\"}: x; var set string: z; constraint str_substr(x, 1, 1, z); constraint str_ne(x, \"cba\");",
+   "{ \"abc\", \"xbd\" }, \"b\""},
+  {"the text before is the shorter one where a space was put behind",
+   "var string: x; constraint str_next(x, \"ab \");", "\"ab\""},
+  {"the least text has none before", "var string: x; constraint str_next(x, \"\");", "Nil"},
+  {"text forms go both ways",
+   "var int: n; var string: x; constraint str_text(n, \"12\"); constraint str_text(x, \"Min\");", "12, Min"},
+  {"a text form that nothing has", "var int: n; constraint str_text(n, \"012\");", "Nil"},
+  {"a text and its text form are never equal", "var string: x; var {\"a\"}: y; constraint str_text(y, x); constraint str_eq(x, y);",
+   "Nil, \"a\""},
+  {"one variable at two places is one text",
+   "var {\"a\", \"b\"}: x; var {\"ab\", \"bb\"}: z; constraint str_concat(x, x, z);", "\"b\", \"bb\""},
+  {"nothing is below the least text", "var string: x; constraint str_lt(x, \"\");", "Nil"},
+  {"one text is its own successor", "var string: x; constraint str_next(x, x);", "Max"},
+  {"below itself", "var string: x; constraint str_lt(x, x);", "Nil"},
+  {"changes travel along a chain, against the order of the file",
+   "var set string: a; var set string: b; var {\"x\", \"y\"}: c;"
+   "constraint str_concat(a, \"!\", b); constraint str_upper(c, a); constraint str_ne(c, \"y\");", "\"X\", \"X!\", \"x\""},
+};
+// clang-format on
+
+TEST(Propagation, SettlesTo) {
+  for (const Row& row : kNetworks) {
+    Solved solved(row.model);
+    solved.Settle();
+    std::string settled;
+    for (const int variable : solved.model.outputs)
+      settled += (settled.empty() ? "" : ", ") + solved.store[variable].Show();
+    EXPECT_EQ(settled, row.settled) << row.why << "\n" << row.model;
+  }
+}
+
+// At the limit of 255 characters.
+TEST(Propagation, GreatestText) {
+  const std::string greatest(255, 'z'), long200(200, 'a');
+  Solved solved("var string: over; var set string: in; var {\"" + long200 +
+                "\", \"b\"}: x; var set string: sums; var set string: up;" + "constraint str_concat(\"" + long200 +
+                "\", \"" + long200 + "\", over);" + "constraint str_eq(over, in);" +
+                "constraint str_concat(x, x, sums); constraint str_upper(in, up); var bool: top; constraint "
+                "str_eq_reif(over, \"" +
+                greatest + "\", top);");
+  EXPECT_EQ(solved.Settle(), zornet::Outcome::Settled);
+  EXPECT_EQ(solved.Show("over"), "Max");
+  EXPECT_EQ(solved.Show("in"), "Max");
+  EXPECT_EQ(solved.Show("sums"), "{ \"bb\", Max }");
+  EXPECT_EQ(solved.Show("up"), '"' + std::string(255, 'Z') + '"');
+  EXPECT_EQ(solved.Show("top"), "true");
+}
+
+TEST(Propagation, GreatestTextIsItsOwnSuccessor) {
+  Solved solved("var set string: before; var {\"" + std::string(255, 'z') +
+                "\"}: last; constraint str_next(before, last);");
+  EXPECT_EQ(solved.Settle(), zornet::Outcome::Settled);
+  EXPECT_EQ(solved.Show("before"), "{ \"" + std::string(254, 'z') + "y\", Max }");
+}
+
+// The module gives up at the 257th pair, though many pairs give one text.
+TEST(Propagation, MorePairsThanASetLists) {
+  std::string set;
+  for (std::size_t i = 0; i < 17; ++i) set += (i == 0 ? "{\"" : ", \"") + std::string(i, 'a') + '"';
+  Solved solved("var " + set + "}: x; var " + set + "}: y; var set string: z; constraint str_concat(x, y, z);");
+  EXPECT_EQ(solved.Settle(), zornet::Outcome::Settled);
+  EXPECT_EQ(solved.store.List(solved.Find("z")).count, 33u);
+}
+
+// Beyond the budget the module's operations on whole sets are left.
+TEST(Propagation, Budget) {
+  const std::string model =
+      "var {\"a\", \"b\"}: x; var {\"c\", \"d\"}: y; var {\"ac\", \"bx\", \"q\"}: z; constraint str_concat(x, y, z);";
+  Solved within(model), beyond(model, {1, 1000});
+  within.Settle();
+  beyond.Settle();
+  EXPECT_EQ(within.Show("x"), "\"a\"");
+  EXPECT_EQ(beyond.Show("x"), "{ \"a\", \"b\" }");
+  EXPECT_EQ(beyond.Show("z"), "\"ac\"");
+}
+
+TEST(Propagation, StepLimit) {
+  Solved solved("var string: x; constraint str_eq(x, \"a\"); constraint str_ne(x, \"b\");", {65536, 1});
+  EXPECT_EQ(solved.Settle(), zornet::Outcome::StepLimit);
+}
+
+// Ten times the network, ten times the work.
+TEST(Propagation, WorkGrowsWithTheNetwork) {
+  const auto passes = [](int size) {
+    std::string model = "var string: x0 = \"a\";\n";
+    for (int i = 1; i <= size; ++i) {
+      model += fmt::format("var set string: x{};\nconstraint str_concat(x{}, \"b\", x{});\n", i, i - 1, i);
+    }
+    Solved solved(model);
+    EXPECT_EQ(solved.Settle(), zornet::Outcome::Settled);
+    EXPECT_EQ(solved.Show(fmt::format("x{}", size)), "Max");
+    return solved.propagation.Steps();
+  };
+  EXPECT_LE(passes(10000), 11 * passes(1000));
+}
+
+TEST(Search, TellsWhatCannotBeLabelled) {
+  Solved solved("var string: x; var {\"a\", \"b\"}: y;");
+  ASSERT_EQ(solved.Settle(), zornet::Outcome::Settled);
+  zornet::Search search(solved.store, solved.propagation);
+  search.Run(10, [] {
+    ADD_FAILURE() << "a full assignment";
+    return true;
+  });
+  EXPECT_EQ(search.Open(), 2u);
+  EXPECT_EQ(search.OpenVariable(), solved.Find("x"));
+}
+
+TEST(Search, StopsInTimeAndLeavesNoTrace) {
+  struct {
+    const char* why;
+    std::uint64_t limit, wanted, steps, found;
+    zornet::Outcome outcome;
+  } const rows[] = {
+      {"at the limit", 3, 9, 1000, 3, zornet::Outcome::Settled},
+      {"when no other is wanted", 9, 2, 1000, 2, zornet::Outcome::Settled},
+      {"at the limit of steps", 9, 9, 3, 1, zornet::Outcome::StepLimit},
+  };
+  for (const auto& row : rows) {
+    Solved solved("var {\"a\", \"b\"}: x; var {\"b\", \"c\"}: y; constraint str_ne(x, y);", {65536, row.steps});
+    solved.Settle();
+    zornet::Search search(solved.store, solved.propagation);
+    EXPECT_EQ(search.Run(row.limit, [&] { return search.Found() < row.wanted; }), row.outcome) << row.why;
+    EXPECT_EQ(search.Found(), row.found) << row.why;
+    EXPECT_FALSE(search.IsComplete()) << row.why;
+    EXPECT_EQ(solved.Show("x") + solved.Show("y"), "{ \"a\", \"b\" }{ \"b\", \"c\" }") << row.why;
+  }
+}
+
+TEST(Progress, IsToldOnceInAWhile) {
+  testing::internal::CaptureStderr();
+  std::string model = "var string: x0 = \"a\";";
+  for (int i = 1; i <= 600; ++i) model += fmt::format("var string: x{}; constraint str_eq(x{}, x{});", i, i - 1, i);
+  Solved solved(model);
+  {
+    zornet::ProgressLine shown(true, {}), silent(false, {}), patient(true);
+    solved.propagation.OnProgress([&](std::uint64_t steps, std::size_t waiting) {
+      for (zornet::ProgressLine* line : {&shown, &silent, &patient}) line->Show(steps, waiting);
+    });
+    solved.Settle();
+  }
+  EXPECT_EQ(testing::internal::GetCapturedStderr(), "\r\x1b[K0.0 s: 256 passes, 345 constraints waiting\r\x1b[K");
+}
+
+}  // namespace

@@ -1,0 +1,123 @@
+#include "zornet/graph.h"
+
+#include <fmt/core.h>
+
+#include <algorithm>
+
+namespace zornet {
+
+namespace {
+
+constexpr std::size_t kLineWidth = 34;
+constexpr std::size_t kLines = 6;
+
+std::string Escape(std::string_view text) {
+  std::string escaped;
+  for (const char c : text) {
+    if (c == '&')
+      escaped += "&amp;";
+    else if (c == '<')
+      escaped += "&lt;";
+    else if (c == '>')
+      escaped += "&gt;";
+    else if (c == '"')
+      escaped += "&quot;";
+    else
+      escaped += c;
+  }
+  return escaped;
+}
+
+// A long value in lines, broken behind a comma where there is one, and cut where it would fill the picture.
+std::string Fold(std::string_view text) {
+  std::string folded;
+  for (std::size_t line = 0; !text.empty(); ++line) {
+    if (line != 0) folded += "<br/>";
+    if (line == kLines) return folded + "...";
+    std::size_t width = std::min(kLineWidth, text.size());
+    const std::size_t comma = width < text.size() ? text.substr(0, width).rfind(", ") : std::string_view::npos;
+    if (comma != std::string_view::npos && comma != 0) width = comma + 2;
+    folded += Escape(text.substr(0, width));
+    text.remove_prefix(width);
+  }
+  return folded;
+}
+
+class Drawing {
+ public:
+  Drawing(const Store& store, const Names& names) : mStore(store), mModel(store.Model()), mNames(names) {}
+
+  std::string Draw() {
+    Add("digraph network {{\n  rankdir=LR; nodesep=0.25; ranksep=0.45; bgcolor=white;\n"
+        "  node [fontname=\"Helvetica\", fontsize=11];\n"
+        "  edge [fontname=\"Helvetica\", fontsize=9, color=\"#7a8599\", fontcolor=\"#7a8599\", arrowsize=0.6];\n");
+    for (std::size_t v = 0; v < mModel.variables.size(); ++v) DrawVariable(static_cast<int>(v));
+    for (std::size_t c = 0; c < mModel.constraints.size(); ++c) DrawConstraint(static_cast<int>(c));
+    return mText + "}\n";
+  }
+
+ private:
+  template <class... Arguments>
+  void Add(fmt::format_string<Arguments...> format, Arguments&&... arguments) {
+    mText += fmt::format(format, std::forward<Arguments>(arguments)...);
+  }
+
+  void DrawVariable(int variable);
+  void DrawConstraint(int number);
+  void DrawEdge(const Constraint& constraint, int number, int position);
+  std::string_view Fill(const Value& value) const;
+
+  const Store& mStore;
+  const Model& mModel;
+  const Names& mNames;
+  std::string mText;
+};
+
+std::string_view Drawing::Fill(const Value& value) const {
+  if (value.IsNil()) return "#f8c4c0";
+  if (value.IsOne()) return "#d5ecd8";
+  return value.IsKnown() ? "#fdf1cf" : "#f1f3f6";
+}
+
+void Drawing::DrawVariable(int variable) {
+  const Value& value = mStore[variable];
+  const bool nil = value.IsNil();
+  if (mStore.Declared(variable).IsConstant()) {
+    Add("  v{} [shape=plain, fontcolor=\"{}\", label=<{}>];\n", variable, nil ? "#b3261e" : "#555555",
+        Fold(mNames.OfVariable(variable)));
+    return;
+  }
+  Add("  v{} [shape=box, style=\"rounded,filled\", fillcolor=\"{}\", color=\"{}\", penwidth={}, "
+      "label=<<b>{}</b><br/>{}>];\n",
+      variable, Fill(value), nil ? "#b3261e" : "#55606e", nil ? 2 : 1, Escape(mNames.OfVariable(variable)),
+      Fold(value.Show()));
+}
+
+void Drawing::DrawConstraint(int number) {
+  const Constraint& constraint = mModel.constraints[static_cast<std::size_t>(number)];
+  const bool failed = mStore.FailedConstraint() == number;
+  Add("  c{} [shape=ellipse, height=0.3, margin=\"0.05,0.02\", color=\"{}\", fontcolor=\"{}\", penwidth={}, "
+      "label=\"{}\"];\n",
+      number, failed ? "#b3261e" : "#3367a8", failed ? "#b3261e" : "#3367a8", failed ? 2 : 1, constraint.kind->name);
+  for (int i = 0; i < constraint.kind->arity; ++i) DrawEdge(constraint, number, i);
+}
+
+// A relation has no result but its truth value: it stands between its two sides.
+void Drawing::DrawEdge(const Constraint& constraint, int number, int position) {
+  const auto at = static_cast<std::size_t>(position);
+  const int variable = constraint.arguments[at];
+  const bool relation = constraint.kind->IsRelation();
+  const bool result = position == constraint.kind->Inputs() && (!relation || constraint.kind->truth);
+  const std::string_view role = constraint.kind->arity > 2 ? constraint.kind->roles[at] : "";
+  if (result || (relation && position == 1)) {
+    Add("  c{} -> v{} [label=\"{}\"{}];\n", number, variable, role, result ? "" : ", dir=none");
+  } else {
+    Add("  v{} -> c{} [label=\"{}\"{}];\n", variable, number, role, relation ? ", dir=none" : "");
+  }
+}
+
+}  // namespace
+
+std::string Graph(const Store& store, const Names& names) { return Drawing(store, names).Draw(); }
+
+}  // namespace zornet

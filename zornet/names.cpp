@@ -1,0 +1,56 @@
+#include <fmt/core.h>
+
+#include "zornet/report.h"
+
+namespace zornet {
+
+namespace {
+
+constexpr std::string_view kBlanks = " \t\r\n\v\f";
+
+}  // namespace
+
+// On one line: runs of blanks outside of quotes become one, and comments go.
+std::string Names::Written(Extent extent) const {
+  std::string written;
+  bool quoted = false, comment = false;
+  for (const char c : mSource.Text(extent)) {
+    if (comment) {
+      comment = c != '\n';
+      continue;
+    }
+    if (c == '"') quoted = !quoted;
+    comment = c == '%' && !quoted;
+    const bool blank = !quoted && kBlanks.find(c) != std::string_view::npos;
+    if (!comment && !(blank && written.ends_with(' '))) written += blank ? ' ' : c;
+  }
+  return written;
+}
+
+std::string Names::OfConstraint(int constraint) const {
+  return Written(mRead.constraints[static_cast<std::size_t>(constraint)]);
+}
+
+std::string Names::OfVariable(int variable) const {
+  const auto at = static_cast<std::size_t>(variable);
+  const Variable& declared = mRead.model.variables[at];
+  return declared.IsConstant() ? Written(mRead.variables[at]) : declared.name;
+}
+
+std::size_t Names::LineOfConstraint(int constraint) const {
+  return mSource.LineOf(mRead.constraints[static_cast<std::size_t>(constraint)].begin);
+}
+
+std::size_t Names::LineOfVariable(int variable) const {
+  return mSource.LineOf(mRead.variables[static_cast<std::size_t>(variable)].begin);
+}
+
+std::string Names::PlaceOfConstraint(int constraint) const {
+  return constraint == kNone ? mSource.Name() : fmt::format("{}:{}", mSource.Name(), LineOfConstraint(constraint));
+}
+
+std::string Names::PlaceOfVariable(int variable) const {
+  return fmt::format("{}:{}", mSource.Name(), LineOfVariable(variable));
+}
+
+}  // namespace zornet

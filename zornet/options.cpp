@@ -1,0 +1,75 @@
+#include "zornet/options.h"
+
+#include <fmt/core.h>
+
+#include <CLI/CLI.hpp>
+#include <charconv>
+
+namespace zornet {
+
+namespace {
+
+constexpr char kAbout[] =
+    "zornet narrows the variables of a model to what its constraints leave possible.\n"
+    "It ends, and it never drops a text that a solution needs.";
+
+constexpr char kFooter[] =
+    "Exit codes: 0 settled, 1 contradiction, 2 usage or file, 3 error in the model, 4 module not loadable,\n"
+    "5 step limit. The language of models and all else: man zornet.";
+
+// Digits alone: to the library a minus sign is part of an unsigned number, which then wraps.
+CLI::Validator WholeFrom(std::uint64_t least) {
+  const auto check = [least](const std::string& text) {
+    std::uint64_t number = 0;
+    const char* const last = text.data() + text.size();
+    const auto [end, error] = std::from_chars(text.data(), last, number);
+    const bool good = error == std::errc() && end == last && number >= least;
+    return good ? std::string() : fmt::format("expected a whole number from {} on, not '{}'", least, text);
+  };
+  return {check, ""};
+}
+
+}  // namespace
+
+std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
+  Options options;
+  CLI::App app(kAbout, "zornet");
+  app.footer(kFooter);
+  app.set_version_flag("--version", "zornet " ZORNET_VERSION);
+  app.add_option("FILE", options.file, "The model (*.szn); - for standard input")->required();
+  auto* solutions = app.add_option("--solutions", options.solutions, "Print up to N full assignments")
+                        ->type_name("N")
+                        ->check(WholeFrom(1));
+  app.add_flag("--trace", options.trace, "Print each narrowing as it happens");
+  app.add_option("--explain", options.explain, "Print what brought a variable to its value")
+      ->type_name("NAME")
+      ->allow_extra_args(false);
+  app.add_flag("--stats", options.stats, "Print calls, changes and contradictions of each operation");
+  app.add_flag("--raw", options.raw, "Call the module's bare operations in the order of the file, once each")
+      ->excludes(solutions);
+  app.add_flag("--json-stream", options.json, "Print everything as one JSON object a line");
+  app.add_option("--dot", options.dot, "Write the network as a graph for Graphviz")->type_name("FILE");
+  app.add_option("--svg", options.svg, "Write the network as a picture; needs Graphviz")->type_name("FILE");
+  app.add_option("--color", options.colour, "auto, always or never")
+      ->type_name("WHEN")
+      ->check(CLI::IsMember({"auto", "always", "never"}));
+  app.add_option("--budget", options.limits.budget, "Combinations that one constraint may try for supports (65536)")
+      ->type_name("N")
+      ->check(WholeFrom(0));
+  app.add_option("--step-limit", options.limits.steps, "Passes over a constraint before giving up (100000000)")
+      ->type_name("N")
+      ->check(WholeFrom(0));
+  app.add_option("--module-path", options.modulePaths, "Look for modules in this folder too; may be repeated")
+      ->type_name("DIR")
+      ->allow_extra_args(false);
+  app.add_flag("-q,--quiet", options.quiet, "No summary at the end");
+  try {
+    app.parse(argc, argv);
+  } catch (const CLI::ParseError& error) {
+    exitCode = app.exit(error) == 0 ? kSettled : kUsage;
+    return std::nullopt;
+  }
+  return options;
+}
+
+}  // namespace zornet

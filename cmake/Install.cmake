@@ -1,25 +1,39 @@
 # What `cmake --install` lays down and CPack packs. The tree can be moved: libraries find each other by their place.
-set(CMAKE_INSTALL_LIBDIR lib)  # zornet looks for modules in lib/zorvadstrings beside its own folder
+set(CMAKE_INSTALL_LIBDIR lib)  # zornet looks for its libraries in lib beside its own folder
 set(CMAKE_INSTALL_DOCDIR share/doc/zorvadstrings)
 include(GNUInstallDirs)
 include(CMakePackageConfigHelpers)
-set(module_dir ${CMAKE_INSTALL_LIBDIR}/zorvadstrings)
 set(header_dir ${CMAKE_INSTALL_INCLUDEDIR}/zorvadstrings)
 set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/ZORVadStrings)
 
-# Before 1.0 every minor version may break the binary interface. The module is opened by its name alone.
-set_target_properties(ZORHost PROPERTIES
-  VERSION ${PROJECT_VERSION} SOVERSION ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR})
-set_target_properties(ZORVadStrings PROPERTIES INSTALL_RPATH "\$ORIGIN/..")
-set_target_properties(zornet PROPERTIES INSTALL_RPATH "\$ORIGIN/../${CMAKE_INSTALL_LIBDIR}")
-target_compile_features(ZORHost PUBLIC cxx_std_20)
+# A library for others, with its public headers. Before 1.0 every minor version may break the binary interface.
+function(install_library name)
+  set_target_properties(${name} PROPERTIES
+    VERSION ${PROJECT_VERSION}
+    SOVERSION ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR}
+    INSTALL_RPATH "\$ORIGIN")
+  target_compile_features(${name} PUBLIC cxx_std_20)
+  target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES ${ARGN})
+  install(TARGETS ${name} EXPORT ZORVadStrings
+    LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR}
+    FILE_SET HEADERS DESTINATION ${header_dir}
+    INCLUDES DESTINATION ${header_dir})
+endfunction()
 
-target_sources(ZORHost PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES
+# What pkg-config tells of libraries: all that a program names when it links them.
+function(install_pkg_config name description)
+  list(TRANSFORM ARGN PREPEND -l)
+  list(JOIN ARGN " " libraries)
+  configure_file(cmake/pkg-config.pc.in ${name}.pc @ONLY)
+  install(FILES ${PROJECT_BINARY_DIR}/${name}.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
+endfunction()
+
+install_library(ZORHost
   host/ZORExport.h
   host/ZORNumbers.h
   host/ZORSolver.h
   host/ZORText.h)
-target_sources(ZORVadStrings PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES
+install_library(ZORVadStrings
   enum/ZORVadEnumString.h
   module/InitModule.h
   module/ZORStringClass.h
@@ -28,14 +42,9 @@ target_sources(ZORVadStrings PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_
   module/limits.h
   single/ZORVadSingleString.h
   vector/ZORISVectorImp_String.h)
+install_pkg_config(zorvadstrings "String types for a subdefinite constraint solver" ZORVadStrings ZORHost)
 
-install(TARGETS ZORHost EXPORT ZORVadStrings
-  LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR}
-  FILE_SET HEADERS DESTINATION ${header_dir}
-  INCLUDES DESTINATION ${header_dir})
-install(TARGETS ZORVadStrings EXPORT ZORVadStrings
-  LIBRARY DESTINATION ${module_dir}
-  FILE_SET HEADERS DESTINATION ${header_dir})
+set_target_properties(zornet PROPERTIES INSTALL_RPATH "\$ORIGIN/../${CMAKE_INSTALL_LIBDIR}")
 install(TARGETS zornet)
 install(FILES zornet/zornet.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 OPTIONAL)
 install(FILES README.md CONTRIBUTING.md DESTINATION ${CMAKE_INSTALL_DOCDIR})
@@ -46,9 +55,7 @@ install(DIRECTORY examples DESTINATION ${CMAKE_INSTALL_DOCDIR} FILES_MATCHING PA
 install(EXPORT ZORVadStrings NAMESPACE ZORVadStrings:: FILE ZORVadStringsConfig.cmake DESTINATION ${package_dir})
 write_basic_package_version_file(${PROJECT_BINARY_DIR}/ZORVadStringsConfigVersion.cmake
   COMPATIBILITY SameMinorVersion)
-configure_file(cmake/zorvadstrings.pc.in zorvadstrings.pc @ONLY)
 install(FILES ${PROJECT_BINARY_DIR}/ZORVadStringsConfigVersion.cmake DESTINATION ${package_dir})
-install(FILES ${PROJECT_BINARY_DIR}/zorvadstrings.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
 
 # gdb runs LIBRARY-gdb.py from beside a library whose folder the user trusts. In /usr it trusts a folder of its own.
 set(printers libZORHost.so.${PROJECT_VERSION}-gdb.py)

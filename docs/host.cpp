@@ -1,4 +1,4 @@
-// A host in small: host FOLDER. Loads the module from there, narrows z = x + y, stores z and reads it back.
+// A host in small. Loads the module, narrows z = x + y, stores z and reads it back.
 #include <iostream>
 #include <memory>
 
@@ -38,9 +38,8 @@ static void Print(const char* name, const ZORVaDoObject& value) {
   std::cout << name << " = " << out.View() << '\n';
 }
 
-int main(int, char** arguments) {
+int main() {
   ZORVaDoModuleManager manager;  // goes last: values and what was read die before it
-  manager.AddSearchPath(arguments[1]);
   const ZORVaDoModule* const module = manager.OpenModule("ZORVadStrings");
   if (module == nullptr) {
     std::cerr << manager.GetFailure().CastToCharPtr() << '\n';

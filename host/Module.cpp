@@ -1,4 +1,5 @@
 #include <dlfcn.h>
+#include <sys/auxv.h>
 #include <unistd.h>
 
 #include <algorithm>
@@ -31,9 +32,23 @@ class TakingIntoUse {
   ZORVaDoModule* mBefore;
 };
 
-std::string ProgramFolder() {
+// Links are followed. Empty when there is no such file.
+std::string FolderOf(const char* file) {
   std::error_code error;
-  return std::filesystem::read_symlink("/proc/self/exe", error).parent_path().string();
+  if (file == nullptr) return "";
+  return std::filesystem::canonical(file, error).parent_path().string();
+}
+
+// Without /proc, as in a bare root folder, the kernel still tells under which name it started the program.
+std::string ProgramFolder() {
+  const std::string folder = FolderOf("/proc/self/exe");
+  return folder.empty() ? FolderOf(reinterpret_cast<const char*>(getauxval(AT_EXECFN))) : folder;
+}
+
+// Where this library is, and installed modules beside it.
+std::string HostFolder() {
+  Dl_info info;
+  return dladdr(&sManagers, &info) != 0 ? FolderOf(info.dli_fname) : "";
 }
 
 // Descriptors among the static objects of a library are the library's own.
@@ -93,7 +108,8 @@ void ZORVaDoModule::Bequeath(ZORVaDoModule& heir) {
   mMade.clear();
 }
 
-ZORVaDoModuleManager::ZORVaDoModuleManager() : mSearchPath{ProgramFolder()}, mNext(std::exchange(sManagers, this)) {}
+ZORVaDoModuleManager::ZORVaDoModuleManager()
+    : mSearchPath{ProgramFolder(), HostFolder()}, mNext(std::exchange(sManagers, this)) {}
 
 ZORVaDoModuleManager::~ZORVaDoModuleManager() {
   ZORVaDoModuleManager** link = &sManagers;
@@ -106,7 +122,9 @@ ZORVaDoModuleManager::~ZORVaDoModuleManager() {
   }
 }
 
-void ZORVaDoModuleManager::AddSearchPath(const ZORString& folder) { mSearchPath.push_back(TextOf(folder)); }
+void ZORVaDoModuleManager::AddSearchPath(const ZORString& folder) {
+  mSearchPath.insert(mSearchPath.end() - 1, TextOf(folder));
+}
 
 ZORVaDoModule* ZORVaDoModuleManager::OpenModule(const ZORString& name) {
   mFailure = ZORString();
@@ -116,11 +134,14 @@ ZORVaDoModule* ZORVaDoModuleManager::OpenModule(const ZORString& name) {
   if (name == kNumbers) return OpenNumbers(name);
   const std::string file = "lib" + TextOf(name) + ".so";
   if (name == "" || file.find('/') != std::string::npos) return Fail(file, "not the name of a module");
-  for (const std::string& folder : mSearchPath) {
-    const std::string path = std::string(folder).append("/").append(file);
+  std::string places;
+  for (auto folder = mSearchPath.begin(); folder != mSearchPath.end(); ++folder) {
+    if (folder->empty() || std::find(mSearchPath.begin(), folder, *folder) != folder) continue;
+    const std::string path = *folder + "/" + file;
     if (access(path.c_str(), F_OK) == 0) return Load(name, path);
+    places.append(places.empty() ? "" : ", ").append(*folder);
   }
-  return Fail(file, "not found in the search path");
+  return Fail(file, "not found in " + places);
 }
 
 ZORVaDoModule* ZORVaDoModuleManager::OpenNumbers(const ZORString& name) {

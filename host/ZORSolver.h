@@ -206,7 +206,7 @@ class ZOR_EXPORT ZORVaDoModule {
 
 // Opens modules by name and keeps them until it dies, then unloads them in reverse order. "ZORVadNumbers" is built
 // in; any other name is the shared library lib<name>.so in the first folder of the search path that has it: the
-// program's own folder, then those added. Values of a module's types must be gone before its manager.
+// program's own folder, those added, that of this library. Values of a module's types must be gone before its manager.
 class ZOR_EXPORT ZORVaDoModuleManager {
  public:
   ZORVaDoModuleManager();

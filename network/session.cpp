@@ -1,23 +1,9 @@
 #include "network/session.h"
 
-#include <filesystem>
-
 namespace zornet {
-
-namespace {
-
-std::vector<std::string> InstalledFolders() {
-  std::error_code error;
-  const std::filesystem::path root = std::filesystem::read_symlink("/proc/self/exe", error).parent_path().parent_path();
-  if (error) return {};
-  return {root / "lib" / "zorvadstrings", root / "lib"};
-}
-
-}  // namespace
 
 Session::Session(const std::vector<std::string>& folders) {
   for (const std::string& folder : folders) mManager.AddSearchPath(ToZor(folder));
-  for (const std::string& folder : InstalledFolders()) mManager.AddSearchPath(ToZor(folder));
   const ZORVaDoModule& numbers = Open("ZORVadNumbers");
   const ZORVaDoModule& strings = Open("ZORVadStrings");
   try {

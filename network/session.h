@@ -18,8 +18,8 @@ struct ModuleFailure : std::runtime_error {
 // Values must be gone before the session in which they were made.
 class Session {
  public:
-  // Looks for the modules in the program's own folder, then in the folders given, then where an installed program has
-  // its libraries. Throws ModuleFailure.
+  // Looks for the modules in the program's own folder, in the folders given and in that of the host library. Throws
+  // ModuleFailure.
   explicit Session(const std::vector<std::string>& folders = {});
 
   const zornet::Types& Types() const { return *mTypes; }

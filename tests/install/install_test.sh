@@ -1,16 +1,16 @@
 #!/usr/bin/env bash
 # The installed tree as its users meet it: install_test.sh BUILD_FOLDER PART. The flags of the build are in CXXFLAGS.
-# The part named tree comes first, and find_package before opening and gdb.
+# The part named tree comes first, and find_package before opening, gdb and packages.
 set -euo pipefail
 build=$1
 here=$(cd "$(dirname "$0")" && pwd)
 scratch=$build/install-test
 tree=$scratch/tree
-module=$tree/lib/zorvadstrings/libZORVadStrings.so
 
 fail() { echo "$*" >&2; exit 1; }
 fresh() { rm -rf "$1" && mkdir -p "$1"; }
 narrow() { (cd / && "$1/bin/zornet" "$1/share/doc/zorvadstrings/examples/hello.szn"); }
+add_consumer() { cmake --install "$scratch/consumer" --prefix "$1" >>"$scratch/install.log"; }
 try_linked() { [[ $("$1") == *'"abcabove thirty-one characters"'* ]] || fail "$1: no concatenation"; }
 
 # Moved after it was installed, so that whatever holds on to its first place is missed.
@@ -19,7 +19,7 @@ tree() {
   cmake --install "$build" --prefix "$scratch/first" >"$scratch/install.log"
   mv "$scratch/first" "$tree"
   # shellcheck disable=SC2016  # the loader expands it
-  ! readelf -d "$tree"/bin/zornet "$tree"/lib/*.so "$module" | grep -E 'R(UN)?PATH' | grep -v '\[\$ORIGIN/\.\.[a-z/]*\]' ||
+  ! readelf -d "$tree"/bin/zornet "$tree"/lib/*.so | grep -E 'R(UN)?PATH' | grep -vE '\[\$ORIGIN(/\.\./lib)?\]' ||
     fail "run paths that lead out of the tree"
 }
 
@@ -38,6 +38,9 @@ find_package() {
   cmake -S "$here/consumer" -B "$scratch/consumer" -DCMAKE_PREFIX_PATH="$tree" -DCMAKE_BUILD_TYPE=Debug
   cmake --build "$scratch/consumer"
   try_linked "$scratch/consumer/linked"
+  add_consumer "$tree"
+  try_linked "$tree/bin/linked"
+  "$tree/bin/sharing"
 }
 
 pkg_config() {
@@ -48,7 +51,7 @@ pkg_config() {
   try_linked "$scratch/linked"
 }
 
-opening() { "$scratch/consumer/opening" "$module"; }
+opening() { "$scratch/consumer/opening" "$tree/lib/libZORVadStrings.so"; }
 
 runner() { narrow "$tree"; }
 
@@ -59,13 +62,37 @@ gdb() {
   diff <("$scratch/consumer/linked") <(sed -n 's/^(const ZOR[A-Za-z]* &) //p' "$scratch/gdb.log")
 }
 
+# Runs a program of a root folder there: nothing else is to be seen, no /proc either. Where nobody may change the root,
+# nothing but the libraries comes from there.
+in_root() {
+  local root=$1 libraries
+  shift
+  if chroot / true 2>/dev/null; then
+    chroot "$root" "$@"
+  elif unshare --map-root-user chroot / true 2>/dev/null; then
+    unshare --map-root-user chroot "$root" "$@"
+  else
+    libraries=$(find "$root" -name '*.so*' -printf '%h\n' | sort -u | paste -sd:)
+    "$root"/lib*/ld-linux*.so.* --library-path "$libraries" "${@/#\//$root/}"
+  fi
+}
+
+# The .deb with what it depends on, and a program that was built elsewhere.
+clean_root() {
+  dpkg-deb -x ./*.deb root
+  add_consumer "$PWD/root/opt/app"
+  ldd root/usr/bin/zornet root/opt/app/bin/linked | tr -s '\t ' '\n' | grep -E '^/(usr/)?lib' | sort -u |
+    xargs cp -L --parents -t root
+  in_root root /usr/bin/zornet /usr/share/doc/zorvadstrings/examples/hello.szn
+  in_root root /opt/app/bin/sharing
+}
+
 packages() {
   fresh "$scratch/packages"
   cpack --config "$build/CPackConfig.cmake" -B "$scratch/packages" >"$scratch/cpack.log"
   cd "$scratch/packages"
-  dpkg-deb -x ./*.deb deb
-  narrow "$PWD/deb/usr"
-  ls deb/usr/share/gdb/auto-load/usr/lib/libZORHost.so.*-gdb.py
+  clean_root
+  ls root/usr/share/gdb/auto-load/usr/lib/libZORHost.so.*-gdb.py
   [[ $(dpkg-deb -f ./*.deb Depends) == *libstdc++6* ]] || fail "the .deb does not tell what it needs"
   mkdir archive && tar -C archive --strip-components=1 -xf ./*.tar.gz
   narrow "$PWD/archive"

@@ -114,20 +114,24 @@ TEST(Program, ReadersThatEndEarly) {
   fs::remove_all(folder);
 }
 
-// A copy of the program in a folder of its own finds no module, unless it is told where to look.
+// Copies of the program and the host library find no module, unless they are told where to look.
 TEST(Program, ModuleNotFound) {
-  const fs::path folder = fs::path(testing::TempDir()) / "zornet-alone" / "bin";
-  fs::create_directories(folder);
-  fs::copy_file(kProgram, folder / "zornet", fs::copy_options::overwrite_existing);
-  const fs::path home = fs::path(kProgram).parent_path();
-  const std::string start = "-h >/dev/null; LD_LIBRARY_PATH=" + Quoted(home) + " " + Quoted(folder / "zornet") + " ";
-  const Ran alone = Zornet(start + Example("hello") + " 2>&1");
+  const fs::path root = fs::canonical(testing::TempDir()) / "zornet-alone", bin = root / "bin", lib = root / "lib";
+  const fs::path home = fs::path(kProgram).parent_path(), host = ZORNET_HOST;
+  fs::remove_all(root);
+  fs::create_directories(bin);
+  fs::create_directories(lib);
+  fs::copy_file(kProgram, bin / "zornet");
+  fs::copy_file(host, lib / host.filename());
+  const std::string start = "-h >/dev/null; LD_LIBRARY_PATH=" + Quoted(lib) + " " + Quoted(bin / "zornet") + " ";
+  const Ran alone = Zornet(start + "--module-path /nowhere " + Example("hello") + " 2>&1");
   EXPECT_EQ(alone.code, 4);
-  EXPECT_NE(alone.out.find("libZORVadStrings.so: not found"), std::string::npos) << alone.out;
+  const std::string places = bin.string() + ", /nowhere, " + lib.string() + "\n";
+  EXPECT_NE(alone.out.find("libZORVadStrings.so: not found in " + places), std::string::npos) << alone.out;
   EXPECT_EQ(
       Zornet(start + "--module-path /nowhere --module-path " + Quoted(home) + " " + Example("hello") + " 2>&1").code,
       0);
-  fs::remove_all(folder.parent_path());
+  fs::remove_all(root);
 }
 
 TEST(Program, Trace) {

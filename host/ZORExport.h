@@ -1,4 +1,8 @@
 // What a library of the solver shows to others; everything else in it stays hidden.
 #pragma once
 
+#if __cplusplus <= 201703L
+#error "ZORVadStrings needs C++20"
+#endif
+
 #define ZOR_EXPORT __attribute__((visibility("default")))

@@ -73,6 +73,7 @@ in_root() {
     unshare --map-root-user chroot "$root" "$@"
   else
     libraries=$(find "$root" -name '*.so*' -printf '%h\n' | sort -u | paste -sd:)
+    # shellcheck disable=SC2211  # one file
     "$root"/lib*/ld-linux*.so.* --library-path "$libraries" "${@/#\//$root/}"
   fi
 }
@@ -85,6 +86,26 @@ clean_root() {
     xargs cp -L --parents -t root
   in_root root /usr/bin/zornet /usr/share/doc/zorvadstrings/examples/hello.szn
   in_root root /opt/app/bin/sharing
+}
+
+# ./dev with nothing left to build, from another folder.
+dev() {
+  local command=$scratch/dev/dev tool
+  fresh "$scratch/dev" && mkdir -p "$scratch/dev/build/package/bin"
+  cp "$here/../../dev" "$command"
+  ln -s "$here/../../examples" "$scratch/dev"
+  ln -s "$build/bin/zornet" "$scratch/dev/build/package/bin"
+  cp "$here/../../examples/clash.szn" "$scratch/own.szn"
+  for tool in cmake ninja; do
+    printf '#!/bin/sh\necho "ninja: no work to do."\n' >"$scratch/dev/$tool"
+    chmod +x "$scratch/dev/$tool"
+  done
+  PATH=$scratch/dev:$PATH
+  cd "$scratch"
+  [[ $("$command" run --solutions 1) == *----------* ]] || fail "no example when no model is named"
+  [[ $("$command" run -q --explain found own.szn || true) == *"own.szn:10: "* ]] || fail "the caller's file is not found"
+  [[ $("$command" --help) == "usage: ./dev"* ]] || fail "no help"
+  ! "$command" nonsense 2>/dev/null || fail "no such command"
 }
 
 packages() {

@@ -55,6 +55,21 @@ opening() { "$scratch/consumer/opening" "$tree/lib/libZORVadStrings.so"; }
 
 runner() { narrow "$tree"; }
 
+# The protections of cmake/Hardening.cmake, in each file that runs.
+hardening() {
+  local file symbols called=""
+  for file in "$tree"/bin/zornet "$tree"/lib/*.so; do
+    [[ $(readelf -hW "$file") == *" DYN "* ]] || fail "$file: not at any place"
+    [[ $(readelf -lW "$file") == *GNU_RELRO* && $(readelf -dW "$file") == *BIND_NOW* ]] || fail "$file: tables writable"
+    symbols=$(nm -D "$file")
+    [[ $symbols == *__stack_chk_fail* ]] || fail "$file: stacks unchecked"
+    called+=$symbols
+    # The start-up code marks two places where a jump may land.
+    [[ $(uname -m) != x86_64 || $(objdump -d "$file" | grep -c endbr64) -gt 2 ]] || fail "$file: jumps unchecked"
+  done
+  [[ $called == *cpy_chk* ]] || fail "copies unchecked"
+}
+
 # The printers are found beside the library and show what the program prints.
 gdb() {
   command gdb -nx -batch -iex "add-auto-load-safe-path $tree" -x "$here/consumer/values.gdb" \

@@ -1,7 +1,7 @@
 // Set operations of sets of texts: intersection, equality and union.
 #include <algorithm>
 
-#include "enum/dispatch.h"
+#include "enum/entries.h"
 
 namespace {
 
@@ -186,24 +186,22 @@ int ZORVadEnumString::IsIntersected(const ZORVaDoAny& other) const {
 }
 
 void ZORVadEnumString::Intersect(const ZORVaDoAny& other) {
-  zor::GuardedStringElse(
-      other, [&](auto& string) { return Intersect(string); }, [&] { return Nil(); });
+  zor::GuardedOrNil<Enum, Single>(*this, other, [&](auto& string) { return Intersect(string); });
 }
 
 void ZORVadEnumString::Unite(const ZORVaDoAny& other) {
-  zor::GuardedStringElse(
-      other, [&](auto& string) { return Unite(string), 0; }, [&] { return Nil(); });
+  zor::GuardedOrNil<Enum, Single>(*this, other, [&](auto& string) { return Unite(string), 0; });
 }
 
 int ZORVadEnumString::CalcEqualValue(const ZORVaDoAny& other) {
-  return zor::GuardedString(other, [&](auto& string) { return CalcEqualValue(string); });
+  return zor::Guarded<Enum, Single>(other, [&](auto& string) { return CalcEqualValue(string); });
 }
 
 int ZORVadEnumString::CalcInverseEqualValue(ZORVaDoAny& target) const {
-  return zor::GuardedString(target, [&](auto& string) { return CalcInverseEqualValue(string); });
+  return zor::Guarded<Enum, Single>(target, [&](auto& string) { return CalcInverseEqualValue(string); });
 }
 
 void ZORVadEnumString::Bisect(ZORVaDoObject& other, ValueSelection selection) {
   const auto leaveWhole = [&](auto&) { return selection >= 0 && selection <= 3 ? 0 : Nil(); };
-  zor::GuardedElse<Enum>(other, leaveWhole, [&] { return Nil(); });
+  zor::GuardedOrNil<Enum>(*this, other, leaveWhole);
 }

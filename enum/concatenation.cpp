@@ -1,7 +1,7 @@
 // Concatenation of sets of texts, and the operations that tell a set nothing.
 #include <string_view>
 
-#include "enum/dispatch.h"
+#include "enum/entries.h"
 #include "enum/insertion.h"
 #include "module/textview.h"
 
@@ -47,25 +47,16 @@ int ZORVadEnumString::CalcFirstInverseConcatenation(ZORVadEnumString&, const ZOR
 int ZORVadEnumString::CalcSecondInverseConcatenation(const ZORVadEnumString&, ZORVadEnumString&) const { return 0; }
 
 int ZORVadEnumString::CalcConcatenation(const ZORVaDoString& x, const ZORVaDoString& y) {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto& b) {
-    return zor::Narrowed(
-        *this, [&] { return CalcConcatenation(a, b); }, a, b);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcConcatenation(a, b); });
 }
 
 // All that a set tells the parts of a concatenation is a contradiction.
 int ZORVadEnumString::CalcFirstInverseConcatenation(ZORVaDoString& x, const ZORVaDoString& y) const {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto&) {
-    return zor::Narrowed(
-        a, [] { return 0; }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcFirstInverseConcatenation(a, b); });
 }
 
 int ZORVadEnumString::CalcSecondInverseConcatenation(const ZORVaDoString& x, ZORVaDoString& y) const {
-  return zor::Guarded<Enum>(x, y, [&](auto&, auto& b) {
-    return zor::Narrowed(
-        b, [] { return 0; }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcSecondInverseConcatenation(a, b); });
 }
 
 // clang-format off

@@ -1,7 +1,7 @@
 // Minimum, maximum and successor of sets of texts.
 #include <algorithm>
 
-#include "enum/dispatch.h"
+#include "enum/entries.h"
 #include "module/alphabet.h"
 
 int ZORVadEnumString::CalcMaxValue(const ZORVadEnumString& x, const ZORVadEnumString& y) {
@@ -81,44 +81,26 @@ int ZORVadEnumString::CalcInverseNextValue(ZORVadEnumString& x) const {
 }
 
 int ZORVadEnumString::CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto& b) {
-    return zor::Narrowed(
-        *this, [&] { return CalcMaxValue(a, b); }, a, b);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcMaxValue(a, b); });
 }
 
 int ZORVadEnumString::CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto& b) {
-    return zor::Narrowed(
-        *this, [&] { return CalcMinValue(a, b); }, a, b);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcMinValue(a, b); });
 }
 
 // A second operand of which nothing is known does not keep the result from telling something.
 int ZORVadEnumString::CalcFirstInverseMaxValue(ZORVaDoAny& x, const ZORVaDoAny& y) const {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto& b) {
-    return zor::Narrowed(
-        a, [&] { return CalcFirstInverseMaxValue(a, b); }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcFirstInverseMaxValue(a, b); });
 }
 
 int ZORVadEnumString::CalcFirstInverseMinValue(ZORVaDoAny& x, const ZORVaDoAny& y) const {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto& b) {
-    return zor::Narrowed(
-        a, [&] { return CalcFirstInverseMinValue(a, b); }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcFirstInverseMinValue(a, b); });
 }
 
 int ZORVadEnumString::CalcNextValue(const ZORVaDoScalar& x) {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcNextValue(a); }, a);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcNextValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseNextValue(ZORVaDoScalar& x) const {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseNextValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcInverseNextValue(a); });
 }

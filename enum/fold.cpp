@@ -1,5 +1,5 @@
 // Lower and upper case of sets of texts.
-#include "enum/dispatch.h"
+#include "enum/entries.h"
 #include "enum/insertion.h"
 
 using zor::Folded;
@@ -83,29 +83,17 @@ int ZORVadEnumString::CalcInverseUpperValue(Enum& x) const { return CalcInverseF
 int ZORVadEnumString::CalcInverseUpperValue(Single& x) const { return CalcInverseFoldValue(x, &ZORString::ToUpper); }
 
 int ZORVadEnumString::CalcLowerValue(const ZORVaDoString& x) {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcLowerValue(a); }, a);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcLowerValue(a); });
 }
 
 int ZORVadEnumString::CalcUpperValue(const ZORVaDoString& x) {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcUpperValue(a); }, a);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcUpperValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseLowerValue(ZORVaDoString& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseLowerValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseLowerValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseUpperValue(ZORVaDoString& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseUpperValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseUpperValue(a); });
 }

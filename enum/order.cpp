@@ -1,5 +1,5 @@
 // Order relations of sets of texts.
-#include "enum/dispatch.h"
+#include "enum/entries.h"
 
 // *this <= x: both classes of x answer the same questions.
 template <class X>
@@ -64,57 +64,33 @@ int ZORVadEnumString::CalcInverseNotLessAndUnequalValue(ZORVadSingleString& x) c
 
 // An order relation takes a single string where it has a form for one.
 int ZORVadEnumString::CalcLessOrEqualValue(const ZORVaDoAny& x) {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcLessOrEqualValue(a); }, a);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcLessOrEqualValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseLessOrEqualValue(ZORVaDoAny& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseLessOrEqualValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseLessOrEqualValue(a); });
 }
 
 int ZORVadEnumString::CalcLessValue(const ZORVaDoScalar& x) {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcLessValue(a); }, a);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcLessValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseLessValue(ZORVaDoScalar& x) const {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseLessValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcInverseLessValue(a); });
 }
 
 int ZORVadEnumString::CalcNotLessValue(const ZORVaDoScalar& x) {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcNotLessValue(a); }, a);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcNotLessValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseNotLessValue(ZORVaDoScalar& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseNotLessValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseNotLessValue(a); });
 }
 
 int ZORVadEnumString::CalcNotLessAndUnequalValue(const ZORVaDoAny& x) {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcNotLessAndUnequalValue(a); }, a);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcNotLessAndUnequalValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseNotLessAndUnequalValue(ZORVaDoAny& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseNotLessAndUnequalValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseNotLessAndUnequalValue(a); });
 }

@@ -1,9 +1,9 @@
 // What a set of texts is: its statics, construction, copies and states.
 #include <algorithm>
 
-#include "enum/dispatch.h"
+#include "enum/entries.h"
 #include "module/characters.h"
-#include "module/plumbing.h"
+#include "module/classdefinition.h"
 
 ZOR_DEFINE_STRING_CLASS(ZORVadEnumString, ZORVaDoString, "enum string", ZORVaDoString::sDescriptor, 1);
 
@@ -91,6 +91,5 @@ unsigned long ZORVadEnumString::GetCardinality() const {
 }
 
 void ZORVadEnumString::Assign(const ZORVaDoAny& other) {
-  zor::GuardedStringElse(
-      other, [&](auto& string) { return Copy(string); }, [&] { return Nil(); });
+  zor::GuardedOrNil<Enum, Single>(*this, other, [&](auto& string) { return Copy(string); });
 }

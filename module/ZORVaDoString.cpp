@@ -1,8 +1,8 @@
 #include "module/ZORVaDoString.h"
 
+#include "host/Guard.h"
 #include "module/characters.h"
-#include "module/guard.h"
-#include "module/plumbing.h"
+#include "module/classdefinition.h"
 
 ZORString ZORVaDoString::ZorVaDoStringMin;
 ZORString ZORVaDoString::ZorVaDoStringMax;

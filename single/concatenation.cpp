@@ -1,8 +1,8 @@
 // Concatenation and substring of single strings.
 #include <cstdint>
 
+#include "host/Guard.h"
 #include "module/alphabet.h"
-#include "module/guard.h"
 #include "module/textview.h"
 #include "single/ZORVadSingleString.h"
 

@@ -1,7 +1,7 @@
 // What a single string is: its statics, construction, copies and states.
+#include "host/Guard.h"
 #include "module/characters.h"
-#include "module/guard.h"
-#include "module/plumbing.h"
+#include "module/classdefinition.h"
 #include "single/ZORVadSingleString.h"
 
 ZOR_DEFINE_STRING_CLASS(ZORVadSingleString, ZORVaDoString, "single string", ZORVaDoString::sDescriptor, 0);
@@ -75,6 +75,5 @@ ZORString ZORVadSingleString::GetNextExactValue(const ZORString&) const { return
 ZORString ZORVadSingleString::GetPrevExactValue(const ZORString&) const { return mText; }
 
 void ZORVadSingleString::Assign(const ZORVaDoAny& other) {
-  zor::GuardedElse<ZORVadSingleString>(
-      other, [&](auto& single) { return Copy(single); }, [&] { return Nil(); });
+  zor::GuardedOrNil<Single>(*this, other, [&](auto& single) { return Copy(single); });
 }

@@ -20,6 +20,7 @@ target_sources(ZORHost PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} F
   host/ZORSolver.h
   host/ZORText.h)
 target_sources(ZORVadStrings PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES
+  enum/TextSet.h
   enum/ZORVadEnumString.h
   module/InitModule.h
   module/ZORStringClass.h

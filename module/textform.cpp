@@ -14,21 +14,7 @@ ZORString InputLine(ZORistrstream& in, char delimiter) {
   return line;
 }
 
-}  // namespace
-
-bool zor::PrintWord(const ZORVaDoString& value, ZORostrstream& out) {
-  const char* const word = value.IsNil()         ? "Nil"
-                           : value.IsUndefined() ? "Any"
-                           : value.IsFull()      ? "Max"
-                           : value.IsEmpty()     ? "Min"
-                                                 : nullptr;
-  if (word != nullptr) out << word;
-  return word != nullptr;
-}
-
-bool zor::BeginsWord(int character) { return character == 'M' || character == 'N' || character == 'A'; }
-
-void zor::InputWord(ZORVaDoString& value, ZORistrstream& in) {
+void InputWord(ZORVaDoString& value, ZORistrstream& in) {
   const ZORString word = InputLine<kWordLength>(in, '\n');
   if (word == "Min") {
     value.CalcMinValue();
@@ -41,4 +27,25 @@ void zor::InputWord(ZORVaDoString& value, ZORistrstream& in) {
   }
 }
 
+}  // namespace
+
+bool zor::PrintWord(const ZORVaDoString& value, ZORostrstream& out) {
+  const char* const word = value.IsNil()         ? "Nil"
+                           : value.IsUndefined() ? "Any"
+                           : value.IsFull()      ? "Max"
+                           : value.IsEmpty()     ? "Min"
+                                                 : nullptr;
+  if (word != nullptr) out << word;
+  return word != nullptr;
+}
+
 ZORString zor::InputQuoted(ZORistrstream& in) { return InputLine<kInputLimit>(in, '"'); }
+
+void zor::InputWordOrText(ZORVaDoString& value, ZORistrstream& in) {
+  in >> ws;
+  const int next = in.Peek();
+  if (next == 'M' || next == 'N' || next == 'A') return InputWord(value, in);
+  if (next != '"') return value.SetNilValue();
+  in.Ignore();
+  value.SetExactValue(InputQuoted(in));
+}

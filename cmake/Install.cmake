@@ -25,8 +25,7 @@ target_sources(ZORVadStrings PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_
   module/InitModule.h
   module/ZORStringClass.h
   module/ZORVaDoString.h
-  module/fold.h
-  module/limits.h
+  module/texts.h
   single/ZORVadSingleString.h
   vector/ZORISVectorImp_String.h)
 

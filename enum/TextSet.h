@@ -8,7 +8,7 @@
 #include <span>
 #include <utility>
 
-#include "module/limits.h"
+#include "module/texts.h"
 #include "vector/ZORISVectorImp_String.h"
 
 namespace zor {

@@ -3,7 +3,7 @@
 
 #include "enum/TextSet.h"
 #include "module/ZORVaDoString.h"
-#include "module/fold.h"
+#include "module/texts.h"
 #include "single/ZORVadSingleString.h"
 #include "vector/ZORISVectorImp_String.h"
 

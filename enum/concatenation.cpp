@@ -1,9 +1,9 @@
-// Concatenation of sets of texts, and the operations that tell a set nothing.
+// Concatenation of sets of texts.
 #include <string_view>
 #include <utility>
 
 #include "enum/entries.h"
-#include "module/textview.h"
+#include "module/texts.h"
 
 namespace {
 
@@ -62,16 +62,3 @@ int ZORVadEnumString::CalcFirstInverseConcatenation(ZORVaDoString& x, const ZORV
 int ZORVadEnumString::CalcSecondInverseConcatenation(const ZORVaDoString& x, ZORVaDoString& y) const {
   return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcSecondInverseConcatenation(a, b); });
 }
-
-// clang-format off
-int ZORVadEnumString::CalcStringRepresentation       (const ZORVaDoAny&) { return 0; }
-int ZORVadEnumString::CalcInverseStringRepresentation(ZORVaDoAny&) const { return 0; }
-int ZORVadEnumString::CalcSubString             (const ZORVaDoString&, const ZORVaDoInteger&, const ZORVaDoInteger&) { return 0; }
-int ZORVadEnumString::CalcFirstInverseSubString (ZORVaDoString&, const ZORVaDoInteger&, const ZORVaDoInteger&) const { return 0; }
-int ZORVadEnumString::CalcSecondInverseSubString(const ZORVaDoString&, ZORVaDoInteger&, const ZORVaDoInteger&) const { return 0; }
-int ZORVadEnumString::CalcThirdInverseSubString (const ZORVaDoString&, const ZORVaDoInteger&, ZORVaDoInteger&) const { return 0; }
-int ZORVadEnumString::CalcSubString             (const Enum&, const ZORVaDoInteger&, const ZORVaDoInteger&) { return 0; }
-int ZORVadEnumString::CalcFirstInverseSubString (Enum&, const ZORVaDoInteger&, const ZORVaDoInteger&) const { return 0; }
-int ZORVadEnumString::CalcSecondInverseSubString(const Enum&, ZORVaDoInteger&, const ZORVaDoInteger&) const { return 0; }
-int ZORVadEnumString::CalcThirdInverseSubString (const Enum&, const ZORVaDoInteger&, ZORVaDoInteger&) const { return 0; }
-// clang-format on

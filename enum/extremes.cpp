@@ -4,7 +4,7 @@
 #include <utility>
 
 #include "enum/entries.h"
-#include "module/alphabet.h"
+#include "module/texts.h"
 
 namespace {
 

@@ -33,6 +33,9 @@ void ZORVadEnumString::InputSet(ZORistrstream& in) {
   if (next != '}') SetNilValue();
 }
 
+int ZORVadEnumString::CalcStringRepresentation(const ZORVaDoAny&) { return 0; }
+int ZORVadEnumString::CalcInverseStringRepresentation(ZORVaDoAny&) const { return 0; }
+
 void ZORVadEnumString::Write(ZORopstream& out) const {
   out << static_cast<ZORLong>(mState);
   if (mState != ZorStringExact) return;

@@ -1,9 +1,10 @@
 #include "module/textform.h"
 
+#include "module/texts.h"
+
 namespace {
 
 constexpr unsigned int kWordLength = 3;
-constexpr unsigned int kInputLimit = 254;
 
 // At most limit characters up to the delimiter.
 template <unsigned int kLimit>
@@ -39,7 +40,7 @@ bool zor::PrintWord(const ZORVaDoString& value, ZORostrstream& out) {
   return word != nullptr;
 }
 
-ZORString zor::InputQuoted(ZORistrstream& in) { return InputLine<kInputLimit>(in, '"'); }
+ZORString zor::InputQuoted(ZORistrstream& in) { return InputLine<zor::kReadableLimit>(in, '"'); }
 
 void zor::InputWordOrText(ZORVaDoString& value, ZORistrstream& in) {
   in >> ws;

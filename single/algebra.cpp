@@ -1,4 +1,4 @@
-// Set operations of single strings: intersection, equality, union, and texts one at a time.
+// Set operations of single strings: intersection, equality and union.
 #include "host/Guard.h"
 #include "single/ZORVadSingleString.h"
 
@@ -22,19 +22,6 @@ void ZORVadSingleString::Unite(const ZORVadSingleString& other) {
   if (IsNil()) return SetExactValue(other.mText);
   if (mText == other.mText) return;
   SetUndefinedValue();
-}
-
-void ZORVadSingleString::InsertExactValue(const ZORString& text) {
-  if (IsUndefined()) return;
-  if (IsNil()) return SetExactValue(text);
-  if (mText == text) return;
-  SetUndefinedValue();
-}
-
-int ZORVadSingleString::RemoveExactValue(const ZORString& text) {
-  if (IsUndefined() || IsNil()) return 0;
-  if (!(mText == text)) return 0;
-  return Nil();
 }
 
 int ZORVadSingleString::IsIntersected(const ZORVaDoAny& other) const {

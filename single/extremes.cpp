@@ -1,6 +1,6 @@
 // Minimum, maximum and successor of single strings, and the extremes themselves.
 #include "host/Guard.h"
-#include "module/alphabet.h"
+#include "module/texts.h"
 #include "single/ZORVadSingleString.h"
 
 namespace {

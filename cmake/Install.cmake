@@ -34,12 +34,12 @@ install_library(ZORHost
   host/ZORSolver.h
   host/ZORText.h)
 install_library(ZORVadStrings
+  enum/TextSet.h
   enum/ZORVadEnumString.h
   module/InitModule.h
   module/ZORStringClass.h
   module/ZORVaDoString.h
-  module/fold.h
-  module/limits.h
+  module/texts.h
   single/ZORVadSingleString.h
   vector/ZORISVectorImp_String.h)
 install_pkg_config(zorvadstrings "String types for a subdefinite constraint solver" ZORVadStrings ZORHost)

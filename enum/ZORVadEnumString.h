@@ -1,11 +1,9 @@
 // A string variable that holds an ordered, finite set of the texts that are still possible.
 #pragma once
 
-#include <bitset>
-
+#include "enum/TextSet.h"
 #include "module/ZORVaDoString.h"
-#include "module/fold.h"
-#include "module/limits.h"
+#include "module/texts.h"
 #include "single/ZORVadSingleString.h"
 #include "vector/ZORISVectorImp_String.h"
 
@@ -124,53 +122,34 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
  private:
   using Enum = ZORVadEnumString;
   using Single = ZORVadSingleString;
-  using Bound = ZORString (ZORVaDoString::*)() const;
-
-  using Marks = std::bitset<zor::kSetLimit>;  // of listed texts
+  using Texts = zor::TextSet;
 
   explicit ZORVadEnumString(ZORStringStateTag state);
-  explicit ZORVadEnumString(std::size_t candidates);
 
-  const ZORString& First() const { return *mVector[0]; }
-  const ZORString& Last() const { return *mVector[mVector.Count() - 1]; }
-  static unsigned int CountBelow(const ZORISVectorImp_String& texts, const ZORString& text);
-  unsigned int CountUpTo(const ZORString& text) const;
-  void Reserve(unsigned int places);
-  void Store(ZORString* text, unsigned int position);
-  template <class Text>
-  int Place(Text&& text);
-  template <class Text>
-  void PlaceExact(Text&& text);
-  void StoreLast(const ZORString& text);
-  void Remove(unsigned int position, unsigned int count);
-  void Flush();
-  int Become(ZORStringStateTag state, const ZORString& text);
+  // Replace state and texts, 1.
   int Become(ZORStringStateTag state);
-  int Take(ZORVadEnumString& from);
-  int Merge(const ZORISVectorImp_String& texts);
-  int Keep(const ZORISVectorImp_String& texts);
-  int Narrow(ZORVadEnumString& candidates);
-  bool CanMark(std::size_t candidates) const;
-  void Mark(const ZORString& candidate, Marks& marks, unsigned int& next) const;
-  void MarkPairs(const Enum& heads, const Enum& tails, Marks& marks) const;
-  int KeepMarked(const Marks& marks);
+  int Become(ZORStringStateTag state, const ZORString& text);
+  int Become(ZORStringStateTag state, Texts&& texts);
+
+  // Insert compares nothing while the value is open. Include is InsertExactValue.
+  Texts::Equals OfEquals() const { return IsUndefined() || IsNil() ? Texts::Equals::Accepted : Texts::Equals::Refused; }
+  bool CanMark(std::size_t candidates) const { return !IsUndefined() && mTexts.CanMark(candidates); }
+  template <class Wanted>
+  int Keep(const Wanted& wanted);
+  int Narrow(Texts&& candidates);
   void InputSet(ZORistrstream& in);
 
   template <class X>
-  int CutAbove(const X& x);
-  template <class X>
-  int RaiseTo(X& x) const;
-  int TestBelow(Single& x, bool strict) const;
-  int TestChoice(Enum& x, const Enum& y, Bound bound, bool (*beyond)(const ZORString&, const ZORString&)) const;
+  int CalcFoldValue(const X& x, zor::Fold fold);
+  int MeetFolds(const Enum& x, zor::Fold fold);
+  int MeetFolds(const Single& x, zor::Fold fold);
 
-  template <class X, class Fitting>
-  int MeetFolds(const X& x, Fitting fitting);
-  template <class X, class Fits>
-  int TestFolds(X& x, zor::Fold fold, Fits fits) const;
-  int CalcFoldValue(const Enum& x, zor::Fold fold);
-  int CalcFoldValue(const Single& x, zor::Fold fold);
-  int CalcInverseFoldValue(Enum& x, zor::Fold fold) const;
-  int CalcInverseFoldValue(Single& x, zor::Fold fold) const;
-
-  ZORISVectorImp_String mVector;
+  Texts mTexts;
 };
+
+// Keeps the texts that are wanted, a vector or marks; without a text the value is Nil.
+template <class Wanted>
+int ZORVadEnumString::Keep(const Wanted& wanted) {
+  if (!mTexts.Keep(wanted)) return 0;
+  return mTexts.Count() > 0 ? 1 : Nil();
+}

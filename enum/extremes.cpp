@@ -1,8 +1,37 @@
 // Minimum, maximum and successor of sets of texts.
 #include <algorithm>
+#include <functional>
+#include <utility>
 
-#include "enum/dispatch.h"
-#include "module/alphabet.h"
+#include "enum/entries.h"
+#include "module/texts.h"
+
+namespace {
+
+// The inverse of either extreme: bound is the end that decides, beyond tells on which side of y no extreme of x and y
+// can lie. Where all three share the bound nothing can be told.
+template <class Beyond>
+int TestChoice(const ZORVadEnumString& z, ZORVadEnumString& x, const ZORVadEnumString& y,
+               ZORString (ZORVaDoString::*bound)() const, Beyond beyond) {
+  if (z.IsNil() || x.IsNil() || y.IsNil()) return x.Nil();
+  if (z.IsUndefined()) return x.Any();
+  const bool attained = y.IsUndefined() || (y.*bound)() == (z.*bound)();
+  if (x.IsUndefined()) return attained ? (x.Copy(z), 1) : 0;
+  if (!attained && beyond((x.*bound)(), (y.*bound)())) return x.Nil();
+  return 0;
+}
+
+}  // namespace
+
+int ZORVadEnumString::CalcMinValue() {
+  if (IsEmpty()) return 0;
+  return Become(ZorStringExact, "");
+}
+
+int ZORVadEnumString::CalcMaxValue() {
+  if (IsFull()) return 0;
+  return Become(ZorStringMax);
+}
 
 int ZORVadEnumString::CalcMaxValue(const ZORVadEnumString& x, const ZORVadEnumString& y) {
   if (IsNil() || x.IsNil() || y.IsNil()) return Nil();
@@ -31,24 +60,12 @@ int ZORVadEnumString::CalcMinValue(const ZORVadEnumString& x, const ZORVadEnumSt
   return 1;
 }
 
-// The inverse of either extreme: bound is the end that decides, beyond tells on which side of y no extreme of x and y
-// can lie. Where all three share the bound nothing can be told.
-int ZORVadEnumString::TestChoice(Enum& x, const Enum& y, Bound bound,
-                                 bool (*beyond)(const ZORString&, const ZORString&)) const {
-  if (IsNil() || x.IsNil() || y.IsNil()) return x.Nil();
-  if (IsUndefined()) return x.Any();
-  const bool attained = y.IsUndefined() || (y.*bound)() == (this->*bound)();
-  if (x.IsUndefined()) return attained ? (x.Copy(*this), 1) : 0;
-  if (!attained && beyond((x.*bound)(), (y.*bound)())) return x.Nil();
-  return 0;
-}
-
 int ZORVadEnumString::CalcFirstInverseMaxValue(ZORVadEnumString& x, const ZORVadEnumString& y) const {
-  return TestChoice(x, y, &ZORVaDoString::GetLowerBound, [](const ZORString& a, const ZORString& b) { return a < b; });
+  return TestChoice(*this, x, y, &ZORVaDoString::GetLowerBound, std::less());
 }
 
 int ZORVadEnumString::CalcFirstInverseMinValue(ZORVadEnumString& x, const ZORVadEnumString& y) const {
-  return TestChoice(x, y, &ZORVaDoString::GetUpperBound, [](const ZORString& a, const ZORString& b) { return a > b; });
+  return TestChoice(*this, x, y, &ZORVaDoString::GetUpperBound, std::greater());
 }
 
 // The target is replaced, not narrowed. A text without a successor stands for itself.
@@ -56,11 +73,9 @@ int ZORVadEnumString::CalcNextValue(const ZORVadEnumString& x) {
   if (x.IsUndefined()) return 0;
   if (x.IsFull()) return CalcMaxValue();
   if (IsNil() || x.IsNil()) return Nil();
-  ZORVadEnumString next(ZorStringExact);
-  for (ZORISVectorIteratorImp_String text(x.mVector); text; ++text) {
-    next.Insert(zor::Successor(*text.Current()).value_or(*text.Current()));
-  }
-  return Take(next);
+  Texts next(x.mTexts.Count());
+  for (const ZORString* const text : x.mTexts.All()) next.Insert(zor::Successor(*text).value_or(*text));
+  return Become(ZorStringExact, std::move(next));
 }
 
 // The greatest text has two predecessors, the text below it and itself. The empty text has none.
@@ -68,57 +83,36 @@ int ZORVadEnumString::CalcInverseNextValue(ZORVadEnumString& x) const {
   if (IsUndefined()) return x.Any();
   if (IsNil()) return x.Nil();
   if (IsEmpty()) return x.CalcMinValue();
-  ZORVadEnumString previous(ZorStringExact);
-  for (ZORISVectorIteratorImp_String it(mVector); it; ++it) {
-    const ZORString& text = *it.Current();
-    if (!(text == "")) previous.Insert(text == ZorVaDoStringMin ? ZORString() : zor::Predecessor(text));
+  Texts previous(mTexts.Count());
+  for (const ZORString* const text : mTexts.All()) {
+    if (*text == "") continue;
+    previous.Insert(*text == ZorVaDoStringMin ? ZORString() : zor::Predecessor(*text));
   }
-  if (IsFull()) {
-    previous.Insert(zor::Predecessor(ZorVaDoStringMax));
-    previous.mState = ZorStringMax;
-  }
-  return previous.Count() > 0 ? x.Take(previous) : x.Nil();
+  if (IsFull()) previous.Insert(zor::Predecessor(ZorVaDoStringMax));
+  return previous.Count() > 0 ? x.Become(IsFull() ? ZorStringMax : ZorStringExact, std::move(previous)) : x.Nil();
 }
 
 int ZORVadEnumString::CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto& b) {
-    return zor::Narrowed(
-        *this, [&] { return CalcMaxValue(a, b); }, a, b);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcMaxValue(a, b); });
 }
 
 int ZORVadEnumString::CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto& b) {
-    return zor::Narrowed(
-        *this, [&] { return CalcMinValue(a, b); }, a, b);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcMinValue(a, b); });
 }
 
 // A second operand of which nothing is known does not keep the result from telling something.
 int ZORVadEnumString::CalcFirstInverseMaxValue(ZORVaDoAny& x, const ZORVaDoAny& y) const {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto& b) {
-    return zor::Narrowed(
-        a, [&] { return CalcFirstInverseMaxValue(a, b); }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcFirstInverseMaxValue(a, b); });
 }
 
 int ZORVadEnumString::CalcFirstInverseMinValue(ZORVaDoAny& x, const ZORVaDoAny& y) const {
-  return zor::Guarded<Enum>(x, y, [&](auto& a, auto& b) {
-    return zor::Narrowed(
-        a, [&] { return CalcFirstInverseMinValue(a, b); }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcFirstInverseMinValue(a, b); });
 }
 
 int ZORVadEnumString::CalcNextValue(const ZORVaDoScalar& x) {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcNextValue(a); }, a);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcNextValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseNextValue(ZORVaDoScalar& x) const {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseNextValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcInverseNextValue(a); });
 }

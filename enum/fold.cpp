@@ -1,75 +1,82 @@
 // Lower and upper case of sets of texts.
-#include "enum/dispatch.h"
-#include "enum/insertion.h"
+#include <algorithm>
+#include <utility>
 
+#include "enum/entries.h"
+
+using zor::Fold;
 using zor::Folded;
 using zor::IsFolded;
 
-// The extremes fold to themselves, whatever their text; anything between goes to fitting.
-template <class X, class Fitting>
-int ZORVadEnumString::MeetFolds(const X& x, Fitting fitting) {
+namespace {
+
+bool AreFolds(const ZORVadEnumString& z, const ZORVadEnumString& x, Fold fold) {
+  if (x.Count() != z.Count()) return false;
+  for (int i = 0; i < z.Count(); ++i) {
+    if (!(Folded(x.GetValue(i), fold) == z.GetValue(i))) return false;
+  }
+  return true;
+}
+
+bool AreFolds(const ZORVadEnumString& z, const ZORVadSingleString& x, Fold fold) {
+  return z.Count() == 1 && Folded(x.GetLowerBound(), fold) == z.GetValue(0);
+}
+
+bool HasFold(const ZORVadEnumString& z, Fold fold) {
+  for (int i = 0; i < z.Count(); ++i) {
+    if (IsFolded(z.GetValue(i), fold)) return true;
+  }
+  return false;
+}
+
+// Both values must be at the same extreme or at none. An Undefined x stays as long as some text could fold to ours.
+template <class X>
+int TestFolds(const ZORVadEnumString& z, X& x, Fold fold) {
+  if (z.IsUndefined()) return 0;
+  if (z.IsNil() && x.IsNil()) return 0;
+  if (z.IsEmpty() && x.IsEmpty()) return 0;
+  if (z.IsFull() && x.IsFull()) return 0;
+  if (z.IsNil() || z.IsEmpty() || z.IsFull()) return x.Nil();
+  if (x.IsNil() || x.IsEmpty() || x.IsFull()) return x.Nil();
+  if (!x.IsUndefined()) return AreFolds(z, x, fold) ? 0 : x.Nil();
+  if (z.GetState() != ZORVaDoString::ZorStringExact) return 0;
+  return HasFold(z, fold) ? 0 : x.Nil();
+}
+
+}  // namespace
+
+// The extremes fold to themselves, whatever their text.
+template <class X>
+int ZORVadEnumString::CalcFoldValue(const X& x, Fold fold) {
   if (IsNil()) return 0;
   if (x.IsUndefined()) return 0;
   if (x.IsNil()) return Nil();
   if (x.IsEmpty()) return MeetLeast();
   if (x.IsFull()) return MeetGreatest();
-  return fitting();
+  return MeetFolds(x, fold);
 }
 
-int ZORVadEnumString::CalcFoldValue(const Enum& x, zor::Fold fold) {
-  return MeetFolds(x, [&] {
-    if (CanMark(x.mVector.Count())) {
-      Marks marks;
-      unsigned int next = 0;
-      for (ZORISVectorIteratorImp_String text(x.mVector); text; ++text)
-        Mark(Folded(*text.Current(), fold), marks, next);
-      return KeepMarked(marks);
-    }
-    ZORVadEnumString folds(x.mVector.Count());
-    for (ZORISVectorIteratorImp_String text(x.mVector); text; ++text) folds.PlaceExact(Folded(*text.Current(), fold));
-    return Narrow(folds);
-  });
-}
-
-int ZORVadEnumString::CalcFoldValue(const Single& x, zor::Fold fold) {
-  return MeetFolds(x, [&] {
-    if (IsFull()) return Nil();
-    const ZORString text = Folded(x.GetLowerBound(), fold);
-    if (IsUndefined()) return Become(ZorStringExact, text);
-    if (First() == text) return 0;
-    return Nil();
-  });
-}
-
-// Both values must be at the same extreme or at none. An Undefined x stays as long as some text could fold to ours.
-template <class X, class Fits>
-int ZORVadEnumString::TestFolds(X& x, zor::Fold fold, Fits fits) const {
-  if (IsUndefined()) return 0;
-  if (IsNil() && x.IsNil()) return 0;
-  if (IsEmpty() && x.IsEmpty()) return 0;
-  if (IsFull() && x.IsFull()) return 0;
-  if (IsNil() || IsEmpty() || IsFull()) return x.Nil();
-  if (x.IsNil() || x.IsEmpty() || x.IsFull()) return x.Nil();
-  if (!x.IsUndefined()) return fits() ? 0 : x.Nil();
-  if (mState != ZorStringExact) return 0;
-  for (ZORISVectorIteratorImp_String text(mVector); text; ++text) {
-    if (IsFolded(*text.Current(), fold)) return 0;
+int ZORVadEnumString::MeetFolds(const Enum& x, Fold fold) {
+  if (CanMark(x.mTexts.Count())) {
+    Texts::Marks marks;
+    unsigned int next = 0;
+    for (const ZORString* const text : x.mTexts.All()) mTexts.Mark(Folded(*text, fold), marks, next);
+    return Keep(marks);
   }
-  return x.Nil();
+  Texts folds(x.mTexts.Count());
+  for (const ZORString* const text : x.mTexts.All()) {
+    if (folds.Count() == zor::kSetLimit) return 0;  // more than a set can hold tells nothing
+    folds.Insert(Folded(*text, fold));
+  }
+  return Narrow(std::move(folds));
 }
 
-int ZORVadEnumString::CalcInverseFoldValue(Enum& x, zor::Fold fold) const {
-  return TestFolds(x, fold, [&] {
-    if (x.Count() != Count()) return false;
-    for (unsigned int i = 0; i < mVector.Count(); ++i) {
-      if (!(Folded(*x.mVector[i], fold) == *mVector[i])) return false;
-    }
-    return true;
-  });
-}
-
-int ZORVadEnumString::CalcInverseFoldValue(Single& x, zor::Fold fold) const {
-  return TestFolds(x, fold, [&] { return Count() == 1 && Folded(x.GetLowerBound(), fold) == First(); });
+int ZORVadEnumString::MeetFolds(const Single& x, Fold fold) {
+  if (IsFull()) return Nil();
+  const ZORString text = Folded(x.GetLowerBound(), fold);
+  if (IsUndefined()) return Become(ZorStringExact, text);
+  if (mTexts.First() == text) return 0;
+  return Nil();
 }
 
 int ZORVadEnumString::CalcLowerValue(const Enum& x) { return CalcFoldValue(x, &ZORString::ToLower); }
@@ -77,35 +84,23 @@ int ZORVadEnumString::CalcLowerValue(const Single& x) { return CalcFoldValue(x, 
 int ZORVadEnumString::CalcUpperValue(const Enum& x) { return CalcFoldValue(x, &ZORString::ToUpper); }
 int ZORVadEnumString::CalcUpperValue(const Single& x) { return CalcFoldValue(x, &ZORString::ToUpper); }
 
-int ZORVadEnumString::CalcInverseLowerValue(Enum& x) const { return CalcInverseFoldValue(x, &ZORString::ToLower); }
-int ZORVadEnumString::CalcInverseLowerValue(Single& x) const { return CalcInverseFoldValue(x, &ZORString::ToLower); }
-int ZORVadEnumString::CalcInverseUpperValue(Enum& x) const { return CalcInverseFoldValue(x, &ZORString::ToUpper); }
-int ZORVadEnumString::CalcInverseUpperValue(Single& x) const { return CalcInverseFoldValue(x, &ZORString::ToUpper); }
+int ZORVadEnumString::CalcInverseLowerValue(Enum& x) const { return TestFolds(*this, x, &ZORString::ToLower); }
+int ZORVadEnumString::CalcInverseLowerValue(Single& x) const { return TestFolds(*this, x, &ZORString::ToLower); }
+int ZORVadEnumString::CalcInverseUpperValue(Enum& x) const { return TestFolds(*this, x, &ZORString::ToUpper); }
+int ZORVadEnumString::CalcInverseUpperValue(Single& x) const { return TestFolds(*this, x, &ZORString::ToUpper); }
 
 int ZORVadEnumString::CalcLowerValue(const ZORVaDoString& x) {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcLowerValue(a); }, a);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcLowerValue(a); });
 }
 
 int ZORVadEnumString::CalcUpperValue(const ZORVaDoString& x) {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcUpperValue(a); }, a);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcUpperValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseLowerValue(ZORVaDoString& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseLowerValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseLowerValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseUpperValue(ZORVaDoString& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseUpperValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseUpperValue(a); });
 }

@@ -1,4 +1,6 @@
 // Lengths of sets of texts, in characters.
+#include <utility>
+
 #include "enum/ZORVadEnumString.h"
 
 int ZORVadEnumString::CalcLength(ZORVaDoInteger& n) const {
@@ -6,7 +8,7 @@ int ZORVadEnumString::CalcLength(ZORVaDoInteger& n) const {
   if (IsUndefined()) return n.SetUndefinedValue(), 1;
   ZORVadEnumInteger lengths;
   lengths.SetNilValue();
-  for (ZORISVectorIteratorImp_String text(mVector); text; ++text) lengths.Insert(text.Current()->GetLengthInChar());
+  for (const ZORString* const text : mTexts.All()) lengths.Insert(text->GetLengthInChar());
   if (auto* const single = ZORVadSingleInteger::DynamicCast(&n)) return lengths.IntersectInverse(*single);
   if (auto* const interval = ZORVadIntervalInteger::DynamicCast(&n)) return lengths.IntersectInverse(*interval);
   if (auto* const set = ZORVadEnumInteger::DynamicCast(&n)) return set->Intersect(lengths);
@@ -18,11 +20,13 @@ int ZORVadEnumString::CalcInverseLength(const ZORVaDoInteger& n) {
   if (n.IsNil()) return Nil();
   if (n.IsUndefined() || IsNil() || IsUndefined()) return 0;
   if (n.GetExactValue() < 0) return Nil();
-  ZORVadEnumString kept(mVector.Count());
+  Texts kept(mTexts.Count());
   ZORVadSingleInteger length;
-  for (ZORISVectorIteratorImp_String text(mVector); text; ++text) {
-    length.SetExactValue(text.Current()->GetLengthInChar());
-    if (n.IsIntersected(length)) kept.InsertExactValue(*text.Current());
+  for (const ZORString* const text : mTexts.All()) {
+    length.SetExactValue(text->GetLengthInChar());
+    if (!n.IsIntersected(length)) continue;
+    if (kept.Count() == zor::kSetLimit) return Become(ZorStringAny);
+    kept.Insert(*text);
   }
-  return Take(kept);
+  return Become(kept.Count() > 0 ? ZorStringExact : ZorStringNil, std::move(kept));
 }

@@ -1,47 +1,56 @@
 // Order relations of sets of texts.
-#include "enum/dispatch.h"
+#include <functional>
 
-// *this <= x: both classes of x answer the same questions.
+#include "enum/entries.h"
+
+namespace {
+
+using Enum = ZORVadEnumString;
+using Single = ZORVadSingleString;
+
+// z <= x, cutting z: both classes of x answer the same questions.
 template <class X>
-int ZORVadEnumString::CutAbove(const X& x) {
-  if (IsNil() || x.IsNil()) return Nil();
-  if (IsUndefined() || x.IsUndefined()) return 0;
-  if (IsEmpty()) return 0;
-  if (x.IsEmpty()) return Nil();
+int CutToUpperBound(Enum& z, const X& x) {
+  if (z.IsNil() || x.IsNil()) return z.Nil();
+  if (z.IsUndefined() || x.IsUndefined()) return 0;
+  if (z.IsEmpty()) return 0;
+  if (x.IsEmpty()) return z.Nil();
   if (x.IsFull()) return 0;
-  if (IsFull()) return Nil();
+  if (z.IsFull()) return z.Nil();
   const ZORString bound = x.GetUpperBound();
-  if (GetLowerBound() > bound) return Nil();
-  if (GetUpperBound() <= bound) return 0;
-  CutUpper(bound);
+  if (z.GetLowerBound() > bound) return z.Nil();
+  if (z.GetUpperBound() <= bound) return 0;
+  z.CutUpper(bound);
   return 1;
 }
 
-// The same relation, narrowing x: it is set to the bound even when all its texts lie below.
+// The same relation, narrowing x: it is set to the bound even when all its texts are less.
 template <class X>
-int ZORVadEnumString::RaiseTo(X& x) const {
-  if (IsNil() || x.IsNil()) return x.Nil();
-  if (IsUndefined() || x.IsUndefined()) return 0;
-  const ZORString bound = GetLowerBound();
+int RaiseToLowerBound(const Enum& z, X& x) {
+  if (z.IsNil() || x.IsNil()) return x.Nil();
+  if (z.IsUndefined() || x.IsUndefined()) return 0;
+  const ZORString bound = z.GetLowerBound();
   if (x.GetLowerBound() >= bound) return 0;
   x.SetLowerBound(bound);
   return 1;
 }
 
-// A single x against the last text that is listed; the Max of a set with texts does not count.
-int ZORVadEnumString::TestBelow(Single& x, bool strict) const {
+// A single x against the last text that z lists; the Max of a set with texts does not count.
+template <class Fails>
+int TestAgainstLast(const Enum& z, Single& x, Fails fails) {
   if (x.IsUndefined()) return 0;
-  if (IsNil()) return x.Nil();
-  if (IsUndefined()) return 0;
-  const ZORString text = x.GetLowerBound();
-  const ZORString& last = IsFull() ? ZorVaDoStringMax : Last();
-  return (strict ? text >= last : text > last) ? x.Nil() : 0;
+  if (z.IsNil()) return x.Nil();
+  if (z.IsUndefined()) return 0;
+  const ZORString& last = z.IsFull() ? ZORVaDoString::ZorVaDoStringMax : z.GetValue(z.Count() - 1);
+  return fails(x.GetLowerBound(), last) ? x.Nil() : 0;
 }
 
-int ZORVadEnumString::CalcLessOrEqualValue(const ZORVadEnumString& x) { return CutAbove(x); }
-int ZORVadEnumString::CalcLessOrEqualValue(const ZORVadSingleString& x) { return CutAbove(x); }
-int ZORVadEnumString::CalcInverseLessOrEqualValue(ZORVadEnumString& x) const { return RaiseTo(x); }
-int ZORVadEnumString::CalcInverseLessOrEqualValue(ZORVadSingleString& x) const { return RaiseTo(x); }
+}  // namespace
+
+int ZORVadEnumString::CalcLessOrEqualValue(const ZORVadEnumString& x) { return CutToUpperBound(*this, x); }
+int ZORVadEnumString::CalcLessOrEqualValue(const ZORVadSingleString& x) { return CutToUpperBound(*this, x); }
+int ZORVadEnumString::CalcInverseLessOrEqualValue(ZORVadEnumString& x) const { return RaiseToLowerBound(*this, x); }
+int ZORVadEnumString::CalcInverseLessOrEqualValue(ZORVadSingleString& x) const { return RaiseToLowerBound(*this, x); }
 
 int ZORVadEnumString::CalcLessValue(const ZORVadEnumString& x) {
   if (IsUndefined()) return 0;
@@ -57,64 +66,44 @@ int ZORVadEnumString::CalcInverseLessValue(ZORVadEnumString& x) const {
 
 int ZORVadEnumString::CalcNotLessValue(const ZORVadEnumString& x) { return x.CalcInverseLessOrEqualValue(*this); }
 int ZORVadEnumString::CalcInverseNotLessValue(ZORVadEnumString& x) const { return x.CalcLessOrEqualValue(*this); }
-int ZORVadEnumString::CalcInverseNotLessValue(ZORVadSingleString& x) const { return TestBelow(x, false); }
+int ZORVadEnumString::CalcInverseNotLessValue(ZORVadSingleString& x) const {
+  return TestAgainstLast(*this, x, std::greater());
+}
 int ZORVadEnumString::CalcNotLessAndUnequalValue(const ZORVadEnumString& x) { return x.CalcInverseLessValue(*this); }
 int ZORVadEnumString::CalcInverseNotLessAndUnequalValue(ZORVadEnumString& x) const { return x.CalcLessValue(*this); }
-int ZORVadEnumString::CalcInverseNotLessAndUnequalValue(ZORVadSingleString& x) const { return TestBelow(x, true); }
+int ZORVadEnumString::CalcInverseNotLessAndUnequalValue(ZORVadSingleString& x) const {
+  return TestAgainstLast(*this, x, std::greater_equal());
+}
 
 // An order relation takes a single string where it has a form for one.
 int ZORVadEnumString::CalcLessOrEqualValue(const ZORVaDoAny& x) {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcLessOrEqualValue(a); }, a);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcLessOrEqualValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseLessOrEqualValue(ZORVaDoAny& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseLessOrEqualValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseLessOrEqualValue(a); });
 }
 
 int ZORVadEnumString::CalcLessValue(const ZORVaDoScalar& x) {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcLessValue(a); }, a);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcLessValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseLessValue(ZORVaDoScalar& x) const {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseLessValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcInverseLessValue(a); });
 }
 
 int ZORVadEnumString::CalcNotLessValue(const ZORVaDoScalar& x) {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcNotLessValue(a); }, a);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcNotLessValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseNotLessValue(ZORVaDoScalar& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseNotLessValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseNotLessValue(a); });
 }
 
 int ZORVadEnumString::CalcNotLessAndUnequalValue(const ZORVaDoAny& x) {
-  return zor::Guarded<Enum>(x, [&](auto& a) {
-    return zor::Narrowed(
-        *this, [&] { return CalcNotLessAndUnequalValue(a); }, a);
-  });
+  return zor::Narrowed<Enum>(*this, x, [&](auto& a) { return CalcNotLessAndUnequalValue(a); });
 }
 
 int ZORVadEnumString::CalcInverseNotLessAndUnequalValue(ZORVaDoAny& x) const {
-  return zor::GuardedString(x, [&](auto& a) {
-    return zor::Narrowed(
-        a, [&] { return CalcInverseNotLessAndUnequalValue(a); }, *this);
-  });
+  return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcInverseNotLessAndUnequalValue(a); });
 }

@@ -1,39 +1,25 @@
 // What a set of texts is: its statics, construction, copies and states.
-#include <algorithm>
+#include <utility>
 
-#include "enum/dispatch.h"
+#include "enum/entries.h"
 #include "module/characters.h"
-#include "module/plumbing.h"
+#include "module/classdefinition.h"
 
 ZOR_DEFINE_STRING_CLASS(ZORVadEnumString, ZORVaDoString, "enum string", ZORVaDoString::sDescriptor, 1);
-
-namespace {
-
-constexpr unsigned int kPlaces = 20;  // places of a new value, and the step in which its vector grows by itself
-
-}  // namespace
 
 ZORVadEnumString* ZORVadEnumString::Build(ZORStreamable* object) {
   return static_cast<ZORVadEnumString*>(zor::BuildForRead<ZORVadEnumString>(object));
 }
 
-ZORVadEnumString::ZORVadEnumString(ZORStringStateTag state) : mVector(kPlaces, kPlaces) { mState = state; }
-
-// A set to be filled, with places for as many candidates as it can hold.
-ZORVadEnumString::ZORVadEnumString(std::size_t candidates)
-    : mVector(static_cast<unsigned int>(std::min(candidates, zor::kSetLimit)), kPlaces) {
-  mState = ZorStringNil;
-}
-
+ZORVadEnumString::ZORVadEnumString(ZORStringStateTag state) { mState = state; }
 ZORVadEnumString::ZORVadEnumString() : ZORVadEnumString(ZorStringAny) {}
 ZORVadEnumString::ZORVadEnumString(const ZORVadEnumString& other) : ZORVadEnumString(other.mState) { Append(other); }
 ZORVadEnumString::ZORVadEnumString(const ZORVadSingleString& other) : ZORVadEnumString() { Copy(other); }
-ZORVadEnumString::ZORVadEnumString(const ZORString& text) : ZORVadEnumString(ZorStringExact) { StoreLast(text); }
+ZORVadEnumString::ZORVadEnumString(const ZORString& text) { Become(ZorStringExact, text); }
 ZORVadEnumString::ZORVadEnumString(const void* text) : ZORVadEnumString(ZORString(static_cast<const char*>(text))) {}
+ZORVadEnumString::ZORVadEnumString(ZORStreamableInit) : ZORVaDoString(ZorStreamableInit) {}
 
-ZORVadEnumString::ZORVadEnumString(ZORStreamableInit) : ZORVaDoString(ZorStreamableInit), mVector(kPlaces, kPlaces) {}
-
-ZORVadEnumString::~ZORVadEnumString() { Flush(); }
+ZORVadEnumString::~ZORVadEnumString() = default;
 
 ZORVadEnumString& ZORVadEnumString::operator=(const ZORVadEnumString& other) {
   Copy(other);
@@ -54,43 +40,39 @@ int ZORVadEnumString::Copy(const ZORVadSingleString& other) {
   return Become(ZorStringExact, other.GetLowerBound());
 }
 
-void ZORVadEnumString::Flush() {
-  if (mVector.Count() > 0) mVector.Flush(1);
-}
-
 int ZORVadEnumString::Become(ZORStringStateTag state) {
-  Flush();
+  mTexts.Clear();
   mState = state;
   return 1;
 }
 
 int ZORVadEnumString::Become(ZORStringStateTag state, const ZORString& text) {
-  auto* const copy = new ZORString(text);  // before the flush: text may be one of ours
+  ZORString own(text);  // before the others go: text may be one of them
   Become(state);
-  Store(copy, 0);
+  mTexts.Insert(std::move(own));
   return 1;
 }
 
-// Takes over the state and the texts, which leaves from with those that were here.
-int ZORVadEnumString::Take(ZORVadEnumString& from) {
-  mVector.Swap(from.mVector);
-  mState = from.mState;
+int ZORVadEnumString::Become(ZORStringStateTag state, Texts&& texts) {
+  mTexts.Swap(texts);
+  mState = state;
   return 1;
 }
 
 void ZORVadEnumString::SetNilValue() { Become(ZorStringNil); }
 void ZORVadEnumString::SetUndefinedValue() { Become(ZorStringAny); }
 
-int ZORVadEnumString::IsEmpty() const { return mState == ZorStringExact && mVector.Count() == 1 && First() == ""; }
-int ZORVadEnumString::IsFull() const { return mState == ZorStringMax && mVector.Count() == 0; }
+int ZORVadEnumString::IsEmpty() const {
+  return mState == ZorStringExact && mTexts.Count() == 1 && mTexts.First() == "";
+}
+int ZORVadEnumString::IsFull() const { return mState == ZorStringMax && mTexts.Count() == 0; }
 
 unsigned long ZORVadEnumString::GetCardinality() const {
   if (IsNil()) return 0;
-  if (IsUndefined()) return 256;
-  return mVector.Count();
+  if (IsUndefined()) return zor::kSetLimit;
+  return mTexts.Count();
 }
 
 void ZORVadEnumString::Assign(const ZORVaDoAny& other) {
-  zor::GuardedStringElse(
-      other, [&](auto& string) { return Copy(string); }, [&] { return Nil(); });
+  zor::GuardedOrNil<Enum, Single>(*this, other, [&](auto& string) { return Copy(string); });
 }

@@ -5,50 +5,42 @@
 void ZORVadEnumString::PrintOn(ZORostrstream& out) const {
   if (zor::PrintWord(*this, out)) return;
   if (Count() == 1 && mState != ZorStringMax) {
-    out << '"' << First().CastToCharPtr() << '"';
+    out << '"' << mTexts.First().CastToCharPtr() << '"';
     return;
   }
-  out << "{ \"" << First().CastToCharPtr();
-  for (unsigned int i = 1; i < mVector.Count(); ++i) out << "\", \"" << mVector[i]->CastToCharPtr();
+  out << "{ \"" << mTexts.First().CastToCharPtr();
+  for (unsigned int i = 1; i < mTexts.Count(); ++i) out << "\", \"" << mTexts[i].CastToCharPtr();
   out << (mState == ZorStringMax ? "\", Max }" : "\" }");
 }
 
 void ZORVadEnumString::InputValue(ZORistrstream& in) {
-  Flush();
   in >> ws;
-  const int next = in.Peek();
-  if (zor::BeginsWord(next)) {
-    zor::InputWord(*this, in);
-  } else if (next == '"') {
-    in.Ignore();
-    SetExactValue(zor::InputQuoted(in));
-  } else if (next == '{') {
-    in.Ignore();
-    InputSet(in);
-  } else {
-    SetNilValue();
-  }
+  if (in.Peek() != '{') return zor::InputWordOrText(*this, in);
+  in.Ignore();
+  InputSet(in);
 }
 
 // Texts in quotes with commas between them, up to the closing brace; in any order, and equal ones stay.
 void ZORVadEnumString::InputSet(ZORistrstream& in) {
-  mState = ZorStringExact;
+  Become(ZorStringExact);
   char next = '\0';
   do {
     in >> ws >> next;
     if (next != '"') return SetNilValue();
-    auto* const text = new ZORString(zor::InputQuoted(in));
-    Store(text, CountUpTo(*text));
+    mTexts.Insert(zor::InputQuoted(in), Texts::Equals::Accepted);
     in >> ws >> next;
   } while (next == ',');
   if (next != '}') SetNilValue();
 }
 
+int ZORVadEnumString::CalcStringRepresentation(const ZORVaDoAny&) { return 0; }
+int ZORVadEnumString::CalcInverseStringRepresentation(ZORVaDoAny&) const { return 0; }
+
 void ZORVadEnumString::Write(ZORopstream& out) const {
   out << static_cast<ZORLong>(mState);
   if (mState != ZorStringExact) return;
   out << static_cast<ZORLong>(Count());
-  for (ZORISVectorIteratorImp_String text(mVector); text; ++text) out.WriteString(text.Current()->CastToCharPtr());
+  for (const ZORString* const text : mTexts.All()) out.WriteString(text->CastToCharPtr());
 }
 
 // A state that is none, an empty set and a text that is missing give Nil. Nothing is made for a count alone.
@@ -66,9 +58,8 @@ void ZORVadEnumString::Read(ZORipstream& in) {
   for (; count > 0; --count) {
     char* const characters = in.ReadString();
     if (characters == nullptr) return SetNilValue();
-    auto* const text = new ZORString(characters);
+    mTexts.Insert(ZORString(characters), Texts::Equals::Accepted);
     delete[] characters;
-    Store(text, CountUpTo(*text));
     mState = ZorStringExact;
   }
 }

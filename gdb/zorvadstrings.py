@@ -53,7 +53,7 @@ def single(value):
 
 def enumerated(value):
     state = state_of(value)
-    texts = texts_of(value["mVector"])
+    texts = texts_of(value["mTexts"]["mVector"])
     if state == "Max" and texts:
         return braced(texts + ["Max"])
     if state != "Exact":

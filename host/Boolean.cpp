@@ -1,6 +1,6 @@
 // Truth values are few enough to try them all: an operation keeps the truths that have partners in its relation.
+#include "host/Guard.h"
 #include "host/NumberText.h"
-#include "host/Plumbing.h"
 #include "host/ZORNumbers.h"
 
 namespace {
@@ -10,7 +10,7 @@ constexpr char kTrueWord[] = "true";
 
 template <class... Args>
 int Guarded(Args&&... args) {
-  return zorhost::Guarded<ZORVadSingleBoolean>(args...);
+  return zor::Guarded<ZORVadSingleBoolean>(args...);
 }
 
 // Sets of truths: bit 0 for false, bit 1 for true.

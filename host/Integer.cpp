@@ -1,7 +1,7 @@
 // What all integers do alike: each operation says which numbers its relation allows and keeps those.
+#include "host/Guard.h"
 #include "host/IntegerSet.h"
 #include "host/NumberText.h"
-#include "host/Plumbing.h"
 #include "host/ZORNumbers.h"
 
 using zorhost::AllBut;
@@ -21,7 +21,7 @@ enum StateTag : ZORLong { kKnownTag, kUndefinedTag, kNilTag };
 
 template <class... Args>
 int Guarded(Args&&... args) {
-  return zorhost::Guarded<ZORVaDoInteger>(args...);
+  return zor::Guarded<ZORVaDoInteger>(args...);
 }
 
 bool IsExact(const ZORVaDoInteger& x) { return Lower(x) == Upper(x); }

@@ -7,7 +7,7 @@
 #include <filesystem>
 #include <utility>
 
-#include "host/Plumbing.h"
+#include "host/Descriptors.h"
 #include "host/ZORSolver.h"
 
 namespace {

@@ -1,33 +1,25 @@
 // The number types as the solver and the streams know them.
 #include "host/ZORNumbers.h"
 
-#include "host/Plumbing.h"
+#include "host/Descriptors.h"
 
-#define ZOR_DEFINE_TYPE_TEST(Class, Base)                                                                     \
-  const char* const Class::sIdent = #Class;                                                                   \
-  Class* Class::DynamicCast(ZORVaDoBase* object) {                                                            \
-    return IsKindOf(object, sIdent) ? static_cast<Class*>(object) : nullptr;                                  \
-  }                                                                                                           \
-  const Class* Class::DynamicCast(const ZORVaDoBase* object) {                                                \
-    return IsKindOf(object, sIdent) ? static_cast<const Class*>(object) : nullptr;                            \
-  }                                                                                                           \
-  int Class::IsDerivedFrom(const char* ident) const { return ident == sIdent || Base::IsDerivedFrom(ident); } \
-  static_assert(true)
+#define ZOR_DEFINE_TYPE_TEST(Class, Base)   \
+  const char* const Class::sIdent = #Class; \
+  ZOR_DEFINE_CASTS(Class, Base)
 
-#define ZOR_DEFINE_NUMBER_CLASS(Class, Base, displayName, parent)                                                    \
-  ZOR_DEFINE_TYPE_TEST(Class, Base);                                                                                 \
-  namespace {                                                                                                        \
-  constexpr char k##Class##DescriptorIdent[] = #Class "_Descriptor";                                                 \
-  using Class##Descriptor = zorhost::HostDescriptor<Class, k##Class##DescriptorIdent>;                               \
-  const Class##Descriptor k##Class(ZORString(displayName), parent, 0);                                               \
-  const ZORStreamableClass k##Class##DescriptorRecord(k##Class##DescriptorIdent,                                     \
-                                                      zorhost::BuildForRead<Class##Descriptor>,                      \
-                                                      ZORStreamableClass::kSolverClass);                             \
-  const ZORStreamableClass k##Class##Record(#Class, zorhost::BuildForRead<Class>, ZORStreamableClass::kSolverClass); \
-  }                                                                                                                  \
-  const ZORVaDoObjectDescriptor* const Class::sDescriptor = &k##Class;                                               \
-  const char* Class::CastableID() const { return sIdent; }                                                           \
-  const ZORVaDoObjectDescriptor* Class::GetDescriptor() const { return sDescriptor; }                                \
+#define ZOR_DEFINE_NUMBER_CLASS(Class, Base, displayName, parent)                                                      \
+  ZOR_DEFINE_TYPE_TEST(Class, Base);                                                                                   \
+  namespace {                                                                                                          \
+  constexpr char k##Class##DescriptorIdent[] = #Class "_Descriptor";                                                   \
+  using Class##Descriptor = zorhost::HostDescriptor<Class, k##Class##DescriptorIdent>;                                 \
+  const Class##Descriptor k##Class(ZORString(displayName), parent, 0);                                                 \
+  const ZORStreamableClass k##Class##DescriptorRecord(k##Class##DescriptorIdent, zor::BuildForRead<Class##Descriptor>, \
+                                                      ZORStreamableClass::kSolverClass);                               \
+  const ZORStreamableClass k##Class##Record(#Class, zor::BuildForRead<Class>, ZORStreamableClass::kSolverClass);       \
+  }                                                                                                                    \
+  const ZORVaDoObjectDescriptor* const Class::sDescriptor = &k##Class;                                                 \
+  const char* Class::CastableID() const { return sIdent; }                                                             \
+  const ZORVaDoObjectDescriptor* Class::GetDescriptor() const { return sDescriptor; }                                  \
   static_assert(true)
 
 ZOR_DEFINE_TYPE_TEST(ZORVaDoBoolean, ZORVaDoAny);

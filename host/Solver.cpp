@@ -3,7 +3,7 @@
 #include <memory>
 #include <new>
 
-#include "host/Plumbing.h"
+#include "host/Descriptors.h"
 
 const char* const ZORVaDoBase::sIdent = "ZORVaDoBase";
 const char* const ZORVaDoObject::sIdent = "ZORVaDoObject";
@@ -22,13 +22,11 @@ ZORVaDoBase* ZORVaDoBase::FromStream(ZORStreamable* object) {
   return static_cast<ZORVaDoBase*>(object);
 }
 
-// clang-format off
-int ZORVaDoBase::IsDerivedFrom            (const char* ident) const { return ident == sIdent; }
-int ZORVaDoObject::IsDerivedFrom          (const char* ident) const { return ident == sIdent || ZORVaDoBase::IsDerivedFrom(ident); }
-int ZORVaDoAny::IsDerivedFrom             (const char* ident) const { return ident == sIdent || ZORVaDoObject::IsDerivedFrom(ident); }
-int ZORVaDoScalar::IsDerivedFrom          (const char* ident) const { return ident == sIdent || ZORVaDoAny::IsDerivedFrom(ident); }
-int ZORVaDoObjectDescriptor::IsDerivedFrom(const char* ident) const { return ident == sIdent || ZORVaDoBase::IsDerivedFrom(ident); }
-// clang-format on
+int ZORVaDoBase::IsDerivedFrom(const char* ident) const { return ident == sIdent; }
+ZOR_DEFINE_DERIVATION(ZORVaDoObject, ZORVaDoBase);
+ZOR_DEFINE_DERIVATION(ZORVaDoAny, ZORVaDoObject);
+ZOR_DEFINE_DERIVATION(ZORVaDoScalar, ZORVaDoAny);
+ZOR_DEFINE_DERIVATION(ZORVaDoObjectDescriptor, ZORVaDoBase);
 
 ZORVaDoObject::~ZORVaDoObject() = default;
 const ZORVaDoObjectDescriptor* ZORVaDoObject::GetDescriptor() const { return nullptr; }
@@ -93,7 +91,7 @@ constexpr char kScalarDescriptorIdent[] = "ZORVaDoScalar_Descriptor";
 using ScalarDescriptor = zorhost::HostDescriptor<ZORVaDoScalar, kScalarDescriptorIdent>;
 
 const ScalarDescriptor kScalar(ZORString("scalar"), nullptr, 1);
-const ZORStreamableClass kScalarDescriptorRecord(kScalarDescriptorIdent, zorhost::BuildForRead<ScalarDescriptor>,
+const ZORStreamableClass kScalarDescriptorRecord(kScalarDescriptorIdent, zor::BuildForRead<ScalarDescriptor>,
                                                  ZORStreamableClass::kSolverClass);
 
 }  // namespace

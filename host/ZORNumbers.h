@@ -36,6 +36,36 @@ class ZORIntegerSet;
   const char* CastableID() const override;                 \
   const ZORVaDoObjectDescriptor* GetDescriptor() const override
 
+// Overrides of what any value does with others, on numbers and truth values alike.
+#define ZOR_DECLARE_NUMBER_OPERATIONS()                                                      \
+ public:                                                                                     \
+  void Write(ZORopstream& out) const override;                                               \
+  void Read(ZORipstream& in) override;                                                       \
+  void PrintOn(ZORostrstream& out) const override;                                           \
+  void InputValue(ZORistrstream& in) override;                                               \
+  void Assign(const ZORVaDoAny& other) override;                                             \
+  int IsIntersected(const ZORVaDoAny& other) const override;                                 \
+  void Intersect(const ZORVaDoAny& other) override;                                          \
+  void Unite(const ZORVaDoAny& other) override;                                              \
+  void Bisect(ZORVaDoObject& other, ValueSelection selection) override;                      \
+  int CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
+  int CalcMinValue() override;                                                               \
+  int CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
+  int CalcMaxValue() override;                                                               \
+  int CalcEqualValue(const ZORVaDoAny& other) override;                                      \
+  int CalcInverseEqualValue(ZORVaDoAny& target) const override;                              \
+  int CalcUnequalValue(const ZORVaDoAny& other) override;                                    \
+  int CalcInverseUnequalValue(ZORVaDoAny& target) const override;                            \
+  int CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;           \
+  int CalcLessOrEqualValue(const ZORVaDoAny& other) override;                                \
+  int CalcInverseLessOrEqualValue(ZORVaDoAny& target) const override;                        \
+  int CalcNotLessAndUnequalValue(const ZORVaDoAny& other) override;                          \
+  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;                  \
+  int CalcIsLessOrEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;     \
+  int CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
+  int CalcFirstInverseMaxValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
+  static_assert(true)
+
 // A truth value. False is less than true.
 class ZOR_EXPORT ZORVaDoBoolean : public ZORVaDoAny {
   ZOR_DECLARE_TYPE_TEST(ZORVaDoBoolean);
@@ -55,42 +85,14 @@ class ZOR_EXPORT ZORVadSingleBoolean : public ZORVaDoBoolean {
   ZORVadSingleBoolean() = default;
   explicit ZORVadSingleBoolean(ZORStreamableInit) {}
 
-  void Write(ZORopstream& out) const override;
-  void Read(ZORipstream& in) override;
-  void PrintOn(ZORostrstream& out) const override;
-  void InputValue(ZORistrstream& in) override;
-
-  // clang-format off
-  void          Assign           (const ZORVaDoAny& other) override;
-  void          SetNilValue      () override;
-  void          SetUndefinedValue() override;
-  int           IsNil            () const override;
-  int           IsUndefined      () const override;
-  int           IsIntersected    (const ZORVaDoAny& other) const override;
-  void          Intersect        (const ZORVaDoAny& other) override;
-  void          Unite            (const ZORVaDoAny& other) override;
-  unsigned long GetCardinality   () const override;
-  void          Bisect           (ZORVaDoObject& other, ValueSelection selection) override;
-
-  int CalcMinValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) override;
-  int CalcMinValue                     () override;
-  int CalcMaxValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) override;
-  int CalcMaxValue                     () override;
-  int CalcEqualValue                   (const ZORVaDoAny& other) override;
-  int CalcInverseEqualValue            (ZORVaDoAny& target) const override;
-  int CalcUnequalValue                 (const ZORVaDoAny& other) override;
-  int CalcInverseUnequalValue          (ZORVaDoAny& target) const override;
-  int CalcIsEqual                      (const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
-  int CalcLessOrEqualValue             (const ZORVaDoAny& other) override;
-  int CalcInverseLessOrEqualValue      (ZORVaDoAny& target) const override;
-  int CalcNotLessAndUnequalValue       (const ZORVaDoAny& other) override;
-  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;
-  int CalcIsLessOrEqual                (const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
-  int CalcFirstInverseMinValue         (ZORVaDoAny& target, const ZORVaDoAny& second) const override;
-  int CalcFirstInverseMaxValue         (ZORVaDoAny& target, const ZORVaDoAny& second) const override;
-  int CalcFalseValue                   () override;
-  int CalcTrueValue                    () override;
-  // clang-format on
+  ZOR_DECLARE_NUMBER_OPERATIONS();
+  void SetNilValue() override;
+  void SetUndefinedValue() override;
+  int IsNil() const override;
+  int IsUndefined() const override;
+  unsigned long GetCardinality() const override;
+  int CalcFalseValue() override;
+  int CalcTrueValue() override;
 
  private:
   static constexpr unsigned kNone = 0, kFalse = 1, kTrue = 2, kEither = kFalse | kTrue;
@@ -106,35 +108,11 @@ class ZOR_EXPORT ZORVaDoInteger : public ZORVaDoScalar {
   ZOR_DECLARE_TYPE_TEST(ZORVaDoInteger);
 
  public:
-  void Write(ZORopstream& out) const override;
-  void Read(ZORipstream& in) override;
-  void PrintOn(ZORostrstream& out) const override;
-  void InputValue(ZORistrstream& in) override;
+  // Assign comes as close as the class can hold the value, and drops no number of it. Bisect gives the other value the
+  // numbers that go. CalcMinValue() and CalcMaxValue() keep the least and the greatest of all numbers.
+  ZOR_DECLARE_NUMBER_OPERATIONS();
 
   // clang-format off
-  void Assign       (const ZORVaDoAny& other) override;  // as close as the class can hold it, never less
-  int  IsIntersected(const ZORVaDoAny& other) const override;
-  void Intersect    (const ZORVaDoAny& other) override;
-  void Unite        (const ZORVaDoAny& other) override;
-  void Bisect       (ZORVaDoObject& other, ValueSelection selection) override;  // other takes what goes
-
-  int CalcMinValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) override;
-  int CalcMinValue                     () override;  // the least of all numbers
-  int CalcMaxValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) override;
-  int CalcMaxValue                     () override;  // the greatest
-  int CalcEqualValue                   (const ZORVaDoAny& other) override;
-  int CalcInverseEqualValue            (ZORVaDoAny& target) const override;
-  int CalcUnequalValue                 (const ZORVaDoAny& other) override;
-  int CalcInverseUnequalValue          (ZORVaDoAny& target) const override;
-  int CalcIsEqual                      (const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
-  int CalcLessOrEqualValue             (const ZORVaDoAny& other) override;
-  int CalcInverseLessOrEqualValue      (ZORVaDoAny& target) const override;
-  int CalcNotLessAndUnequalValue       (const ZORVaDoAny& other) override;
-  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;
-  int CalcIsLessOrEqual                (const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
-  int CalcFirstInverseMinValue         (ZORVaDoAny& target, const ZORVaDoAny& second) const override;
-  int CalcFirstInverseMaxValue         (ZORVaDoAny& target, const ZORVaDoAny& second) const override;
-
   int CalcLessValue          (const ZORVaDoScalar& other) override;
   int CalcInverseLessValue   (ZORVaDoScalar& target) const override;
   int CalcNotLessValue       (const ZORVaDoScalar& other) override;
@@ -252,7 +230,6 @@ class ZOR_EXPORT ZORVadEnumInteger : public ZORVaDoInteger {
   int Intersect(const ZORVadEnumInteger& other);
   int IntersectInverse(ZORVadSingleInteger& target) const;
   int IntersectInverse(ZORVadIntervalInteger& target) const;
-  const ZORSVectorImp_SubIntBase& GetValues() const { return mValues; }  // none when Undefined
 
  private:
   int List(const ZORIntegerSet& allowed);

@@ -2,6 +2,7 @@
 
 #include "enum/ZORVadEnumString.h"
 #include "module/ZORVaDoString.h"
+#include "module/characters.h"
 #include "single/ZORVadSingleString.h"
 
 int InitModule(ZORVaDoModule* module, ZORVaDoModuleManager* manager) {
@@ -17,3 +18,9 @@ int InitModule(ZORVaDoModule* module, ZORVaDoModuleManager* manager) {
 }
 
 int TARVOS_WORKSHOP_BDK2_INTERNAL_ZORVadStrings() { return 1; }
+
+void InitStrings() {
+  ZORVaDoString::ZorVaDoStringMin = ZORString(ZorVaDoCharMin, 1);
+  ZORVaDoString::ZorVaDoStringMax = ZORString(ZorVaDoCharMax, zor::kLengthLimit);
+  ZORVaDoString::ZorVaDoStringAny = ZORString(ZorVaDoCharMax, zor::kLengthLimit + 1);
+}

@@ -1,8 +1,10 @@
 #include "module/ZORVaDoString.h"
 
+#include <optional>
+
+#include "host/Guard.h"
 #include "module/characters.h"
-#include "module/guard.h"
-#include "module/plumbing.h"
+#include "module/classdefinition.h"
 
 ZORString ZORVaDoString::ZorVaDoStringMin;
 ZORString ZORVaDoString::ZorVaDoStringMax;
@@ -24,6 +26,21 @@ int ToNil(ZORVaDoBoolean& result) {
   result.SetNilValue();
   return 1;
 }
+
+bool AreAtOneExtreme(const ZORVaDoString& a, const ZORVaDoString& b) {
+  return (a.IsEmpty() && b.IsEmpty()) || (a.IsFull() && b.IsFull());
+}
+
+// Whether a is less than b as far as an extreme tells, when they are not at the same one.
+std::optional<bool> IsLessByExtreme(const ZORVaDoString& a, const ZORVaDoString& b) {
+  if (b.IsFull()) return true;
+  if (a.IsEmpty()) return true;
+  if (a.IsFull()) return false;
+  if (b.IsEmpty()) return false;
+  return std::nullopt;
+}
+
+int ToTruth(ZORVaDoBoolean& result, bool truth) { return truth ? result.CalcTrueValue() : result.CalcFalseValue(); }
 
 // Whether both values are known to be one and the same text.
 bool AreOneText(const ZORVaDoString& a, const ZORVaDoString& b) {
@@ -80,8 +97,7 @@ int ZORVaDoString::CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) 
   if (IsNil() || zor::IsNil(other)) return ToNil(result);
   const ZORVaDoString* const string = DynamicCast(&other);
   if (string == nullptr) return ToNil(result);
-  if (IsEmpty() && string->IsEmpty()) return result.CalcTrueValue();
-  if (IsFull() && string->IsFull()) return result.CalcTrueValue();
+  if (AreAtOneExtreme(*this, *string)) return result.CalcTrueValue();
   if (IsEmpty() || IsFull() || string->IsEmpty() || string->IsFull()) return result.CalcFalseValue();
   if (!IsIntersected(other)) return result.CalcFalseValue();
   if (AreOneText(*this, *string)) return result.CalcTrueValue();
@@ -93,12 +109,8 @@ int ZORVaDoString::CalcIsLessOrEqual(const ZORVaDoAny& other, ZORVaDoBoolean& re
   if (IsNil() || zor::IsNil(other)) return ToNil(result);
   const ZORVaDoString* const string = DynamicCast(&other);
   if (string == nullptr) return ToNil(result);
-  if (IsEmpty() && string->IsEmpty()) return result.CalcTrueValue();
-  if (IsFull() && string->IsFull()) return result.CalcTrueValue();
-  if (string->IsFull()) return result.CalcTrueValue();
-  if (IsEmpty()) return result.CalcTrueValue();
-  if (IsFull()) return result.CalcFalseValue();
-  if (string->IsEmpty()) return result.CalcFalseValue();
+  if (AreAtOneExtreme(*this, *string)) return result.CalcTrueValue();
+  if (const auto isLess = IsLessByExtreme(*this, *string)) return ToTruth(result, *isLess);
   if (GetUpperBound() <= string->GetLowerBound()) return result.CalcTrueValue();
   if (GetLowerBound() > string->GetUpperBound()) return result.CalcFalseValue();
   return 0;
@@ -109,12 +121,8 @@ int ZORVaDoString::CalcIsLess(const ZORVaDoScalar& other, ZORVaDoBoolean& result
   if (string == nullptr) return ToNil(result);
   if (IsUndefined() || string->IsUndefined()) return ToUndefined(result);
   if (IsNil() || string->IsNil()) return ToNil(result);
-  if (IsEmpty() && string->IsEmpty()) return result.CalcFalseValue();
-  if (IsFull() && string->IsFull()) return result.CalcFalseValue();
-  if (string->IsFull()) return result.CalcTrueValue();
-  if (IsEmpty()) return result.CalcTrueValue();
-  if (IsFull()) return result.CalcFalseValue();
-  if (string->IsEmpty()) return result.CalcFalseValue();
+  if (AreAtOneExtreme(*this, *string)) return result.CalcFalseValue();
+  if (const auto isLess = IsLessByExtreme(*this, *string)) return ToTruth(result, *isLess);
   if (GetUpperBound() < string->GetLowerBound()) return result.CalcTrueValue();
   if (GetLowerBound() >= string->GetUpperBound()) return result.CalcFalseValue();
   return 0;

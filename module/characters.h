@@ -2,7 +2,7 @@
 // static objects, so that none of them depends on the order in which files come to life.
 #pragma once
 
-#include "host/ZORText.h"
+#include "module/texts.h"
 
-static const ZORChar ZorVaDoCharMin(' ');
-static const ZORChar ZorVaDoCharMax('z');
+static const ZORChar ZorVaDoCharMin(zor::kLeastCharacter);
+static const ZORChar ZorVaDoCharMax(zor::kGreatestCharacter);

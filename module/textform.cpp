@@ -1,9 +1,10 @@
 #include "module/textform.h"
 
+#include "module/texts.h"
+
 namespace {
 
 constexpr unsigned int kWordLength = 3;
-constexpr unsigned int kInputLimit = 254;
 
 // At most limit characters up to the delimiter.
 template <unsigned int kLimit>
@@ -12,6 +13,19 @@ ZORString InputLine(ZORistrstream& in, char delimiter) {
   line[0] = '\0';
   in.GetLine(line, kLimit, delimiter);
   return line;
+}
+
+void InputWord(ZORVaDoString& value, ZORistrstream& in) {
+  const ZORString word = InputLine<kWordLength>(in, '\n');
+  if (word == "Min") {
+    value.CalcMinValue();
+  } else if (word == "Max") {
+    value.CalcMaxValue();
+  } else if (word == "Any") {
+    value.SetUndefinedValue();
+  } else {
+    value.SetNilValue();
+  }
 }
 
 }  // namespace
@@ -26,19 +40,13 @@ bool zor::PrintWord(const ZORVaDoString& value, ZORostrstream& out) {
   return word != nullptr;
 }
 
-bool zor::BeginsWord(int character) { return character == 'M' || character == 'N' || character == 'A'; }
+ZORString zor::InputQuoted(ZORistrstream& in) { return InputLine<zor::kReadableLimit>(in, '"'); }
 
-void zor::InputWord(ZORVaDoString& value, ZORistrstream& in) {
-  const ZORString word = InputLine<kWordLength>(in, '\n');
-  if (word == "Min") {
-    value.CalcMinValue();
-  } else if (word == "Max") {
-    value.CalcMaxValue();
-  } else if (word == "Any") {
-    value.SetUndefinedValue();
-  } else {
-    value.SetNilValue();
-  }
+void zor::InputWordOrText(ZORVaDoString& value, ZORistrstream& in) {
+  in >> ws;
+  const int next = in.Peek();
+  if (next == 'M' || next == 'N' || next == 'A') return InputWord(value, in);
+  if (next != '"') return value.SetNilValue();
+  in.Ignore();
+  value.SetExactValue(InputQuoted(in));
 }
-
-ZORString zor::InputQuoted(ZORistrstream& in) { return InputLine<kInputLimit>(in, '"'); }

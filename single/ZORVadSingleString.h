@@ -4,7 +4,7 @@
 #include <utility>
 
 #include "module/ZORVaDoString.h"
-#include "module/fold.h"
+#include "module/texts.h"
 
 // The state and, beside it, a text that the value owns. Exact: the text, of any length and any characters. Max: the
 // greatest text. Undefined and Nil: the text means nothing; a copy takes such a state and leaves the text behind.

@@ -1,5 +1,5 @@
-// Set operations of single strings: intersection, equality, union, and texts one at a time.
-#include "module/guard.h"
+// Set operations of single strings: intersection, equality and union.
+#include "host/Guard.h"
 #include "single/ZORVadSingleString.h"
 
 int ZORVadSingleString::Intersect(const ZORVadSingleString& other) {
@@ -24,41 +24,26 @@ void ZORVadSingleString::Unite(const ZORVadSingleString& other) {
   SetUndefinedValue();
 }
 
-void ZORVadSingleString::InsertExactValue(const ZORString& text) {
-  if (IsUndefined()) return;
-  if (IsNil()) return SetExactValue(text);
-  if (mText == text) return;
-  SetUndefinedValue();
-}
-
-int ZORVadSingleString::RemoveExactValue(const ZORString& text) {
-  if (IsUndefined() || IsNil()) return 0;
-  if (!(mText == text)) return 0;
-  return Nil();
-}
-
 int ZORVadSingleString::IsIntersected(const ZORVaDoAny& other) const {
   if (IsNil() || zor::IsNil(other)) return 0;
   if (IsUndefined() || zor::IsUndefined(other)) return 1;
-  return zor::Guarded<ZORVadSingleString>(other, [&](auto& single) { return mText == single.mText ? 1 : 0; });
+  return zor::Guarded<Single>(other, [&](auto& single) { return mText == single.mText ? 1 : 0; });
 }
 
 void ZORVadSingleString::Intersect(const ZORVaDoAny& other) {
-  zor::GuardedElse<ZORVadSingleString>(
-      other, [&](auto& single) { return Intersect(single); }, [&] { return Nil(); });
+  zor::GuardedOrNil<Single>(*this, other, [&](auto& single) { return Intersect(single); });
 }
 
 int ZORVadSingleString::CalcEqualValue(const ZORVaDoAny& other) {
-  return zor::Guarded<ZORVadSingleString>(other, [&](auto& single) { return CalcEqualValue(single); });
+  return zor::Guarded<Single>(other, [&](auto& single) { return CalcEqualValue(single); });
 }
 
 int ZORVadSingleString::CalcInverseEqualValue(ZORVaDoAny& target) const {
-  return zor::Guarded<ZORVadSingleString>(target, [&](auto& single) { return single.Intersect(*this); });
+  return zor::Guarded<Single>(target, [&](auto& single) { return single.Intersect(*this); });
 }
 
 void ZORVadSingleString::Unite(const ZORVaDoAny& other) {
-  zor::GuardedElse<ZORVadSingleString>(
-      other, [&](auto& single) { return Unite(single), 0; }, [&] { return Nil(); });
+  zor::GuardedOrNil<Single>(*this, other, [&](auto& single) { return Unite(single), 0; });
 }
 
 void ZORVadSingleString::Bisect(ZORVaDoObject&, ValueSelection) { Nil(); }

@@ -1,6 +1,6 @@
 // Minimum, maximum and successor of single strings, and the extremes themselves.
-#include "module/alphabet.h"
-#include "module/guard.h"
+#include "host/Guard.h"
+#include "module/texts.h"
 #include "single/ZORVadSingleString.h"
 
 namespace {

@@ -1,5 +1,5 @@
 // Lower and upper case of single strings.
-#include "module/guard.h"
+#include "host/Guard.h"
 #include "single/ZORVadSingleString.h"
 
 using zor::Folded;

@@ -1,5 +1,5 @@
 // Order relations of single strings.
-#include "module/guard.h"
+#include "host/Guard.h"
 #include "single/ZORVadSingleString.h"
 
 // a < b when strict, else a <= b; target is a or b. The relations differ where both are at the same extreme.

@@ -1,7 +1,7 @@
 // What a single string is: its statics, construction, copies and states.
+#include "host/Guard.h"
 #include "module/characters.h"
-#include "module/guard.h"
-#include "module/plumbing.h"
+#include "module/classdefinition.h"
 #include "single/ZORVadSingleString.h"
 
 ZOR_DEFINE_STRING_CLASS(ZORVadSingleString, ZORVaDoString, "single string", ZORVaDoString::sDescriptor, 0);
@@ -61,20 +61,10 @@ int ZORVadSingleString::IsEmpty() const { return mState == ZorStringExact && mTe
 
 unsigned long ZORVadSingleString::GetCardinality() const {
   if (IsNil()) return 0;
-  if (IsUndefined()) return 255;
+  if (IsUndefined()) return zor::kLengthLimit;
   return 1;
 }
 
-void ZORVadSingleString::SetExactValue(const ZORString& text) { Become(ZorStringExact, text); }
-void ZORVadSingleString::SetLowerBound(const ZORString& text) { SetExactValue(text); }
-void ZORVadSingleString::SetUpperBound(const ZORString& text) { SetExactValue(text); }
-
-ZORString ZORVadSingleString::GetLowerBound() const { return mText; }
-ZORString ZORVadSingleString::GetUpperBound() const { return mText; }
-ZORString ZORVadSingleString::GetNextExactValue(const ZORString&) const { return mText; }
-ZORString ZORVadSingleString::GetPrevExactValue(const ZORString&) const { return mText; }
-
 void ZORVadSingleString::Assign(const ZORVaDoAny& other) {
-  zor::GuardedElse<ZORVadSingleString>(
-      other, [&](auto& single) { return Copy(single); }, [&] { return Nil(); });
+  zor::GuardedOrNil<Single>(*this, other, [&](auto& single) { return Copy(single); });
 }

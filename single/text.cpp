@@ -6,18 +6,7 @@ void ZORVadSingleString::PrintOn(ZORostrstream& out) const {
   if (!zor::PrintWord(*this, out)) out << '"' << mText.CastToCharPtr() << '"';
 }
 
-void ZORVadSingleString::InputValue(ZORistrstream& in) {
-  in >> ws;
-  const int next = in.Peek();
-  if (zor::BeginsWord(next)) {
-    zor::InputWord(*this, in);
-  } else if (next == '"') {
-    in.Ignore();
-    SetExactValue(zor::InputQuoted(in));
-  } else {
-    SetNilValue();
-  }
-}
+void ZORVadSingleString::InputValue(ZORistrstream& in) { zor::InputWordOrText(*this, in); }
 
 // Answers 1 also when the text is the one that was there.
 int ZORVadSingleString::CalcStringRepresentation(const ZORVaDoAny& x) {

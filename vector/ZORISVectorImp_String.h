@@ -29,6 +29,8 @@ class ZOR_EXPORT ZORISVectorImp_String {
   ZORISVectorImp_String(const ZORISVectorImp_String& other);
   const ZORISVectorImp_String& operator=(const ZORISVectorImp_String& other);
 
+  void Swap(ZORISVectorImp_String& other) noexcept;  // places, growth and all
+
   ZORString*& operator[](unsigned int pos);  // below Limit(), untested
   ZORString*& operator[](unsigned int pos) const;
 
@@ -90,11 +92,6 @@ class ZOR_EXPORT ZORISVectorImp_String {
     unsigned int at, below, above;
     std::strong_ordering order;
   };
-
-  friend class ZORVadEnumString;  // merges and compacts its places as blocks, through these two
-
-  void Swap(ZORISVectorImp_String& other) noexcept;
-  void SetTop(unsigned int top, unsigned int emptied);  // the places from top up to emptied become null
 
   static void DelObj(ZORString& s, void*);
   static ZORString** NewPlaces(unsigned int limit);

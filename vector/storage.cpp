@@ -170,11 +170,6 @@ void ZORISVectorImp_String::Swap(ZORISVectorImp_String& other) noexcept {
   std::swap(mGood, other.mGood);
 }
 
-void ZORISVectorImp_String::SetTop(unsigned int top, unsigned int emptied) {
-  mTop = top;
-  Zero(top, emptied);
-}
-
 void ZORISVectorImp_String::Zero(unsigned int start, unsigned int stop) {
   stop = Inside(stop);
   if (start < stop) std::fill(mItems + start, mItems + stop, nullptr);

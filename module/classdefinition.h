@@ -1,28 +1,10 @@
 // The definitions behind ZOR_DECLARE_STRING_CLASS, one row a class, in the source file that holds its statics.
 #pragma once
 
-#include <type_traits>
-
+#include "host/ClassDefinition.h"
 #include "module/ZORStringClass.h"
 
 namespace zor {
-
-// A value built in the caller's memory from what an Undefined or a known value is made of; null for a null place
-// and for a class that cannot be made.
-template <class Class, class... From>
-ZORVaDoObject* CreateAt(void* place, From... from) {
-  if constexpr (std::is_abstract_v<Class>) {
-    return nullptr;
-  } else {
-    return place != nullptr ? new (place) Class(from...) : nullptr;
-  }
-}
-
-// The factory scheme of the stream layer: an object given is answered, for a null one a new one is made for Read.
-template <class Class>
-ZORStreamable* BuildForRead(ZORStreamable* object) {
-  return object != nullptr ? object : new Class(ZorStreamableInit);
-}
 
 // The factory that a record names; the abstract class leans on that of its base.
 template <class Class>
@@ -48,10 +30,7 @@ ZORStreamable* BuildRecorded(ZORStreamable* object) {
   const Class::Descriptor* Class::MakeDescriptor() {                                                                   \
     return sDescriptor = new Descriptor(ZORString(displayName), parent, flag);                                         \
   }                                                                                                                    \
-  Class* Class::DynamicCast(ZORVaDoBase* object) { return IsKindOf(object, sIdent) ? StaticCast(object) : nullptr; }   \
-  const Class* Class::DynamicCast(const ZORVaDoBase* object) {                                                         \
-    return IsKindOf(object, sIdent) ? StaticCast(object) : nullptr;                                                    \
-  }                                                                                                                    \
+  ZOR_DEFINE_CASTS(Class, Base);                                                                                       \
   ZORipstream& Class::readPtr(ZORipstream& in, Class*& object) {                                                       \
     ZORStreamable* const read = in.ReadObjectPointer();                                                                \
     object = DynamicCast(ZORVaDoBase::FromStream(read));                                                               \
@@ -73,7 +52,6 @@ ZORStreamable* BuildRecorded(ZORStreamable* object) {
   }                                                                                                                    \
   const char* Class::CastableID() const { return CastableIdent; }                                                      \
   const ZORVaDoObjectDescriptor* Class::GetDescriptor() const { return sDescriptor; }                                  \
-  int Class::IsDerivedFrom(const char* ident) const { return ident == sIdent ? 1 : Base::IsDerivedFrom(ident); }       \
                                                                                                                        \
   Class::Descriptor::~Descriptor() = default;                                                                          \
   const char* Class::Descriptor::CastableID() const { return k##Class##DescriptorIdent; }                              \

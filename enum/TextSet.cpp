@@ -1,0 +1,122 @@
+#include "enum/TextSet.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+
+namespace zor {
+
+namespace {
+
+constexpr unsigned int kAhead = 8;    // places between a text that is compared and one on its way into the cache
+constexpr unsigned int kSearch = 16;  // so many times larger a set is searched, not walked
+
+// Asks for the text that stands kAhead places behind position i.
+void FetchAhead(ZORString* const* places, unsigned int i, unsigned int count) {
+  if (i + kAhead < count) __builtin_prefetch(places[i + kAhead]);
+}
+
+unsigned int CountIn(const ZORISVectorImp_String& texts, const ZORString& bound) {
+  ZORString* const* const places = &texts[0];
+  const auto less = [](const ZORString* listed, const ZORString& limit) { return *listed < limit; };
+  return static_cast<unsigned int>(std::lower_bound(places, places + texts.Count(), bound, less) - places);
+}
+
+}  // namespace
+
+void TextSet::Die() {
+  std::fputs("ZORVadStrings: no memory for a set of texts\n", stderr);
+  std::abort();
+}
+
+void TextSet::Reserve(unsigned int places) {
+  Require(mVector.Good());
+  if (places > mVector.Limit()) Require(mVector.Resize(places));
+}
+
+unsigned int TextSet::CountLess(const ZORString& bound) const { return CountIn(mVector, bound); }
+
+unsigned int TextSet::CountLessOrEqual(const ZORString& bound) const {
+  ZORString* const* const places = &mVector[0];
+  const auto less = [](const ZORString& limit, const ZORString* listed) { return limit < *listed; };
+  return static_cast<unsigned int>(std::upper_bound(places, places + Count(), bound, less) - places);
+}
+
+// Our places move to the end of an array with room for all, and both runs are read from there into its front, which
+// never overtakes them.
+bool TextSet::Merge(const ZORISVectorImp_String& texts, Equals equals) {
+  const unsigned int own = Count(), more = texts.Count();
+  const bool refuses = equals == Equals::Refused;
+  Reserve(own + more);
+  ZORString** const places = &mVector[0];
+  ZORString** next = places + more;
+  ZORString** const end = next + own;
+  std::copy_backward(places, places + own, end);
+
+  ZORString** out = places;
+  const ZORString* added = nullptr;
+  for (unsigned int i = 0; i < more; ++i) {
+    FetchAhead(&texts[0], i, more);
+    const ZORString& text = *texts[i];
+    std::strong_ordering order = std::strong_ordering::greater;
+    while (next != end && ((order = **next <=> text) < 0 || (order == 0 && !refuses))) *out++ = *next++;
+    const bool listed = (next != end && order == 0) || (added != nullptr && *added == text);
+    if (listed && refuses) continue;
+    added = *out++ = new ZORString(text);
+  }
+  while (next != end) *out++ = *next++;
+  const auto count = static_cast<unsigned int>(out - places);
+  if (count > own) mVector.AddAt(places[count - 1], count - 1);  // where it stands, so that all up to it count
+  mVector.DetachAt(count, own + more - count, 0);
+  return count == own + more;
+}
+
+// One walk, in which nothing is built: a text that is lost is deleted on the spot, those behind it move up.
+template <class Test>
+bool TextSet::KeepThose(Test test) {
+  const unsigned int count = Count();
+  ZORString** const places = &mVector[0];
+  unsigned int kept = 0;
+  for (unsigned int i = 0; i < count; ++i) {
+    if (test(i)) {
+      places[kept++] = places[i];
+    } else {
+      delete places[i];
+    }
+  }
+  if (kept == count) return false;
+  mVector.DetachAt(kept, count - kept, 0);
+  return true;
+}
+
+bool TextSet::Keep(const ZORISVectorImp_String& others) {
+  const unsigned int count = Count(), otherCount = others.Count();
+  ZORString* const* const places = &mVector[0];
+  const bool searches = otherCount / kSearch > count;
+  unsigned int j = 0;
+  return KeepThose([&](unsigned int i) {
+    FetchAhead(places, i, count);
+    if (searches) j = std::max(j, CountIn(others, *places[i]));
+    std::strong_ordering order = std::strong_ordering::less;
+    while (j < otherCount && (order = *places[i] <=> *others[j]) > 0) FetchAhead(&others[0], ++j, otherCount);
+    const bool isListed = j < otherCount && order == 0;
+    j += isListed ? 1 : 0;
+    return isListed;
+  });
+}
+
+bool TextSet::Keep(const Marks& marks) {
+  return marks.count() < Count() && KeepThose([&](unsigned int i) { return marks[i]; });
+}
+
+void TextSet::Cut(unsigned int first, unsigned int last) {
+  if (first < last) mVector.DetachAt(first, last - first, 1);
+}
+
+void TextSet::Mark(const ZORString& text, Marks& marks, unsigned int& next) const {
+  if (next > 0 && next <= Count() && *mVector[next - 1] == text) return;
+  if (next >= Count() || *mVector[next] != text) next = mVector.ClusteredFind(&text);
+  if (next < Count()) marks.set(next++);
+}
+
+}  // namespace zor

@@ -4,15 +4,10 @@
 
 #include <cstdlib>
 
-#include "network/session.h"
+#include "network/ZORNetwork.h"
 #include "tests/support/allocations.h"
 
 namespace zor::bench {
-
-const zornet::Session& ModuleInUse() {
-  static const zornet::Session session;
-  return session;
-}
 
 long Allocations() { return test::sAllocations; }
 
@@ -26,7 +21,7 @@ void MendHeap() {
 int main(int argc, char** argv) {
   mallopt(M_TRIM_THRESHOLD, -1);  // memory that was had once stays: the system's part in it is no part of a set's work
   mallopt(M_MMAP_MAX, 0);
-  zor::bench::ModuleInUse();
+  const zornet::Network keepsModulesLoaded{zornet::Model()};
   zor::bench::RegisterSets();
   zor::bench::RegisterSingles();
   zor::bench::RegisterNetworks();

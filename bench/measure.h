@@ -9,13 +9,7 @@
 #include <limits>
 #include <string>
 
-namespace zornet {
-class Session;
-}
-
 namespace zor::bench {
-
-const zornet::Session& ModuleInUse();  // opened by the first who asks
 
 constexpr int kRounds = 5;
 

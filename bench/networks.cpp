@@ -8,9 +8,7 @@
 #include "bench/measure.h"
 #include "bench/problems.h"
 #include "language/reader.h"
-#include "network/propagation.h"
-#include "network/session.h"
-#include "network/store.h"
+#include "network/ZORNetwork.h"
 
 namespace zor::bench {
 
@@ -26,9 +24,8 @@ struct Zornet {
   static void Run(State& state, const Problem& problem) {
     const auto solve = [&](std::size_t) {
       zornet::Diagnostics diagnostics;
-      const zornet::Model model = zornet::Read(zornet::Source("problem", problem.network), diagnostics).model;
-      zornet::Store store(ModuleInUse().Types(), model);
-      if (diagnostics.Failed() || zornet::Propagation(store, {}).Run() != zornet::Outcome::Settled) std::abort();
+      zornet::Network network(zornet::Read(zornet::Source("problem", problem.network), diagnostics).model);
+      if (diagnostics.Failed() || network.Narrow() != zornet::Outcome::Settled) std::abort();
     };
     Measure(
         state, 1, [] {}, solve, [] { return 0; });

@@ -44,6 +44,11 @@ install_library(ZORVadStrings
   vector/ZORISVectorImp_String.h)
 install_pkg_config(zorvadstrings "String types for a subdefinite constraint solver" ZORVadStrings ZORHost)
 
+install_library(ZORNetwork
+  network/ZORModel.h
+  network/ZORNetwork.h)
+install_pkg_config(zornetwork "Sound narrowing and search over networks of string constraints" ZORNetwork)
+
 set_target_properties(zornet PROPERTIES INSTALL_RPATH "\$ORIGIN/../${CMAKE_INSTALL_LIBDIR}")
 install(TARGETS zornet)
 install(FILES zornet/zornet.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 OPTIONAL)

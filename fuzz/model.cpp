@@ -4,9 +4,6 @@
 
 #include "fuzz/support.h"
 #include "language/reader.h"
-#include "network/log.h"
-#include "network/search.h"
-#include "network/session.h"
 #include "zornet/graph.h"
 #include "zornet/raw.h"
 #include "zornet/report.h"
@@ -18,66 +15,28 @@ using namespace zornet;
 constexpr Limits kLimits{64, 500};
 constexpr std::uint64_t kSolutions = 3;
 
-class Run {
- public:
-  Run(const Source& source, const ReadModel& read, Report& report)
-      : mModel(read.model), mReport(report), mNames(source, read) {}
-
-  Summary Solve(bool explains);
-
- private:
-  void CallAll();
-  void Search(Store& store, Propagation& propagation);
-  void Explain(const Store& store, const Log& log);
-
-  const Session& Types() const {
-    static const Session kSession;
-    return kSession;
-  }
-
-  const Model& mModel;
-  Report& mReport;
-  Names mNames;
-  Summary mSummary;
-};
-
-Summary Run::Solve(bool explains) {
-  CallAll();
-  Log log(mModel);
-  Store store(Types().Types(), mModel);
-  store.Watch(explains ? static_cast<Watcher*>(&log) : &mReport);
-  Propagation propagation(store, kLimits);
-  mSummary.outcome = propagation.Run();
-  mReport.Variables(store);
-  if (explains) Explain(store, log);
-  if (mSummary.outcome == Outcome::Settled) Search(store, propagation);
-  mReport.Statistics(store);
-  Graph(store, mNames);
-  mReport.Finish(store, mSummary);
-  return mSummary;
-}
-
-void Run::CallAll() {
-  Store store(Types().Types(), mModel);
-  RunRaw(store, mNames, [&](const RawCall& call) { mReport.Called(call); });
-}
-
-void Run::Search(Store& store, Propagation& propagation) {
-  store.Watch(nullptr);
-  zornet::Search search(store, propagation);
-  mSummary.outcome = search.Run(kSolutions, [&] {
-    mReport.Solution(store, ++mSummary.solutions);
+// Tells report all there is to tell of a model: bare calls, what is narrowed, explanations and solutions.
+Summary Tell(const Source& source, const ReadModel& read, Report& report, bool traces) {
+  static const Network kKeepsModulesLoaded{Model()};
+  const Names names(source, read.places, read.model);
+  Network bare(read.model, kLimits), network(read.model, kLimits);
+  RunRaw(bare, names, [&](const RawCall& call) { report.Called(call); });
+  if (traces) network.OnNarrowing([&](const Narrowing& narrowing) { report.Narrowed(narrowing); });
+  Summary summary;
+  summary.outcome = network.Narrow();
+  report.Variables(network);
+  for (int v = 0; v < static_cast<int>(read.model.Variables().size()); ++v)
+    report.Explain(network, {v}, network.Explain({v}));
+  std::uint64_t solutions = 0;
+  summary.search = network.Search(kSolutions, [&] {
+    report.Solution(network, ++solutions);
     return true;
   });
-  mSummary.searched = true;
-  mSummary.complete = search.IsComplete();
-  mSummary.open = search.Open();
-  mSummary.openVariable = search.OpenVariable();
-}
-
-void Run::Explain(const Store& store, const Log& log) {
-  const auto count = static_cast<int>(mModel.variables.size());
-  for (int variable = 0; variable < count; ++variable) mReport.Explain(store, variable, log.Explain(variable));
+  summary.outcome = summary.search->outcome;
+  report.Statistics(network);
+  Graph(network, names);
+  report.Finish(network, summary);
+  return summary;
 }
 
 void CheckObjects(std::istringstream lines) {
@@ -87,21 +46,20 @@ void CheckObjects(std::istringstream lines) {
 
 }  // namespace
 
-// Whoever listens, to the narrowing or to the reasons for it, sees the same outcome.
+// With a listener or without, the outcome is the same.
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const Source source("fuzz.szn", std::string(data, data + size));
   Diagnostics diagnostics;
-  const ReadModel model = Read(source, diagnostics);
+  const ReadModel read = Read(source, diagnostics);
   std::ostringstream objects, results, remarks;
-  const auto json = MakeJsonReport(source, model, objects);
-  const auto text = MakeTextReport(source, model, {true, true, true, false}, results, remarks);
+  const auto json = MakeJsonReport(source, read.places, read.model, objects);
+  const auto text = MakeTextReport(source, read.places, read.model, {true, true, true, false}, results, remarks);
   if (diagnostics.Failed()) {
     for (Report* report : {json.get(), text.get()}) report->Errors(source, diagnostics);
   } else {
-    const Summary told = Run(source, model, *text).Solve(false);
-    const Summary explained = Run(source, model, *json).Solve(true);
-    const bool isSame = told.outcome == explained.outcome && told.solutions == explained.solutions;
-    if (!isSame) zor::fuzz::Fail("another outcome when it is explained");
+    const Summary traced = Tell(source, read, *text, true), plain = Tell(source, read, *json, false);
+    const bool isSame = traced.outcome == plain.outcome && traced.search->solutions == plain.search->solutions;
+    if (!isSame) zor::fuzz::Fail("another outcome when it is traced");
   }
   CheckObjects(std::istringstream(objects.str()));
   return 0;

@@ -51,6 +51,12 @@ bool GreaterOrEqual(bool a, bool b) { return LessOrEqual(b, a); }
 
 }  // namespace
 
+bool ZORVaDoBoolean::CanBe(bool truth) const {
+  ZORVadSingleBoolean one;
+  truth ? one.CalcTrueValue() : one.CalcFalseValue();
+  return IsIntersected(one) != 0;
+}
+
 int ZORVaDoBoolean::CalcOutcome(bool canBeFalse, bool canBeTrue) {
   if (canBeFalse && canBeTrue) return 0;
   if (canBeFalse) return CalcFalseValue();

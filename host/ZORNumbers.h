@@ -76,6 +76,8 @@ class ZOR_EXPORT ZORVaDoBoolean : public ZORVaDoAny {
 
   // Takes in the truth of a relation: open when it can be either, a contradiction when it can be neither.
   int CalcOutcome(bool canBeFalse, bool canBeTrue);
+
+  bool CanBe(bool truth) const;
 };
 
 class ZOR_EXPORT ZORVadSingleBoolean : public ZORVaDoBoolean {

@@ -6,7 +6,8 @@
 #include <charconv>
 #include <limits>
 
-#include "network/texts.h"
+#include "host/ZORText.h"
+#include "module/texts.h"
 
 namespace zornet {
 
@@ -87,7 +88,7 @@ void Lexer::CheckText(Extent inside) {
   const std::string_view text = mSource.Text(inside);
   for (std::size_t i = 0; i < text.size();) {
     const std::size_t length = CharacterLength(text.substr(i));
-    if (!IsInAlphabet(text[i])) {
+    if (!zor::IsInAlphabet(text[i])) {
       mDiagnostics.Error({inside.begin + i, length},
                          fmt::format("{} is no character of a text: those are the ones from space to z, without {{|}}~",
                                      NameOf(text.substr(i, length))));
@@ -95,9 +96,10 @@ void Lexer::CheckText(Extent inside) {
     }
     i += length;
   }
-  if (text.size() > kTextLimit) {
-    mDiagnostics.Error({inside.begin - 1, inside.length + 2},
-                       fmt::format("a text has at most {} characters, this one has {}", kTextLimit, text.size()));
+  if (text.size() > zor::kLengthLimit) {
+    mDiagnostics.Error(
+        {inside.begin - 1, inside.length + 2},
+        fmt::format("a text has at most {} characters, this one has {}", zor::kLengthLimit, text.size()));
   }
 }
 

@@ -3,19 +3,19 @@
 #include <fmt/core.h>
 
 #include <algorithm>
+#include <array>
+#include <cstdint>
 #include <unordered_map>
 #include <unordered_set>
 #include <utility>
 
+#include "host/ZORNumbers.h"
 #include "language/spelling.h"
 #include "language/syntax.h"
 
 namespace zornet {
 
 namespace {
-
-// ZORVadEnumInteger knows no more numbers than these.
-constexpr std::size_t kNumberLimit = 4096;
 
 std::string_view Describe(Word::Type type) {
   switch (type) {
@@ -31,20 +31,16 @@ std::string_view Describe(Word::Type type) {
   return "";
 }
 
-std::string_view Describe(Sort sort) {
-  switch (sort) {
-    case Sort::Text:
+std::string_view Describe(Takes takes) {
+  switch (takes) {
+    case Takes::Text:
       return "a text";
-    case Sort::TextSet:
-      return "a set of texts";
-    case Sort::Integer:
+    case Takes::Integer:
       return "an integer";
-    case Sort::Interval:
-      return "an interval";
-    case Sort::IntegerSet:
-      return "a set of integers";
-    case Sort::Boolean:
+    case Takes::Boolean:
       return "a truth value";
+    case Takes::Anything:
+      return "anything";
   }
   return "";
 }
@@ -52,20 +48,6 @@ std::string_view Describe(Sort sort) {
 Word::Type MemberType(Sort sort) {
   if (IsText(sort)) return Word::Text;
   return sort == Sort::Boolean ? Word::Truth : Word::Number;
-}
-
-bool Fits(Sort sort, Takes takes) {
-  switch (takes) {
-    case Takes::Text:
-      return IsText(sort);
-    case Takes::Integer:
-      return IsInteger(sort);
-    case Takes::Boolean:
-      return sort == Sort::Boolean;
-    case Takes::Anything:
-      return true;
-  }
-  return false;
 }
 
 template <class T>
@@ -82,14 +64,13 @@ class Resolver {
 
   ReadModel Resolve() {
     mNames.reserve(mSyntax.declarations.size());
-    mModel.variables.reserve(mSyntax.declarations.size() + CountConstants());
-    mRead.variables.reserve(mModel.variables.capacity());
-    mModel.constraints.reserve(mSyntax.constraints.size());
-    mRead.constraints.reserve(mSyntax.constraints.size());
+    const std::size_t variables = mSyntax.declarations.size() + CountConstants();
+    mModel.Reserve(variables, mSyntax.constraints.size());
+    mRead.places.variables.reserve(variables);
+    mRead.places.constraints.reserve(mSyntax.constraints.size());
     for (const DeclarationSyntax& declaration : mSyntax.declarations) Declare(declaration);
     for (const ConstraintSyntax& constraint : mSyntax.constraints) Add(constraint);
     for (const Token& name : mSyntax.outputs) AddOutput(name);
-    if (mSyntax.outputs.empty()) PrintAllDeclared();
     return std::move(mRead);
   }
 
@@ -106,9 +87,8 @@ class Resolver {
   int AddConstant(const Word& word);
   int Find(const Token& name);
   int AddVariable(Variable variable, Extent place);
-  Extent PlaceOf(int variable) const { return mRead.variables[static_cast<std::size_t>(variable)]; }
+  Extent PlaceOf(int variable) const { return mRead.places.variables[static_cast<std::size_t>(variable)]; }
   void AddOutput(const Token& name);
-  void PrintAllDeclared();
 
   const Syntax& mSyntax;
   Diagnostics& mDiagnostics;
@@ -146,9 +126,9 @@ bool Resolver::SetType(const TypeSyntax& type, Variable& variable) {
     return false;
   }
   if (type.sort == Sort::Interval) variable.numbers.resize(2, variable.numbers.front());
-  if (type.sort == Sort::IntegerSet && variable.numbers.size() > kNumberLimit) {
-    mDiagnostics.Error(type.extent, fmt::format("a set has at most {} integers, this one has {}", kNumberLimit,
-                                                variable.numbers.size()));
+  if (type.sort == Sort::IntegerSet && variable.numbers.size() > ZORVadEnumInteger::kListLimit) {
+    mDiagnostics.Error(type.extent, fmt::format("a set has at most {} integers, this one has {}",
+                                                ZORVadEnumInteger::kListLimit, variable.numbers.size()));
     return false;
   }
   return true;
@@ -165,7 +145,7 @@ bool Resolver::Collect(std::span<const Word> words, Word::Type expected, Variabl
       return false;
     }
     if (expected == Word::Text) variable.texts.emplace_back(word.token.text);
-    if (expected == Word::Number) variable.numbers.push_back(static_cast<ZORLong>(word.token.number));
+    if (expected == Word::Number) variable.numbers.push_back(static_cast<std::int32_t>(word.token.number));
     if (expected == Word::Truth) variable.numbers.push_back(word.token.Is("true") ? 1 : 0);
   }
   SortUnique(variable.texts);
@@ -177,7 +157,7 @@ bool Resolver::SetValue(const DeclarationSyntax& declaration, Variable& variable
   if (declaration.value.empty()) return true;
   const Sort sort = variable.sort;
   if (declaration.setValue && sort != Sort::TextSet && sort != Sort::IntegerSet) {
-    mDiagnostics.Error(declaration.valueExtent, fmt::format("a set is no value for {}", Describe(sort)));
+    mDiagnostics.Error(declaration.valueExtent, fmt::format("a set is no value for {}", NamesOf(sort).described));
     mDiagnostics.Note(declaration.type.extent, "the type is declared here");
     return false;
   }
@@ -195,7 +175,7 @@ bool Resolver::SetValue(const DeclarationSyntax& declaration, Variable& variable
 }
 
 bool Resolver::IsAllowed(const Variable& variable, const Word& word) const {
-  const auto number = static_cast<ZORLong>(word.token.number);
+  const auto number = static_cast<std::int32_t>(word.token.number);
   if (variable.sort == Sort::Interval) return variable.numbers.front() <= number && number <= variable.numbers.back();
   if (variable.texts.empty() && variable.numbers.empty()) return true;
   if (word.type == Word::Text) return std::binary_search(variable.texts.begin(), variable.texts.end(), word.token.text);
@@ -205,16 +185,16 @@ bool Resolver::IsAllowed(const Variable& variable, const Word& word) const {
 void Resolver::Add(const ConstraintSyntax& syntax) {
   const Kind* kind = FindKindFor(syntax);
   if (kind == nullptr) return;
-  Constraint constraint{kind, {}};
+  std::array<Var, kMostArguments> variables;
   bool good = true;
   const std::span<const Word> arguments = mSyntax.ArgumentsOf(syntax);
   for (std::size_t i = 0; i < arguments.size(); ++i) {
-    constraint.arguments[i] = AddArgument(arguments[i], kind->takes[i], kind->name, kind->roles[i]);
-    good = good && constraint.arguments[i] != kUnknown;
+    variables[i].index = AddArgument(arguments[i], kind->takes[i], kind->name, kind->roles[i]);
+    good = good && variables[i].index != kUnknown;
   }
   if (!good) return;
-  mModel.constraints.push_back(constraint);
-  mRead.constraints.push_back(syntax.extent);
+  mModel.Post(*kind, std::span(variables).first(arguments.size()));
+  mRead.places.constraints.push_back(syntax.extent);
 }
 
 // Null when there is no constraint of that name, or when it takes another number of arguments.
@@ -238,27 +218,29 @@ const Kind* Resolver::FindKindFor(const ConstraintSyntax& constraint) {
 int Resolver::AddArgument(const Word& word, Takes takes, std::string_view constraint, std::string_view role) {
   const int variable = word.type == Word::Name ? Find(word.token) : AddConstant(word);
   if (variable == kUnknown) return kUnknown;
-  const Variable& found = mModel.variables[static_cast<std::size_t>(variable)];
+  const Variable& found = mModel.Variables()[static_cast<std::size_t>(variable)];
   if (Fits(found.sort, takes)) return variable;
   const std::string what = word.type == Word::Name ? fmt::format("'{}'", word.token.text) : "this";
   mDiagnostics.Error(word.token.extent, fmt::format("{} takes {} for {}, and {} is {}", constraint, Describe(takes),
-                                                    role, what, Describe(found.sort)));
+                                                    role, what, NamesOf(found.sort).described));
   if (word.type == Word::Name) mDiagnostics.Note(PlaceOf(variable), fmt::format("'{}' is declared here", found.name));
   return kUnknown;
 }
 
 int Resolver::AddConstant(const Word& word) {
   Variable constant;
+  constant.constant = true;
   if (word.type == Word::Number) constant.sort = Sort::Integer;
   if (word.type == Word::Truth) constant.sort = Sort::Boolean;
   Collect({&word, 1}, word.type, constant);
   return AddVariable(std::move(constant), word.token.extent);
 }
 
+// After an error nobody uses the model, and its values may be none that a model can hold.
 int Resolver::AddVariable(Variable variable, Extent place) {
-  mModel.variables.push_back(std::move(variable));
-  mRead.variables.push_back(place);
-  return static_cast<int>(mModel.variables.size()) - 1;
+  if (mDiagnostics.Failed()) variable = {std::move(variable.name), variable.sort, {}, {}, variable.constant};
+  mRead.places.variables.push_back(place);
+  return mModel.Add(std::move(variable)).index;
 }
 
 int Resolver::Find(const Token& name) {
@@ -277,13 +259,7 @@ int Resolver::Find(const Token& name) {
 
 void Resolver::AddOutput(const Token& name) {
   const int variable = Find(name);
-  if (variable != kUnknown) mModel.outputs.push_back(variable);
-}
-
-void Resolver::PrintAllDeclared() {
-  for (std::size_t i = 0; i < mModel.variables.size(); ++i) {
-    if (!mModel.variables[i].IsConstant()) mModel.outputs.push_back(static_cast<int>(i));
-  }
+  if (variable != kUnknown) mModel.Want({variable});
 }
 
 }  // namespace

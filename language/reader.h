@@ -4,19 +4,22 @@
 
 #include "language/diagnostics.h"
 #include "language/source.h"
-#include "network/model.h"
+#include "network/ZORModel.h"
 
 namespace zornet {
 
-// A model and where its parts stand in the source: of a variable its name or constant, of a constraint all from its
-// name to its closing parenthesis.
-struct ReadModel {
-  Model model;
+// Where the parts of a model stand in its source: of a variable its name or constant, of a constraint all from its name
+// to its closing parenthesis.
+struct Places {
   std::vector<Extent> variables;
   std::vector<Extent> constraints;
 };
 
 // The model is good when diagnostics has not failed.
+struct ReadModel {
+  Model model;
+  Places places;
+};
 ReadModel Read(const Source& source, Diagnostics& diagnostics);
 
 }  // namespace zornet

@@ -7,7 +7,7 @@
 
 #include "language/diagnostics.h"
 #include "language/lexer.h"
-#include "network/model.h"
+#include "network/ZORModel.h"
 
 namespace zornet {
 

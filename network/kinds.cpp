@@ -1,4 +1,4 @@
-#include "network/kinds.h"
+#include "network/ZORModel.h"
 
 #include <algorithm>
 
@@ -10,17 +10,17 @@ constexpr Takes T = Takes::Text, I = Takes::Integer, B = Takes::Boolean, V = Tak
 
 // clang-format off
 constexpr Kind kKinds[] = {
-  // name          meaning                mirrored truth  arity takes         roles
+  // name          meaning                mirrored reified arity takes         roles
   {"str_eq",       Meaning::Equal,         false, false,  2,    {T, T},       {"x", "y"}},
   {"str_ne",       Meaning::Unequal,       false, false,  2,    {T, T},       {"x", "y"}},
-  {"str_lt",       Meaning::Below,         false, false,  2,    {T, T},       {"x", "y"}},
-  {"str_le",       Meaning::NotAbove,      false, false,  2,    {T, T},       {"x", "y"}},
-  {"str_gt",       Meaning::Below,         true,  false,  2,    {T, T},       {"x", "y"}},
-  {"str_ge",       Meaning::NotAbove,      true,  false,  2,    {T, T},       {"x", "y"}},
+  {"str_lt",       Meaning::Less,         false, false,  2,    {T, T},       {"x", "y"}},
+  {"str_le",       Meaning::LessOrEqual,      false, false,  2,    {T, T},       {"x", "y"}},
+  {"str_gt",       Meaning::Less,         true,  false,  2,    {T, T},       {"x", "y"}},
+  {"str_ge",       Meaning::LessOrEqual,      true,  false,  2,    {T, T},       {"x", "y"}},
 
   {"str_eq_reif",  Meaning::Equal,         false, true,   3,    {T, T, B},    {"x", "y", "b"}},
-  {"str_lt_reif",  Meaning::Below,         false, true,   3,    {T, T, B},    {"x", "y", "b"}},
-  {"str_le_reif",  Meaning::NotAbove,      false, true,   3,    {T, T, B},    {"x", "y", "b"}},
+  {"str_lt_reif",  Meaning::Less,         false, true,   3,    {T, T, B},    {"x", "y", "b"}},
+  {"str_le_reif",  Meaning::LessOrEqual,      false, true,   3,    {T, T, B},    {"x", "y", "b"}},
 
   {"str_concat",   Meaning::Concatenation, false, false,  3,    {T, T, T},    {"x", "y", "z"}},
   {"str_substr",   Meaning::Slice,         false, false,  4,    {T, I, I, T}, {"x", "from", "to", "z"}},
@@ -34,6 +34,16 @@ constexpr Kind kKinds[] = {
 };
 // clang-format on
 
+// In the order of Sort.
+constexpr SortNames kSortNames[kSorts] = {
+    {"string", "a text", "single string"},
+    {"set string", "a set of texts", "enum string"},
+    {"int", "an integer", "single integer"},
+    {"interval", "an interval", "interval integer"},
+    {"set int", "a set of integers", "enum integer"},
+    {"bool", "a truth value", "single boolean"},
+};
+
 }  // namespace
 
 std::span<const Kind> Kinds() { return kKinds; }
@@ -43,18 +53,20 @@ const Kind* FindKind(std::string_view name) {
   return found != std::end(kKinds) ? found : nullptr;
 }
 
-std::string_view Describe(Takes takes) {
+bool Fits(Sort sort, Takes takes) {
   switch (takes) {
     case Takes::Text:
-      return "a text";
+      return IsText(sort);
     case Takes::Integer:
-      return "an integer";
+      return IsInteger(sort);
     case Takes::Boolean:
-      return "a truth value";
+      return sort == Sort::Boolean;
     case Takes::Anything:
-      return "anything";
+      return true;
   }
-  return "";
+  return false;
 }
+
+const SortNames& NamesOf(Sort sort) { return kSortNames[static_cast<std::size_t>(sort)]; }
 
 }  // namespace zornet

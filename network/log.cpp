@@ -6,24 +6,24 @@ namespace zornet {
 
 void Log::Narrowed(const Narrowing& narrowing) {
   Entry entry{narrowing, {}};
-  if (mLast[static_cast<std::size_t>(narrowing.variable)] != kNone) {
-    entry.causes.push_back(mLast[static_cast<std::size_t>(narrowing.variable)]);
+  if (mLast[static_cast<std::size_t>(narrowing.variable.index)] != kNone) {
+    entry.causes.push_back(mLast[static_cast<std::size_t>(narrowing.variable.index)]);
   }
   if (narrowing.constraint != kNone) {
-    const Constraint& constraint = mModel.constraints[static_cast<std::size_t>(narrowing.constraint)];
+    const Constraint& constraint = mModel.Constraints()[static_cast<std::size_t>(narrowing.constraint)];
     for (int i = 0; i < constraint.kind->arity; ++i) {
       const int last = mLast[static_cast<std::size_t>(constraint.arguments[static_cast<std::size_t>(i)])];
       if (last != kNone) entry.causes.push_back(last);
     }
   }
-  mLast[static_cast<std::size_t>(narrowing.variable)] = static_cast<int>(mEntries.size());
+  mLast[static_cast<std::size_t>(narrowing.variable.index)] = static_cast<int>(mEntries.size());
   mEntries.push_back(std::move(entry));
 }
 
 // Causes come before what they cause, so that one walk backwards meets everything that is needed.
-Log::Explanation Log::Explain(int variable) const {
+Explanation Log::Explain(int variable) const {
   Explanation explanation;
-  std::vector<char> needed(mEntries.size(), 0), used(mModel.variables.size(), 0);
+  std::vector<char> needed(mEntries.size(), 0), used(mModel.Variables().size(), 0);
   used[static_cast<std::size_t>(variable)] = 1;
   const int last = mLast[static_cast<std::size_t>(variable)];
   if (last != kNone) needed[static_cast<std::size_t>(last)] = 1;
@@ -31,17 +31,17 @@ Log::Explanation Log::Explain(int variable) const {
     if (needed[static_cast<std::size_t>(i)] == 0) continue;
     const Entry& entry = mEntries[static_cast<std::size_t>(i)];
     for (const int cause : entry.causes) needed[static_cast<std::size_t>(cause)] = 1;
-    explanation.narrowings.push_back(&entry.narrowing);
+    explanation.narrowings.push_back(entry.narrowing);
     if (entry.narrowing.constraint == kNone) continue;
-    const Constraint& constraint = mModel.constraints[static_cast<std::size_t>(entry.narrowing.constraint)];
+    const Constraint& constraint = mModel.Constraints()[static_cast<std::size_t>(entry.narrowing.constraint)];
     for (int a = 0; a < constraint.kind->arity; ++a)
       used[static_cast<std::size_t>(constraint.arguments[static_cast<std::size_t>(a)])] = 1;
   }
   std::reverse(explanation.narrowings.begin(), explanation.narrowings.end());
-  for (std::size_t v = 0; v < mModel.variables.size(); ++v) {
-    const Variable& declared = mModel.variables[v];
+  for (std::size_t v = 0; v < mModel.Variables().size(); ++v) {
+    const Variable& declared = mModel.Variables()[v];
     const bool starts = !declared.texts.empty() || !declared.numbers.empty();
-    if (used[v] != 0 && starts && !declared.IsConstant()) explanation.declared.push_back(static_cast<int>(v));
+    if (used[v] != 0 && starts && !declared.constant) explanation.declared.push_back({{static_cast<int>(v)}, ""});
   }
   return explanation;
 }

@@ -9,14 +9,11 @@ namespace zornet {
 
 class Log : public Watcher {
  public:
-  explicit Log(const Model& model) : mModel(model), mLast(model.variables.size(), kNone) {}
+  explicit Log(const Model& model) : mModel(model), mLast(model.Variables().size(), kNone) {}
 
   void Narrowed(const Narrowing& narrowing) override;
 
-  struct Explanation {
-    std::vector<int> declared;                 // variables that took part with what they started with
-    std::vector<const Narrowing*> narrowings;  // in the order in which they happened
-  };
+  // What brought variable to what it is; of declared the variables alone.
   Explanation Explain(int variable) const;
 
  private:

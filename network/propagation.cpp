@@ -11,16 +11,16 @@ constexpr std::uint64_t kProgressSteps = 256;
 Propagation::Propagation(Store& store, const Limits& limits)
     : mStore(store), mModel(store.Model()), mLimits(limits), mRelations(store), mFunctions(store, limits.budget) {
   Connect();
-  mStates.resize(mModel.constraints.size(), Idle);
-  mQueue.resize(mModel.constraints.size());
-  for (std::size_t i = 0; i < mModel.constraints.size(); ++i) Wake(static_cast<int>(i));
+  mStates.resize(mModel.Constraints().size(), Idle);
+  mQueue.resize(mModel.Constraints().size());
+  for (std::size_t i = 0; i < mModel.Constraints().size(); ++i) Wake(static_cast<int>(i));
 }
 
 void Propagation::Connect() {
-  mFirstReader.resize(mModel.variables.size() + 1, 0);
+  mFirstReader.resize(mModel.Variables().size() + 1, 0);
   const auto each = [this](auto visit) {
-    for (std::size_t c = 0; c < mModel.constraints.size(); ++c) {
-      const Constraint& constraint = mModel.constraints[c];
+    for (std::size_t c = 0; c < mModel.Constraints().size(); ++c) {
+      const Constraint& constraint = mModel.Constraints()[c];
       for (int i = 0; i < constraint.kind->arity; ++i) {
         visit(static_cast<int>(c), static_cast<std::size_t>(constraint.arguments[static_cast<std::size_t>(i)]));
       }
@@ -34,6 +34,7 @@ void Propagation::Connect() {
 }
 
 Outcome Propagation::Run() {
+  if (mStore.HasFailed()) return Outcome::Contradiction;
   WakeReaders(kNone);
   while (mWaiting != 0) {
     if (mSteps >= mLimits.steps) return Outcome::StepLimit;
@@ -48,7 +49,7 @@ Outcome Propagation::Run() {
 }
 
 Progress Propagation::Narrow(int constraint) {
-  const Constraint& what = mModel.constraints[static_cast<std::size_t>(constraint)];
+  const Constraint& what = mModel.Constraints()[static_cast<std::size_t>(constraint)];
   mStore.StartConstraint(constraint);
   const auto progress = what.kind->IsRelation() ? mRelations.Narrow(what) : mFunctions.Narrow(what);
   if (progress == Progress::Done) {

@@ -12,13 +12,6 @@
 
 namespace zornet {
 
-struct Limits {
-  std::size_t budget = 65536;         // combinations that the supports of one constraint may try
-  std::uint64_t steps = 100'000'000;  // passes over a constraint
-};
-
-enum class Outcome { Settled, Contradiction, StepLimit };
-
 class Propagation {
  public:
   Propagation(Store& store, const Limits& limits);

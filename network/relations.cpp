@@ -13,10 +13,10 @@ Meaning Opposite(Meaning meaning) {
       return Meaning::Unequal;
     case Meaning::Unequal:
       return Meaning::Equal;
-    case Meaning::NotAbove:
-      return Meaning::Below;
+    case Meaning::LessOrEqual:
+      return Meaning::Less;
     default:
-      return Meaning::NotAbove;
+      return Meaning::LessOrEqual;
   }
 }
 
@@ -24,14 +24,14 @@ Operation RelationOf(Meaning meaning) {
   switch (meaning) {
     case Meaning::Equal:
       return Operation::IsEqual;
-    case Meaning::NotAbove:
+    case Meaning::LessOrEqual:
       return Operation::IsLessOrEqual;
     default:
       return Operation::IsLess;
   }
 }
 
-bool IsOrder(Meaning meaning) { return meaning == Meaning::NotAbove || meaning == Meaning::Below; }
+bool IsOrder(Meaning meaning) { return meaning == Meaning::LessOrEqual || meaning == Meaning::Less; }
 
 }  // namespace
 
@@ -46,7 +46,7 @@ Progress Relations::Narrow(const Constraint& constraint) {
   const Meaning meaning = constraint.kind->meaning;
   const int x = constraint.arguments[constraint.kind->mirrored ? 1 : 0];
   const int y = constraint.arguments[constraint.kind->mirrored ? 0 : 1];
-  if (!constraint.kind->truth) return Post(meaning, x, y);
+  if (!constraint.kind->reified) return Post(meaning, x, y);
   const int truth = constraint.arguments[2];
   if (!mStore[truth].IsOne()) return Decide(meaning, x, y, truth);
   if (mStore[truth].LowestNumber() != 0) return Post(meaning, x, y);
@@ -61,12 +61,12 @@ Progress Relations::Post(Meaning meaning, int x, int y) {
     case Meaning::Unequal:
       return Unequal(x, y);
     default:
-      return Ordered(x, y, meaning == Meaning::Below);
+      return Ordered(x, y, meaning == Meaning::Less);
   }
 }
 
 Progress Relations::Reflexive(Meaning meaning, int x) {
-  mStore.StartOperation(meaning == Meaning::Unequal ? Operation::Unequal : Operation::NotAbove);
+  mStore.StartOperation(meaning == Meaning::Unequal ? Operation::Unequal : Operation::LessOrEqual);
   if (!Truth::Relates(meaning, ZORString(), ZORString())) mStore.Fail(x);
   return Progress::Done;
 }
@@ -129,10 +129,10 @@ Progress Relations::Ordered(int x, int y, bool strict) {
 // Below the least text there is none, nor above the greatest.
 void Relations::FailBeyondEnds(int x, int y) {
   if (mStore[y].IsKnown() && mStore[y].HighestText().GetLengthInChar() == 0) {
-    mStore.StartOperation(Operation::NotAbove);
+    mStore.StartOperation(Operation::LessOrEqual);
     mStore.Fail(x);
   } else if (mStore[x].IsKnown() && mStore[x].LowestText() == GreatestText()) {
-    mStore.StartOperation(Operation::NotBelow);
+    mStore.StartOperation(Operation::NotLess);
     mStore.Fail(y);
   }
 }
@@ -141,7 +141,7 @@ void Relations::CutAbove(int target, const ZORString& bound, bool strict) {
   const ZORString highest = mStore[target].HighestText();
   if (strict ? highest < bound : highest <= bound) return;
   Value& outcome = mStore.CopyOf(target);
-  mStore.StartOperation(Operation::NotAbove);
+  mStore.StartOperation(Operation::LessOrEqual);
   if (bound < highest) LowerTo(bound, highest, outcome);
   if (strict) RemoveFrom(outcome, bound);
   mStore.Meet(target, outcome);
@@ -157,7 +157,7 @@ void Relations::CutBelow(int target, const ZORString& bound, bool strict) {
   const ZORString lowest = mStore[target].LowestText();
   if (strict ? lowest > bound : lowest >= bound) return;
   Value& outcome = mStore.CopyOf(target);
-  mStore.StartOperation(Operation::NotBelow);
+  mStore.StartOperation(Operation::NotLess);
   if (lowest < bound) RaiseTo(bound, lowest, outcome);
   if (strict) RemoveFrom(outcome, bound);
   mStore.Meet(target, outcome);
@@ -226,8 +226,8 @@ void Relations::AskEqual(const Value& left, const Value& right, Value& answer) {
 
 void Relations::AskOrder(Meaning meaning, const Value& left, const Value& right, Value& answer) {
   if (!TouchesLeast(left) && !TouchesLeast(right)) {
-    meaning == Meaning::Below ? left.Text().CalcIsLess(right.Text(), answer.Boolean())
-                              : left.Text().CalcIsLessOrEqual(right.Any(), answer.Boolean());
+    meaning == Meaning::Less ? left.Text().CalcIsLess(right.Text(), answer.Boolean())
+                             : left.Text().CalcIsLessOrEqual(right.Any(), answer.Boolean());
   } else if (Truth::Relates(meaning, left.HighestText(), right.LowestText())) {
     answer.SetNumber(1);
   } else if (!Truth::Relates(meaning, left.LowestText(), right.HighestText())) {

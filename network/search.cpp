@@ -37,7 +37,7 @@ Outcome Search::Look(std::uint64_t limit, const Solution& solution) {
 bool Search::Descend() {
   int chosen = kNone;
   std::size_t fewest = 0;
-  for (int v = 0; v < static_cast<int>(mStore.Model().variables.size()); ++v) {
+  for (int v = 0; v < static_cast<int>(mStore.Model().Variables().size()); ++v) {
     if (mStore[v].IsOne()) continue;
     const Listing& listing = mStore.List(v);
     if (!listing.known || (chosen != kNone && listing.count >= fewest)) continue;
@@ -72,7 +72,7 @@ void Search::Retract() {
 }
 
 void Search::Leaf(const Solution& solution) {
-  for (int v = 0; v < static_cast<int>(mStore.Model().variables.size()); ++v) {
+  for (int v = 0; v < static_cast<int>(mStore.Model().Variables().size()); ++v) {
     if (mStore[v].IsOne()) continue;
     ++mOpen;
     mOpenVariable = v;
@@ -84,16 +84,17 @@ void Search::Leaf(const Solution& solution) {
 }
 
 bool Search::Confirm() {
-  return std::all_of(mStore.Model().constraints.begin(), mStore.Model().constraints.end(), [&](const Constraint& c) {
-    std::array<Exact, kMostArguments> exact{};
-    for (int i = 0; i < c.kind->arity; ++i) {
-      const auto at = static_cast<std::size_t>(i);
-      const Listing& listing = mStore.List(c.arguments[at]);
-      exact[at] = {IsText(listing.sort) ? &listing.texts.front() : nullptr,
-                   IsText(listing.sort) ? 0 : listing.NumberAt(0), listing.sort};
-    }
-    return mTruth.Holds(*c.kind, exact.data());
-  });
+  return std::all_of(mStore.Model().Constraints().begin(), mStore.Model().Constraints().end(),
+                     [&](const Constraint& c) {
+                       std::array<Exact, kMostArguments> exact{};
+                       for (int i = 0; i < c.kind->arity; ++i) {
+                         const auto at = static_cast<std::size_t>(i);
+                         const Listing& listing = mStore.List(c.arguments[at]);
+                         exact[at] = {IsText(listing.sort) ? &listing.texts.front() : nullptr,
+                                      IsText(listing.sort) ? 0 : listing.NumberAt(0), listing.sort};
+                       }
+                       return mTruth.Holds(*c.kind, exact.data());
+                     });
 }
 
 }  // namespace zornet

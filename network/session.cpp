@@ -5,12 +5,7 @@ namespace zornet {
 Session::Session(const std::vector<std::string>& folders) {
   for (const std::string& folder : folders) mManager.AddSearchPath(ToZor(folder));
   const ZORVaDoModule& numbers = Open("ZORVadNumbers");
-  const ZORVaDoModule& strings = Open("ZORVadStrings");
-  try {
-    mTypes = std::make_unique<zornet::Types>(strings, numbers);
-  } catch (const std::runtime_error& error) {
-    throw ModuleFailure(error.what());
-  }
+  mTypes = std::make_unique<zornet::Types>(Open("ZORVadStrings"), numbers);
 }
 
 const ZORVaDoModule& Session::Open(const char* name) {

@@ -2,7 +2,6 @@
 #pragma once
 
 #include <memory>
-#include <stdexcept>
 #include <string>
 #include <vector>
 
@@ -10,10 +9,6 @@
 #include "network/values.h"
 
 namespace zornet {
-
-struct ModuleFailure : std::runtime_error {
-  using std::runtime_error::runtime_error;
-};
 
 // Values must be gone before the session in which they were made.
 class Session {

@@ -1,7 +1,5 @@
 #include "network/store.h"
 
-#include <fmt/format.h>
-
 #include <algorithm>
 #include <utility>
 
@@ -9,43 +7,30 @@ namespace zornet {
 
 namespace {
 
-// The longest text that the text form of a value can bring in.
-constexpr std::size_t kReadableText = 254;
-
-std::string TextForm(const std::vector<std::string>& texts) {
-  const std::string list = fmt::format("\"{}\"", fmt::join(texts, "\", \""));
-  return texts.size() > 1 ? "{ " + list + " }" : list;
-}
-
-bool IsReadable(const std::vector<std::string>& texts) {
-  return std::all_of(texts.begin(), texts.end(), [](const auto& text) { return text.size() <= kReadableText; });
-}
-
-}  // namespace
-
-Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(types), mModel(model) {
-  mValues.reserve(model.variables.size());
-  for (const Variable& variable : model.variables) mValues.push_back(Initial(types, variable));
-  for (int i = 0; i < kSorts; ++i) mFresh.emplace_back(types, static_cast<Sort>(i));
-  mListings.resize(mValues.size());
-  mListed.resize(mValues.size(), 0);
-}
-
-Value Store::Initial(const zornet::Types& types, const Variable& variable) {
+Value Initial(const Types& types, const Variable& variable) {
   Value value(types, variable.sort);
   if (variable.texts.empty() && variable.numbers.empty()) return value;
   if (!IsText(variable.sort)) {
     value.SetNumbers(variable.numbers);
   } else if (variable.sort == Sort::Text) {
     value.SetText(ToZor(variable.texts.front()));
-  } else if (IsReadable(variable.texts)) {
-    value.Input(TextForm(variable.texts));
   } else {
     std::vector<ZORString> texts;
+    texts.reserve(variable.texts.size());
     for (const std::string& text : variable.texts) texts.push_back(ToZor(text));
     value.SetTexts(texts);
   }
   return value;
+}
+
+}  // namespace
+
+Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(types), mModel(model) {
+  mValues.reserve(model.Variables().size());
+  for (const Variable& variable : model.Variables()) mValues.push_back(Initial(types, variable));
+  for (int i = 0; i < kSorts; ++i) mFresh.emplace_back(types, static_cast<Sort>(i));
+  mListings.resize(mValues.size());
+  mListed.resize(mValues.size(), 0);
 }
 
 const Listing& Store::List(int variable) {
@@ -114,7 +99,8 @@ void Store::Meet(int variable, const Value& outcome) {
     mFailed = variable;
     mFailedConstraint = mConstraint;
   }
-  if (mWatcher != nullptr) mWatcher->Narrowed({mConstraint, mOperation, variable, shown, held.Show()});
+  if (mWatcher != nullptr)
+    mWatcher->Narrowed({mConstraint, NameOf(mOperation), {variable}, shown, held.Show(), held.IsNil()});
 }
 
 // Two values without a common text are told apart first: to intersect with the least or greatest single value would

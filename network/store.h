@@ -7,21 +7,11 @@
 #include <string>
 #include <vector>
 
-#include "network/model.h"
+#include "network/ZORModel.h"
 #include "network/operations.h"
 #include "network/values.h"
 
 namespace zornet {
-
-// A change of a variable. before and after are text forms.
-struct Narrowing {
-  int constraint;  // none: a choice of the search
-  Operation operation;
-  int variable;
-  std::string before;
-  std::string after;
-};
-inline constexpr int kNone = -1;
 
 class Watcher {
  public:
@@ -53,13 +43,10 @@ class Store {
  public:
   Store(const Types& types, const Model& model);
 
-  // What a variable or constant starts with.
-  static Value Initial(const zornet::Types& types, const Variable& variable);
-
   const zornet::Types& Types() const { return mTypes; }
   const zornet::Model& Model() const { return mModel; }
   const Value& operator[](int variable) const { return mValues[static_cast<std::size_t>(variable)]; }
-  const Variable& Declared(int variable) const { return mModel.variables[static_cast<std::size_t>(variable)]; }
+  const Variable& Declared(int variable) const { return mModel.Variables()[static_cast<std::size_t>(variable)]; }
   const Listing& List(int variable);  // good until the variable changes
 
   // A value of the variable's type that is Undefined, good until the next call for the same type.

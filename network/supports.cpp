@@ -209,7 +209,7 @@ void Supports::Apply(const Constraint& constraint) {
     for (int position = constraint.kind->Inputs(); position >= 0; --position) {
       Column& column = At(position);
       if (mStore.HasFailed()) return;
-      if (mStore.Declared(column.variable).IsConstant() == constants) Meet(column);
+      if (mStore.Declared(column.variable).constant == constants) Meet(column);
     }
   }
 }
@@ -258,7 +258,7 @@ void Supports::MeetFound(Column& column) {
   found.erase(std::unique(found.begin(), found.end()), found.end());
   const Sort sort = mStore[column.variable].Sort();
   if (found.empty()) return mStore.Fail(column.variable);
-  if (found.size() > (sort == Sort::TextSet ? kSetLimit : 1)) return;
+  if (found.size() > (sort == Sort::TextSet ? zor::kSetLimit : 1)) return;
   Value& outcome = mStore.Fresh(sort);
   if (sort == Sort::TextSet) {
     std::vector<ZORString> texts;

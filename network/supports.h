@@ -13,9 +13,6 @@ namespace zornet {
 
 class Supports {
  public:
-  // The module's operations turn a set of more texts into Undefined, and so do the supports.
-  static constexpr std::size_t kSetLimit = 256;
-
   Supports(Store& store, Truth& truth, std::size_t budget) : mStore(store), mTruth(truth), mBudget(budget) {}
 
   // False when the combinations are more than the budget or cannot be listed; then nothing has changed.

@@ -6,17 +6,14 @@
 #include <string_view>
 
 #include "host/ZORText.h"
+#include "module/texts.h"
 
 namespace zornet {
 
-inline constexpr std::size_t kTextLimit = 255;
-
-constexpr bool IsInAlphabet(char c) { return c >= ' ' && c <= 'z'; }
+inline constexpr std::size_t kTextLimit = zor::kLengthLimit;
 
 inline ZORString ToZor(std::string_view text) { return {text.data(), text.size()}; }
-inline std::string_view ToView(const ZORString& text) {
-  return {text.CastToCharPtr(), static_cast<std::size_t>(text.GetLengthInChar())};
-}
+inline std::string_view ToView(const ZORString& text) { return zor::View(text); }
 
 const ZORString& GreatestText();
 

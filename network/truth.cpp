@@ -215,9 +215,9 @@ bool Truth::Relates(Meaning meaning, const ZORString& x, const ZORString& y) {
       return x == y;
     case Meaning::Unequal:
       return !(x == y);
-    case Meaning::NotAbove:
+    case Meaning::LessOrEqual:
       return x <= y;
-    case Meaning::Below:
+    case Meaning::Less:
       return x < y;
     default:
       return false;
@@ -229,7 +229,7 @@ bool Truth::Holds(const Kind& kind, const Exact* values) {
     const Exact& x = values[kind.mirrored ? 1 : 0];
     const Exact& y = values[kind.mirrored ? 0 : 1];
     const bool holds = Relates(kind.meaning, *x.text, *y.text);
-    return kind.truth ? holds == (values[2].number != 0) : holds;
+    return kind.reified ? holds == (values[2].number != 0) : holds;
   }
   Answer answer;
   if (!Compute(kind, values, answer)) return false;

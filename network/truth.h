@@ -13,7 +13,7 @@
 #include <optional>
 #include <vector>
 
-#include "network/model.h"
+#include "network/ZORModel.h"
 #include "network/values.h"
 
 namespace zornet {

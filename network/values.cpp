@@ -5,41 +5,18 @@
 #include <limits>
 #include <memory>
 #include <new>
-#include <stdexcept>
 #include <utility>
 
 namespace zornet {
-
-namespace {
-
-const char* TypeName(Sort sort) {
-  switch (sort) {
-    case Sort::Text:
-      return "single string";
-    case Sort::TextSet:
-      return "enum string";
-    case Sort::Integer:
-      return "single integer";
-    case Sort::Interval:
-      return "interval integer";
-    case Sort::IntegerSet:
-      return "enum integer";
-    case Sort::Boolean:
-      return "single boolean";
-  }
-  return "";
-}
-
-}  // namespace
 
 Types::Types(const ZORVaDoModule& strings, const ZORVaDoModule& numbers) {
   for (int i = 0; i < kSorts; ++i) {
     const auto sort = static_cast<Sort>(i);
     const ZORVaDoModule& module = IsText(sort) ? strings : numbers;
-    const auto* descriptor = module.FindDescriptor(TypeName(sort));
-    if (descriptor == nullptr) {
-      throw std::runtime_error(fmt::format("module {} has no type '{}'", ToView(module.GetName()), TypeName(sort)));
-    }
+    const std::string name(NamesOf(sort).solver);
+    const auto* descriptor = module.FindDescriptor(name.c_str());
+    if (descriptor == nullptr)
+      throw ModuleFailure(fmt::format("module {} has no type '{}'", ToView(module.GetName()), name));
     mDescriptors[static_cast<std::size_t>(i)] = descriptor;
   }
 }
@@ -78,11 +55,6 @@ bool Value::IsOne() const {
   return IsKnown() && mValue->GetCardinality() == 1;
 }
 
-void Value::Input(const std::string& textForm) {
-  ZORistrstream in(textForm.data(), static_cast<int>(textForm.size()));
-  mValue->InputValue(in);
-}
-
 void Value::SetText(const ZORString& text) {
   if (mSort == Sort::Text && text == GreatestText()) {
     Text().CalcMaxValue();
@@ -91,13 +63,23 @@ void Value::SetText(const ZORString& text) {
   }
 }
 
-// By way of the stream form, which has no limit of texts and takes those of 255 characters, too long for the text form.
-void Value::SetTexts(const std::vector<ZORString>& texts) {
-  ZORopstream out;
-  out << static_cast<ZORLong>(ZORVaDoString::ZorStringExact) << static_cast<ZORLong>(texts.size());
-  for (const ZORString& text : texts) out.WriteString(text.CastToCharPtr());
-  ZORipstream in(out.Bytes());
-  mValue->Read(in);
+// A value that is filled text by text becomes Any at one more than zor::kSetLimit: larger sets are united from parts.
+void Value::SetTexts(std::span<const ZORString> texts) {
+  const auto fill = [](ZORVaDoString& value, std::span<const ZORString> part) {
+    value.SetExactValue(part.front());
+    for (const ZORString& text : part.subspan(1)) value.InsertExactValue(text);
+  };
+  const auto take = [&] {
+    const auto part = texts.first(std::min(texts.size(), zor::kSetLimit));
+    texts = texts.subspan(part.size());
+    return part;
+  };
+  fill(Text(), take());
+  while (!texts.empty()) {
+    Value part(mDescriptor, mSort);
+    fill(part.Text(), take());
+    Any().Unite(part.Any());
+  }
 }
 
 void Value::SetNumber(ZORLong number) {
@@ -112,9 +94,12 @@ void Value::SetNumber(ZORLong number) {
 void Value::SetNumbers(const std::vector<ZORLong>& numbers) {
   if (numbers.empty()) return mValue->SetNilValue();
   if (numbers.front() == numbers.back()) return SetNumber(numbers.front());
-  if (mSort == Sort::Interval) return Input(fmt::format("{}..{}", numbers.front(), numbers.back()));
-  if (mSort == Sort::IntegerSet) return Input(fmt::format("{{ {} }}", fmt::join(numbers, ", ")));
-  Reset();
+  if (mSort == Sort::Interval) return Any().Assign(ZORVadIntervalInteger(numbers.front(), numbers.back()));
+  if (mSort != Sort::IntegerSet) return Reset();
+  ZORVadEnumInteger listed;
+  listed.SetNilValue();
+  for (const ZORLong number : numbers) listed.Insert(number);
+  Any().Assign(listed);
 }
 
 // The bounds of a set of "" alone are told as one space, as if it were a single value.
@@ -126,29 +111,28 @@ ZORString Value::HighestText() const {
   return mSort == Sort::TextSet && Text().IsEmpty() ? ZORString() : Text().GetUpperBound();
 }
 
+// Each text leads to the next one: a text with a character behind it that is less than the alphabet lies between them.
+// Asked for its last text, a set answers with what it was asked for instead, so that comes from its bound.
 std::vector<ZORString> Value::Texts() const {
-  std::vector<ZORString> texts;
-  if (mSort == Sort::Text) return {LowestText()};
-  ZORopstream out;
-  mValue->Write(out);
-  ZORipstream in(out.Bytes());
-  ZORLong tag = 0, count = 0;
-  in >> tag >> count;
-  texts.reserve(static_cast<std::size_t>(count));
-  for (ZORLong i = 0; i < count; ++i) {
-    const std::unique_ptr<char[]> text(in.ReadString());
-    texts.emplace_back(text.get());
+  std::vector<ZORString> texts{LowestText()};
+  const std::size_t count = mSort == Sort::Text ? 1 : mValue->GetCardinality();
+  texts.reserve(count);
+  while (texts.size() + 1 < count) {
+    ZORString between(texts.back());
+    between.Append(ZORString("\x01"));
+    texts.push_back(Text().GetNextExactValue(between));
   }
+  if (count > 1) texts.push_back(HighestText());
   return texts;
 }
 
 ZORLong Value::LowestNumber() const {
-  if (mSort == Sort::Boolean) return mValue->IsUndefined() || Show() == "false" ? 0 : 1;
+  if (mSort == Sort::Boolean) return Boolean().CanBe(false) ? 0 : 1;
   return static_cast<ZORLong>(Integer().FindAtLeast(std::numeric_limits<ZORLong>::min()));
 }
 
 ZORLong Value::HighestNumber() const {
-  if (mSort == Sort::Boolean) return mValue->IsUndefined() || Show() == "true" ? 1 : 0;
+  if (mSort == Sort::Boolean) return Boolean().CanBe(true) ? 1 : 0;
   return static_cast<ZORLong>(Integer().FindAtMost(std::numeric_limits<ZORLong>::max()));
 }
 

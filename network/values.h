@@ -5,13 +5,14 @@
 #pragma once
 
 #include <array>
+#include <span>
 #include <string>
 #include <vector>
 
 #include "host/ZORNumbers.h"
 #include "host/ZORSolver.h"
 #include "module/ZORVaDoString.h"
-#include "network/model.h"
+#include "network/ZORNetwork.h"
 #include "network/texts.h"
 
 namespace zornet {
@@ -19,7 +20,7 @@ namespace zornet {
 // The descriptors of the value types. They belong to their modules.
 class Types {
  public:
-  // Throws std::runtime_error with the name of a type that neither module has.
+  // Throws ModuleFailure with the name of a type that neither module has.
   Types(const ZORVaDoModule& strings, const ZORVaDoModule& numbers);
 
   const ZORVaDoObjectDescriptor& operator[](Sort sort) const { return *mDescriptors[static_cast<std::size_t>(sort)]; }
@@ -54,9 +55,8 @@ class Value {
 
   // Give a value to what is Undefined or known; the sort has to fit.
   void Reset() { mValue->SetUndefinedValue(); }
-  void Input(const std::string& textForm);
   void SetText(const ZORString& text);
-  void SetTexts(const std::vector<ZORString>& texts);    // of a set; in ascending order, at least one
+  void SetTexts(std::span<const ZORString> texts);       // of a set; in ascending order, at least one
   void SetNumber(ZORLong number);                        // of a truth value 0 or 1
   void SetNumbers(const std::vector<ZORLong>& numbers);  // ascending; an interval takes the ends, a single one or all
 

@@ -45,14 +45,14 @@ std::string Fold(std::string_view text) {
 
 class Drawing {
  public:
-  Drawing(const Store& store, const Names& names) : mStore(store), mModel(store.Model()), mNames(names) {}
+  Drawing(const Network& network, const Names& names) : mNetwork(network), mModel(network.GetModel()), mNames(names) {}
 
   std::string Draw() {
     Add("digraph network {{\n  rankdir=LR; nodesep=0.25; ranksep=0.45; bgcolor=white;\n"
         "  node [fontname=\"Helvetica\", fontsize=11];\n"
         "  edge [fontname=\"Helvetica\", fontsize=9, color=\"#7a8599\", fontcolor=\"#7a8599\", arrowsize=0.6];\n");
-    for (std::size_t v = 0; v < mModel.variables.size(); ++v) DrawVariable(static_cast<int>(v));
-    for (std::size_t c = 0; c < mModel.constraints.size(); ++c) DrawConstraint(static_cast<int>(c));
+    for (std::size_t v = 0; v < mModel.Variables().size(); ++v) DrawVariable(static_cast<int>(v));
+    for (std::size_t c = 0; c < mModel.Constraints().size(); ++c) DrawConstraint(static_cast<int>(c));
     return mText + "}\n";
   }
 
@@ -65,37 +65,37 @@ class Drawing {
   void DrawVariable(int variable);
   void DrawConstraint(int number);
   void DrawEdge(const Constraint& constraint, int number, int position);
-  std::string_view Fill(const Value& value) const;
+  std::string_view Fill(const Domain& domain) const;
 
-  const Store& mStore;
+  const Network& mNetwork;
   const Model& mModel;
   const Names& mNames;
   std::string mText;
 };
 
-std::string_view Drawing::Fill(const Value& value) const {
-  if (value.IsNil()) return "#f8c4c0";
-  if (value.IsOne()) return "#d5ecd8";
-  return value.IsKnown() ? "#fdf1cf" : "#f1f3f6";
+std::string_view Drawing::Fill(const Domain& domain) const {
+  if (domain.IsNil()) return "#f8c4c0";
+  if (domain.IsOne()) return "#d5ecd8";
+  return domain.IsKnown() ? "#fdf1cf" : "#f1f3f6";
 }
 
 void Drawing::DrawVariable(int variable) {
-  const Value& value = mStore[variable];
-  const bool nil = value.IsNil();
-  if (mStore.Declared(variable).IsConstant()) {
+  const Domain domain = mNetwork[variable];
+  const bool nil = domain.IsNil();
+  if (mModel.Variables()[static_cast<std::size_t>(variable)].constant) {
     Add("  v{} [shape=plain, fontcolor=\"{}\", label=<{}>];\n", variable, nil ? "#b3261e" : "#555555",
         Fold(mNames.OfVariable(variable)));
     return;
   }
   Add("  v{} [shape=box, style=\"rounded,filled\", fillcolor=\"{}\", color=\"{}\", penwidth={}, "
       "label=<<b>{}</b><br/>{}>];\n",
-      variable, Fill(value), nil ? "#b3261e" : "#55606e", nil ? 2 : 1, Escape(mNames.OfVariable(variable)),
-      Fold(value.Show()));
+      variable, Fill(domain), nil ? "#b3261e" : "#55606e", nil ? 2 : 1, Escape(mNames.OfVariable(variable)),
+      Fold(domain.Print()));
 }
 
 void Drawing::DrawConstraint(int number) {
-  const Constraint& constraint = mModel.constraints[static_cast<std::size_t>(number)];
-  const bool failed = mStore.FailedConstraint() == number;
+  const Constraint& constraint = mModel.Constraints()[static_cast<std::size_t>(number)];
+  const bool failed = mNetwork.FailedConstraint() == number;
   Add("  c{} [shape=ellipse, height=0.3, margin=\"0.05,0.02\", color=\"{}\", fontcolor=\"{}\", penwidth={}, "
       "label=\"{}\"];\n",
       number, failed ? "#b3261e" : "#3367a8", failed ? "#b3261e" : "#3367a8", failed ? 2 : 1, constraint.kind->name);
@@ -107,7 +107,7 @@ void Drawing::DrawEdge(const Constraint& constraint, int number, int position) {
   const auto at = static_cast<std::size_t>(position);
   const int variable = constraint.arguments[at];
   const bool relation = constraint.kind->IsRelation();
-  const bool result = position == constraint.kind->Inputs() && (!relation || constraint.kind->truth);
+  const bool result = position == constraint.kind->Inputs() && (!relation || constraint.kind->reified);
   const std::string_view role = constraint.kind->arity > 2 ? constraint.kind->roles[at] : "";
   if (result || (relation && position == 1)) {
     Add("  c{} -> v{} [label=\"{}\"{}];\n", number, variable, role, result ? "" : ", dir=none");
@@ -118,6 +118,6 @@ void Drawing::DrawEdge(const Constraint& constraint, int number, int position) {
 
 }  // namespace
 
-std::string Graph(const Store& store, const Names& names) { return Drawing(store, names).Draw(); }
+std::string Graph(const Network& network, const Names& names) { return Drawing(network, names).Draw(); }
 
 }  // namespace zornet

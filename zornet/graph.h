@@ -3,12 +3,11 @@
 
 #include <string>
 
-#include "network/store.h"
 #include "zornet/report.h"
 
 namespace zornet {
 
 // Functions point from their arguments to their results; what became Nil is red.
-std::string Graph(const Store& store, const Names& names);
+std::string Graph(const Network& network, const Names& names);
 
 }  // namespace zornet

@@ -9,24 +9,6 @@ namespace {
 
 using Json = nlohmann::ordered_json;
 
-std::string_view Describe(Sort sort) {
-  switch (sort) {
-    case Sort::Text:
-      return "string";
-    case Sort::TextSet:
-      return "set string";
-    case Sort::Integer:
-      return "int";
-    case Sort::Interval:
-      return "interval";
-    case Sort::IntegerSet:
-      return "set int";
-    case Sort::Boolean:
-      return "bool";
-  }
-  return "";
-}
-
 std::string_view Describe(Outcome outcome) {
   switch (outcome) {
     case Outcome::Settled:
@@ -40,29 +22,27 @@ std::string_view Describe(Outcome outcome) {
 }
 
 // The text form, and what it holds in a form that a program need not take apart.
-Json Describe(const Value& value) {
-  Json json{{"value", value.Show()}};
-  json["state"] = value.IsNil() ? "nil" : value.IsUndefined() ? "any" : "known";
-  if (!value.IsKnown()) return json;
-  if (IsText(value.Sort())) {
-    Json texts = Json::array();
-    for (const ZORString& text : value.Texts()) texts.push_back(std::string(ToView(text)));
-    json["texts"] = std::move(texts);
-  } else if (value.Sort() == Sort::IntegerSet) {
-    json["numbers"] = value.Numbers();
-  } else if (value.Sort() == Sort::Boolean) {
-    json["truth"] = value.LowestNumber() != 0;
+Json Describe(const Domain& domain, Sort sort) {
+  Json json{{"value", domain.Print()}};
+  json["state"] = domain.IsNil() ? "nil" : domain.IsAny() ? "any" : "known";
+  if (!domain.IsKnown()) return json;
+  if (IsText(sort)) {
+    json["texts"] = domain.Texts();
+  } else if (sort == Sort::IntegerSet) {
+    json["numbers"] = domain.Numbers();
+  } else if (sort == Sort::Boolean) {
+    json["truth"] = domain.Lowest() != 0;
   } else {
-    json["from"] = value.LowestNumber();
-    json["to"] = value.HighestNumber();
+    json["from"] = domain.Lowest();
+    json["to"] = domain.Highest();
   }
   return json;
 }
 
 class JsonReport : public Report {
  public:
-  JsonReport(const Source& source, const ReadModel& read, std::ostream& results)
-      : mModel(read.model), mNames(source, read), mResults(results) {}
+  JsonReport(const Source& source, const Places& places, const Model& model, std::ostream& results)
+      : mModel(model), mNames(source, places, model), mResults(results) {}
 
   void Errors(const Source& source, const Diagnostics& diagnostics) override {
     for (const Diagnostic& diagnostic : diagnostics.All()) {
@@ -79,42 +59,40 @@ class JsonReport : public Report {
   void Failure(const std::string& message) override { Tell({{"event", "failure"}, {"message", message}}); }
   void Narrowed(const Narrowing& narrowing) override { Tell(ToJson("narrowing", narrowing)); }
 
-  void Variables(const Store& store) override {
-    for (const int variable : mModel.outputs) {
-      Json json{
-          {"event", "variable"}, {"name", mNames.OfVariable(variable)}, {"type", Describe(store[variable].Sort())}};
-      json.update(Describe(store[variable]));
+  void Variables(const Network& network) override {
+    for (const int variable : mModel.Wanted()) {
+      const Sort sort = mModel.Variables()[static_cast<std::size_t>(variable)].sort;
+      Json json{{"event", "variable"}, {"name", mNames.OfVariable(variable)}, {"type", NamesOf(sort).type}};
+      json.update(Describe(network[variable], sort));
       Tell(json);
     }
   }
 
-  void Solution(const Store& store, std::uint64_t number) override {
+  void Solution(const Network& network, std::uint64_t number) override {
     Json values = Json::object();
-    for (const int variable : mModel.outputs) values[mNames.OfVariable(variable)] = store[variable].Show();
+    for (const int variable : mModel.Wanted()) values[mNames.OfVariable(variable)] = network[variable].Print();
     Tell({{"event", "solution"}, {"number", number}, {"values", std::move(values)}});
     mResults.flush();
   }
 
-  void Explain(const Store& store, int variable, const Log::Explanation& explanation) override {
+  void Explain(const Network& network, Var variable, const Explanation& explanation) override {
     Json steps = Json::array(), declared = Json::array();
-    for (const int other : explanation.declared) declared.push_back(mNames.OfVariable(other));
-    for (const Narrowing* narrowing : explanation.narrowings) steps.push_back(ToJson("narrowing", *narrowing));
+    for (const auto& start : explanation.declared) declared.push_back(mNames.OfVariable(start.variable));
+    for (const Narrowing& step : explanation.narrowings) steps.push_back(ToJson("narrowing", step));
     Tell({{"event", "explanation"},
           {"name", mNames.OfVariable(variable)},
-          {"value", store[variable].Show()},
+          {"value", network[variable].Print()},
           {"declared", std::move(declared)},
           {"narrowings", std::move(steps)}});
   }
 
-  void Statistics(const Store& store) override {
-    for (std::size_t i = 0; i < kOperations; ++i) {
-      const OperationCounts& counts = store.Counts()[i];
-      if (counts.calls == 0) continue;
+  void Statistics(const Network& network) override {
+    for (const OperationCount& count : network.Counts()) {
       Tell({{"event", "operation"},
-            {"name", NameOf(static_cast<Operation>(i))},
-            {"calls", counts.calls},
-            {"changes", counts.changes},
-            {"contradictions", counts.contradictions}});
+            {"name", count.operation},
+            {"calls", count.calls},
+            {"changes", count.changes},
+            {"contradictions", count.contradictions}});
     }
   }
 
@@ -128,20 +106,21 @@ class JsonReport : public Report {
           {"after", call.after}});
   }
 
-  void Finish(const Store& store, const Summary& summary) override {
+  void Finish(const Network& network, const Summary& summary) override {
+    const OperationCount total = Total(network.Counts());
     Json json{{"event", "summary"},
               {"outcome", Describe(summary.outcome)},
-              {"constraints", mModel.constraints.size()},
-              {"passes", summary.passes},
-              {"calls", store.Calls()},
-              {"changes", store.Changes()},
+              {"constraints", mModel.Constraints().size()},
+              {"passes", network.Steps()},
+              {"calls", total.calls},
+              {"changes", total.changes},
               {"milliseconds", summary.milliseconds}};
-    if (summary.searched)
-      json.update({{"solutions", summary.solutions}, {"complete", summary.complete}, {"open", summary.open}});
-    if (store.HasFailed()) {
-      json["variable"] = mNames.OfVariable(store.Failed());
-      json["constraint"] = mNames.OfConstraint(store.FailedConstraint());
-      json["line"] = mNames.LineOfConstraint(store.FailedConstraint());
+    if (const auto& search = summary.search)
+      json.update({{"solutions", search->solutions}, {"complete", search->complete}, {"open", search->open}});
+    if (const int failed = network.FailedConstraint(); failed != kNone) {
+      json["variable"] = mNames.OfVariable(network.FailedVariable());
+      json["constraint"] = mNames.OfConstraint(failed);
+      json["line"] = mNames.LineOfConstraint(failed);
     }
     Tell(json);
     mResults.flush();
@@ -154,7 +133,7 @@ class JsonReport : public Report {
       json["line"] = mNames.LineOfConstraint(narrowing.constraint);
       json["constraint"] = mNames.OfConstraint(narrowing.constraint);
     }
-    json["operation"] = NameOf(narrowing.operation);
+    json["operation"] = narrowing.operation;
     json["target"] = mNames.OfVariable(narrowing.variable);
     json["before"] = narrowing.before;
     json["after"] = narrowing.after;
@@ -171,8 +150,9 @@ class JsonReport : public Report {
 
 }  // namespace
 
-std::unique_ptr<Report> MakeJsonReport(const Source& source, const ReadModel& read, std::ostream& results) {
-  return std::make_unique<JsonReport>(source, read, results);
+std::unique_ptr<Report> MakeJsonReport(const Source& source, const Places& places, const Model& model,
+                                       std::ostream& results) {
+  return std::make_unique<JsonReport>(source, places, model, results);
 }
 
 }  // namespace zornet

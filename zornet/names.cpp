@@ -10,6 +10,16 @@ constexpr std::string_view kBlanks = " \t\r\n\v\f";
 
 }  // namespace
 
+OperationCount Total(const std::vector<OperationCount>& counts) {
+  OperationCount total;
+  for (const OperationCount& count : counts) {
+    total.calls += count.calls;
+    total.changes += count.changes;
+    total.contradictions += count.contradictions;
+  }
+  return total;
+}
+
 // On one line: runs of blanks outside of quotes become one, and comments go.
 std::string Names::Written(Extent extent) const {
   std::string written;
@@ -28,21 +38,21 @@ std::string Names::Written(Extent extent) const {
 }
 
 std::string Names::OfConstraint(int constraint) const {
-  return Written(mRead.constraints[static_cast<std::size_t>(constraint)]);
+  return Written(mPlaces.constraints[static_cast<std::size_t>(constraint)]);
 }
 
 std::string Names::OfVariable(int variable) const {
   const auto at = static_cast<std::size_t>(variable);
-  const Variable& declared = mRead.model.variables[at];
-  return declared.IsConstant() ? Written(mRead.variables[at]) : declared.name;
+  const Variable& declared = mModel.Variables()[at];
+  return declared.constant ? Written(mPlaces.variables[at]) : declared.name;
 }
 
 std::size_t Names::LineOfConstraint(int constraint) const {
-  return mSource.LineOf(mRead.constraints[static_cast<std::size_t>(constraint)].begin);
+  return mSource.LineOf(mPlaces.constraints[static_cast<std::size_t>(constraint)].begin);
 }
 
 std::size_t Names::LineOfVariable(int variable) const {
-  return mSource.LineOf(mRead.variables[static_cast<std::size_t>(variable)].begin);
+  return mSource.LineOf(mPlaces.variables[static_cast<std::size_t>(variable)].begin);
 }
 
 std::string Names::PlaceOfConstraint(int constraint) const {

@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-#include "network/propagation.h"
+#include "network/ZORNetwork.h"
 
 namespace zornet {
 

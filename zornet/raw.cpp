@@ -3,25 +3,31 @@
 #include <fmt/format.h>
 
 #include <array>
+#include <cstddef>
+#include <deque>
+#include <memory>
+
+#include "host/ZORNumbers.h"
+#include "module/ZORVaDoString.h"
 
 namespace zornet {
 
 namespace {
 
-using Operands = std::array<Value*, kMostArguments>;
+using Operands = std::array<ZORVaDoAny*, kMostArguments>;
 
 struct Bare {
   Meaning meaning;
-  bool mirrored, truth;
+  bool mirrored, reified;
   std::string_view name;
   std::string_view form;  // argument positions: what it is called on, the arguments, behind the colon the target
   int (*call)(const Operands& v);
 };
 
-ZORVaDoString& S(Value* value) { return value->Text(); }
-ZORVaDoInteger& I(Value* value) { return value->Integer(); }
-ZORVaDoBoolean& B(Value* value) { return value->Boolean(); }
-ZORVaDoAny& A(Value* value) { return value->Any(); }
+ZORVaDoString& S(ZORVaDoAny* value) { return static_cast<ZORVaDoString&>(*value); }
+ZORVaDoInteger& I(ZORVaDoAny* value) { return static_cast<ZORVaDoInteger&>(*value); }
+ZORVaDoBoolean& B(ZORVaDoAny* value) { return static_cast<ZORVaDoBoolean&>(*value); }
+ZORVaDoAny& A(ZORVaDoAny* value) { return *value; }
 
 // clang-format off
 constexpr Bare kBare[] = {
@@ -29,18 +35,18 @@ constexpr Bare kBare[] = {
   {Meaning::Equal, false, false, "CalcInverseEqualValue",            "01:1", [](const Operands& v) { return S(v[0]).CalcInverseEqualValue(A(v[1])); }},
   {Meaning::Unequal, false, false, "CalcUnequalValue",               "01:0", [](const Operands& v) { return S(v[0]).CalcUnequalValue(A(v[1])); }},
   {Meaning::Unequal, false, false, "CalcInverseUnequalValue",        "01:1", [](const Operands& v) { return S(v[0]).CalcInverseUnequalValue(A(v[1])); }},
-  {Meaning::Below, false, false, "CalcLessValue",                    "01:0", [](const Operands& v) { return S(v[0]).CalcLessValue(S(v[1])); }},
-  {Meaning::Below, false, false, "CalcInverseLessValue",             "01:1", [](const Operands& v) { return S(v[0]).CalcInverseLessValue(S(v[1])); }},
-  {Meaning::NotAbove, false, false, "CalcLessOrEqualValue",          "01:0", [](const Operands& v) { return S(v[0]).CalcLessOrEqualValue(A(v[1])); }},
-  {Meaning::NotAbove, false, false, "CalcInverseLessOrEqualValue",   "01:1", [](const Operands& v) { return S(v[0]).CalcInverseLessOrEqualValue(A(v[1])); }},
-  {Meaning::Below, true, false, "CalcNotLessAndUnequalValue",        "01:0", [](const Operands& v) { return S(v[0]).CalcNotLessAndUnequalValue(A(v[1])); }},
-  {Meaning::Below, true, false, "CalcInverseNotLessAndUnequalValue", "01:1", [](const Operands& v) { return S(v[0]).CalcInverseNotLessAndUnequalValue(A(v[1])); }},
-  {Meaning::NotAbove, true, false, "CalcNotLessValue",               "01:0", [](const Operands& v) { return S(v[0]).CalcNotLessValue(S(v[1])); }},
-  {Meaning::NotAbove, true, false, "CalcInverseNotLessValue",        "01:1", [](const Operands& v) { return S(v[0]).CalcInverseNotLessValue(S(v[1])); }},
+  {Meaning::Less, false, false, "CalcLessValue",                    "01:0", [](const Operands& v) { return S(v[0]).CalcLessValue(S(v[1])); }},
+  {Meaning::Less, false, false, "CalcInverseLessValue",             "01:1", [](const Operands& v) { return S(v[0]).CalcInverseLessValue(S(v[1])); }},
+  {Meaning::LessOrEqual, false, false, "CalcLessOrEqualValue",          "01:0", [](const Operands& v) { return S(v[0]).CalcLessOrEqualValue(A(v[1])); }},
+  {Meaning::LessOrEqual, false, false, "CalcInverseLessOrEqualValue",   "01:1", [](const Operands& v) { return S(v[0]).CalcInverseLessOrEqualValue(A(v[1])); }},
+  {Meaning::Less, true, false, "CalcNotLessAndUnequalValue",        "01:0", [](const Operands& v) { return S(v[0]).CalcNotLessAndUnequalValue(A(v[1])); }},
+  {Meaning::Less, true, false, "CalcInverseNotLessAndUnequalValue", "01:1", [](const Operands& v) { return S(v[0]).CalcInverseNotLessAndUnequalValue(A(v[1])); }},
+  {Meaning::LessOrEqual, true, false, "CalcNotLessValue",               "01:0", [](const Operands& v) { return S(v[0]).CalcNotLessValue(S(v[1])); }},
+  {Meaning::LessOrEqual, true, false, "CalcInverseNotLessValue",        "01:1", [](const Operands& v) { return S(v[0]).CalcInverseNotLessValue(S(v[1])); }},
 
   {Meaning::Equal, false, true, "CalcIsEqual",                       "012:2", [](const Operands& v) { return S(v[0]).CalcIsEqual(A(v[1]), B(v[2])); }},
-  {Meaning::Below, false, true, "CalcIsLess",                        "012:2", [](const Operands& v) { return S(v[0]).CalcIsLess(S(v[1]), B(v[2])); }},
-  {Meaning::NotAbove, false, true, "CalcIsLessOrEqual",              "012:2", [](const Operands& v) { return S(v[0]).CalcIsLessOrEqual(A(v[1]), B(v[2])); }},
+  {Meaning::Less, false, true, "CalcIsLess",                        "012:2", [](const Operands& v) { return S(v[0]).CalcIsLess(S(v[1]), B(v[2])); }},
+  {Meaning::LessOrEqual, false, true, "CalcIsLessOrEqual",              "012:2", [](const Operands& v) { return S(v[0]).CalcIsLessOrEqual(A(v[1]), B(v[2])); }},
 
   {Meaning::Concatenation, false, false, "CalcConcatenation",              "201:2", [](const Operands& v) { return S(v[2]).CalcConcatenation(S(v[0]), S(v[1])); }},
   {Meaning::Concatenation, false, false, "CalcFirstInverseConcatenation",  "201:0", [](const Operands& v) { return S(v[2]).CalcFirstInverseConcatenation(S(v[0]), S(v[1])); }},
@@ -68,27 +74,53 @@ constexpr Bare kBare[] = {
 
 std::size_t Position(char digit) { return static_cast<std::size_t>(digit - '0'); }
 
+// A value of its own, so that a constant stays what it is.
+class Copy {
+ public:
+  explicit Copy(const ZORVaDoAny& value)
+      : mDescriptor(*value.GetDescriptor()),
+        mMemory(std::make_unique<std::byte[]>(mDescriptor.GetObjectSize())),
+        mValue(static_cast<ZORVaDoAny*>(mDescriptor.CreateObject(mMemory.get()))) {
+    mValue->Assign(value);
+  }
+  ~Copy() { mDescriptor.DestroyObject(mValue); }
+  Copy(const Copy&) = delete;
+  Copy& operator=(const Copy&) = delete;
+
+  ZORVaDoAny* Get() { return mValue; }
+
+ private:
+  const ZORVaDoObjectDescriptor& mDescriptor;
+  std::unique_ptr<std::byte[]> mMemory;
+  ZORVaDoAny* mValue;
+};
+
+std::string Print(const ZORVaDoAny& value) {
+  ZORostrstream out;
+  value.PrintOn(out);
+  return std::string(out.View());
+}
+
 class RawRun {
  public:
-  RawRun(Store& store, const Names& names) : mStore(store), mNames(names) {}
+  RawRun(Network& network, const Names& names) : mNetwork(network), mNames(names) {}
 
   RawCall Call(int number, const Bare& bare) {
-    const Constraint& constraint = mStore.Model().constraints[static_cast<std::size_t>(number)];
-    std::vector<Value> constants;
-    constants.reserve(kMostArguments);
+    const Constraint& constraint = mNetwork.GetModel().Constraints()[static_cast<std::size_t>(number)];
+    std::deque<Copy> constants;
     Operands operands{};
     for (int i = 0; i < constraint.kind->arity; ++i) {
-      const auto at = static_cast<std::size_t>(i);
-      operands[at] = &mStore.Bare(constraint.arguments[at]);
-      if (!mStore.Declared(constraint.arguments[at]).IsConstant()) continue;
-      constants.push_back(*operands[at]);
-      operands[at] = &constants.back();
+      const auto at = static_cast<std::size_t>(i), variable = static_cast<std::size_t>(constraint.arguments[at]);
+      operands[at] = &mNetwork.Bare({constraint.arguments[at]});
+      if (mNetwork.GetModel().Variables()[variable].constant)
+        operands[at] = constants.emplace_back(*operands[at]).Get();
     }
     const std::size_t colon = bare.form.find(':');
     const std::size_t target = Position(bare.form[colon + 1]);
-    RawCall call{number, Write(constraint, bare), 0, NameOf(constraint, target), operands[target]->Print(), ""};
+    RawCall call{number, Write(constraint, bare), 0, NameOf(constraint, target), Print(*operands[target]), "", false};
     call.answer = bare.call(operands);
-    call.after = operands[target]->Print();
+    call.failed = operands[target]->IsNil() != 0;
+    call.after = Print(*operands[target]);
     return call;
   }
 
@@ -105,18 +137,19 @@ class RawRun {
                        fmt::join(arguments, ", "));
   }
 
-  Store& mStore;
+  Network& mNetwork;
   const Names& mNames;
 };
 
 }  // namespace
 
-void RunRaw(Store& store, const Names& names, const std::function<void(const RawCall&)>& told) {
-  RawRun run(store, names);
-  for (int c = 0; c < static_cast<int>(store.Model().constraints.size()); ++c) {
-    const Kind& kind = *store.Model().constraints[static_cast<std::size_t>(c)].kind;
+void RunRaw(Network& network, const Names& names, const std::function<void(const RawCall&)>& told) {
+  RawRun run(network, names);
+  const std::vector<Constraint>& constraints = network.GetModel().Constraints();
+  for (int c = 0; c < static_cast<int>(constraints.size()); ++c) {
+    const Kind& kind = *constraints[static_cast<std::size_t>(c)].kind;
     for (const Bare& bare : kBare) {
-      if (bare.meaning == kind.meaning && bare.mirrored == kind.mirrored && bare.truth == kind.truth)
+      if (bare.meaning == kind.meaning && bare.mirrored == kind.mirrored && bare.reified == kind.reified)
         told(run.Call(c, bare));
     }
   }

@@ -4,12 +4,11 @@
 
 #include <functional>
 
-#include "network/values.h"
 #include "zornet/report.h"
 
 namespace zornet {
 
-// Leaves the values in the store as the operations left them.
-void RunRaw(Store& store, const Names& names, const std::function<void(const RawCall&)>& told);
+// Leaves the values of the network as the operations left them.
+void RunRaw(Network& network, const Names& names, const std::function<void(const RawCall&)>& told);
 
 }  // namespace zornet

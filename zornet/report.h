@@ -3,14 +3,13 @@
 
 #include <cstdint>
 #include <memory>
+#include <optional>
 #include <ostream>
 #include <string>
 
 #include "language/diagnostics.h"
 #include "language/reader.h"
-#include "network/log.h"
-#include "network/propagation.h"
-#include "network/store.h"
+#include "network/ZORNetwork.h"
 
 namespace zornet {
 
@@ -22,30 +21,31 @@ struct RawCall {
   std::string target;
   std::string before;
   std::string after;
+  bool failed;  // nothing is left in the target
 };
 
 struct Summary {
   Outcome outcome = Outcome::Settled;
-  std::uint64_t passes = 0;
   double milliseconds = 0;
-  bool searched = false;  // then also:
-  std::uint64_t solutions = 0;
-  bool complete = false;   // there are no more
-  std::uint64_t open = 0;  // assignments left out since they leave openVariable unknown
-  int openVariable = kNone;
+  std::optional<SearchResult> search;
 };
 
-class Report : public Watcher {
+class Report {
  public:
+  virtual ~Report() = default;
   virtual void Errors(const Source& source, const Diagnostics& diagnostics) = 0;
   virtual void Failure(const std::string& message) = 0;
-  virtual void Variables(const Store& store) = 0;
-  virtual void Solution(const Store& store, std::uint64_t number) = 0;
-  virtual void Explain(const Store& store, int variable, const Log::Explanation& explanation) = 0;
-  virtual void Statistics(const Store& store) = 0;
+  virtual void Narrowed(const Narrowing& narrowing) = 0;
+  virtual void Variables(const Network& network) = 0;
+  virtual void Solution(const Network& network, std::uint64_t number) = 0;
+  virtual void Explain(const Network& network, Var variable, const Explanation& explanation) = 0;
+  virtual void Statistics(const Network& network) = 0;
   virtual void Called(const RawCall& call) = 0;
-  virtual void Finish(const Store& store, const Summary& summary) = 0;
+  virtual void Finish(const Network& network, const Summary& summary) = 0;
 };
+
+// The sum of all operations.
+OperationCount Total(const std::vector<OperationCount>& counts);
 
 // results and remarks are where the two kinds of lines go; the summary is a remark.
 struct ReportStyle {
@@ -54,17 +54,20 @@ struct ReportStyle {
   bool trace = false;         // tell each narrowing
   bool quiet = false;         // no summary
 };
-std::unique_ptr<Report> MakeTextReport(const Source& source, const ReadModel& read, const ReportStyle& style,
-                                       std::ostream& results, std::ostream& remarks);
-std::unique_ptr<Report> MakeJsonReport(const Source& source, const ReadModel& read, std::ostream& results);
+std::unique_ptr<Report> MakeTextReport(const Source& source, const Places& places, const Model& model,
+                                       const ReportStyle& style, std::ostream& results, std::ostream& remarks);
+std::unique_ptr<Report> MakeJsonReport(const Source& source, const Places& places, const Model& model,
+                                       std::ostream& results);
 
 // How reports call things: a constraint as it is written, a variable by its name, a constant as it is written.
 class Names {
  public:
-  Names(const Source& source, const ReadModel& read) : mSource(source), mRead(read) {}
+  Names(const Source& source, const Places& places, const Model& model)
+      : mSource(source), mPlaces(places), mModel(model) {}
 
   std::string OfConstraint(int constraint) const;
   std::string OfVariable(int variable) const;
+  std::string OfVariable(Var variable) const { return OfVariable(variable.index); }
   std::size_t LineOfConstraint(int constraint) const;
   std::size_t LineOfVariable(int variable) const;
   std::string PlaceOfConstraint(int constraint) const;  // file:line
@@ -75,7 +78,8 @@ class Names {
   std::string Written(Extent extent) const;
 
   const Source& mSource;
-  const ReadModel& mRead;
+  const Places& mPlaces;
+  const Model& mModel;
 };
 
 }  // namespace zornet

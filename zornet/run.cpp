@@ -14,8 +14,6 @@
 #include <stdexcept>
 
 #include "language/reader.h"
-#include "network/search.h"
-#include "network/session.h"
 #include "zornet/colour.h"
 #include "zornet/graph.h"
 #include "zornet/picture.h"
@@ -42,121 +40,82 @@ Source Load(std::string file) {
   return {file, std::move(text)};
 }
 
-// Passes a narrowing on to the report and, where explanations are wanted, to the log.
-class Both : public Watcher {
- public:
-  Both(Watcher& first, Watcher& second) : mFirst(first), mSecond(second) {}
-  void Narrowed(const Narrowing& narrowing) override {
-    mFirst.Narrowed(narrowing);
-    mSecond.Narrowed(narrowing);
-  }
-
- private:
-  Watcher& mFirst;
-  Watcher& mSecond;
-};
-
 class OneRun {
  public:
-  OneRun(const Options& options, const Source& source, const ReadModel& read, Report& report)
-      : mOptions(options),
-        mModel(read.model),
-        mReport(report),
-        mNames(source, read),
-        mLog(read.model),
-        mBoth(report, mLog) {}
+  OneRun(const Options& options, Network& network, const Names& names, Report& report)
+      : mOptions(options), mNetwork(network), mNames(names), mReport(report) {}
 
   int Go();
 
  private:
   void FindExplained();
-  void Watch(Store& store, bool explained);
-  void Solve(Store& store);
-  void Search(Store& store, Propagation& propagation);
-  void Tell(Store& store);
-  void WritePictures(const Store& store) const;
+  void Solve();
+  void Tell();
+  void WritePictures() const;
   int ExitCode() const;
 
   const Options& mOptions;
-  const Model& mModel;
+  Network& mNetwork;
+  const Names& mNames;
   Report& mReport;
-  Names mNames;
-  Log mLog;
-  Both mBoth;
-  std::vector<int> mExplained;
+  std::vector<Var> mExplained;
   Summary mSummary;
 };
 
 int OneRun::Go() {
   FindExplained();
-  const Session session(mOptions.modulePaths);
-  Store store(session.Types(), mModel);
-  Watch(store, !mExplained.empty());
   const auto begin = std::chrono::steady_clock::now();
   if (mOptions.raw) {
-    RunRaw(store, mNames, [this](const RawCall& call) { mReport.Called(call); });
+    RunRaw(mNetwork, mNames, [this](const RawCall& call) { mReport.Called(call); });
   } else {
-    Solve(store);
+    Solve();
   }
   mSummary.milliseconds = std::chrono::duration<double, std::milli>(std::chrono::steady_clock::now() - begin).count();
-  Tell(store);
+  Tell();
   return ExitCode();
 }
 
 void OneRun::FindExplained() {
+  const std::vector<Variable>& variables = mNetwork.GetModel().Variables();
   for (const std::string& name : mOptions.explain) {
-    const auto found = std::find_if(mModel.variables.begin(), mModel.variables.end(),
+    const auto found = std::find_if(variables.begin(), variables.end(),
                                     [&](const Variable& variable) { return variable.name == name; });
-    if (name.empty() || found == mModel.variables.end())
+    if (name.empty() || found == variables.end())
       throw UsageError(fmt::format("--explain: there is no variable '{}'", name));
-    mExplained.push_back(static_cast<int>(found - mModel.variables.begin()));
+    mExplained.push_back({static_cast<int>(found - variables.begin())});
   }
 }
 
-// Nobody watches where nobody listens: text forms cost more than the narrowing itself.
-void OneRun::Watch(Store& store, bool explained) {
-  Watcher* const told = mOptions.trace || mOptions.json ? &mReport : nullptr;
-  store.Watch(explained ? &mBoth : told);
-}
-
-void OneRun::Solve(Store& store) {
-  Propagation propagation(store, mOptions.limits);
+// Nobody is told where nobody listens: text forms cost more than the narrowing itself.
+void OneRun::Solve() {
+  if (mOptions.trace || mOptions.json)
+    mNetwork.OnNarrowing([this](const Narrowing& narrowing) { mReport.Narrowed(narrowing); });
   ProgressLine progress(isatty(STDERR_FILENO) != 0 && !mOptions.json);
-  propagation.OnProgress([&](std::uint64_t steps, std::size_t waiting) { progress.Show(steps, waiting); });
-  mSummary.outcome = propagation.Run();
-  mSummary.searched = mOptions.solutions != 0;
-  mSummary.complete = mSummary.outcome == Outcome::Contradiction;
-  if (mSummary.searched && mSummary.outcome == Outcome::Settled) Search(store, propagation);
-  mSummary.passes = propagation.Steps();
+  mNetwork.OnProgress([&](std::uint64_t steps, std::size_t waiting) { progress.Show(steps, waiting); });
+  mSummary.outcome = mNetwork.Narrow();
+  if (mOptions.solutions != 0) {
+    std::uint64_t solutions = 0;
+    mSummary.search = mNetwork.Search(mOptions.solutions, [&] {
+      mReport.Solution(mNetwork, ++solutions);
+      return std::cout.good();
+    });
+    mSummary.outcome = mSummary.search->outcome;
+  }
+  mNetwork.OnProgress(nullptr);
 }
 
-// The choices are undone in the end, so that they explain nothing.
-void OneRun::Search(Store& store, Propagation& propagation) {
-  Watch(store, false);
-  zornet::Search search(store, propagation);
-  mSummary.outcome = search.Run(mOptions.solutions, [&] {
-    mReport.Solution(store, ++mSummary.solutions);
-    return std::cout.good();
-  });
-  mSummary.complete = search.IsComplete();
-  mSummary.open = search.Open();
-  mSummary.openVariable = search.OpenVariable();
-  const bool none = mSummary.complete && mSummary.solutions == 0 && mSummary.open == 0;
-  if (none) mSummary.outcome = Outcome::Contradiction;
+void OneRun::Tell() {
+  if (!mSummary.search) mReport.Variables(mNetwork);
+  for (const Var variable : mExplained) mReport.Explain(mNetwork, variable, mNetwork.Explain(variable));
+  if (mOptions.stats) mReport.Statistics(mNetwork);
+  WritePictures();
+  if (!mOptions.raw) mReport.Finish(mNetwork, mSummary);
 }
 
-void OneRun::Tell(Store& store) {
-  if (!mSummary.searched) mReport.Variables(store);
-  for (const int variable : mExplained) mReport.Explain(store, variable, mLog.Explain(variable));
-  if (mOptions.stats) mReport.Statistics(store);
-  WritePictures(store);
-  if (!mOptions.raw) mReport.Finish(store, mSummary);
-}
-
-void OneRun::WritePictures(const Store& store) const {
+void OneRun::WritePictures() const {
   try {
-    if (!mOptions.dot.empty()) WriteGraph(mOptions.dot, Graph(store, mNames));
-    if (!mOptions.svg.empty()) WritePicture(mOptions.svg, Graph(store, mNames));
+    if (!mOptions.dot.empty()) WriteGraph(mOptions.dot, Graph(mNetwork, mNames));
+    if (!mOptions.svg.empty()) WritePicture(mOptions.svg, Graph(mNetwork, mNames));
   } catch (const std::runtime_error& error) {
     throw UsageError(error.what());
   }
@@ -172,25 +131,26 @@ int OneRun::ExitCode() const {
 int Run(const Options& options) {
   ReportStyle style{WantsColour(options.colour, STDOUT_FILENO), WantsColour(options.colour, STDERR_FILENO),
                     options.trace, options.quiet};
+  const auto reportOn = [&](const Source& source, const Places& places, const Model& model) {
+    return options.json ? MakeJsonReport(source, places, model, std::cout)
+                        : MakeTextReport(source, places, model, style, std::cout, std::cerr);
+  };
   const auto fail = [&](const std::exception& error, int code) {
-    const Source none(options.file, "");
-    const ReadModel empty;
-    auto report = options.json ? MakeJsonReport(none, empty, std::cout)
-                               : MakeTextReport(none, empty, style, std::cout, std::cerr);
-    report->Failure(error.what());
+    reportOn(Source(options.file, ""), {}, {})->Failure(error.what());
     return code;
   };
   try {
     const Source source = Load(options.file);
     Diagnostics diagnostics;
-    const ReadModel model = Read(source, diagnostics);
-    auto report = options.json ? MakeJsonReport(source, model, std::cout)
-                               : MakeTextReport(source, model, style, std::cout, std::cerr);
+    ReadModel read = Read(source, diagnostics);
     if (diagnostics.Failed()) {
-      report->Errors(source, diagnostics);
+      reportOn(source, {}, {})->Errors(source, diagnostics);
       return kModelError;
     }
-    return OneRun(options, source, model, *report).Go();
+    Network network(std::move(read.model), options.limits, options.modulePaths);
+    const Names names(source, read.places, network.GetModel());
+    const auto report = reportOn(source, read.places, network.GetModel());
+    return OneRun(options, network, names, *report).Go();
   } catch (const ModuleFailure& error) {
     return fail(error, kModuleError);
   } catch (const std::runtime_error& error) {

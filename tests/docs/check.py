@@ -4,11 +4,13 @@
 console      commands behind `$ `, each with what it prints below, first on stdout, then on stderr. A line of three dots
              stands for any lines. Times are not compared.
 szn, sh      a file for the commands, where a comment at the top of the block is its name
+text         a drawing
 cpp, cmake   a piece of a source file, word for word
 
 Commands run in a folder of their own beside the examples and docs: `zornet` and `./dev run` are the built program,
 `c++` compiles with the flags of the build, and the tree that the install tests made is in $PREFIX.
 """
+import json
 import os
 import pathlib
 import re
@@ -49,7 +51,7 @@ def check_block(kind, text):
     if kind == 'console':
         for command, expected in re.findall(r'^\$ (.*)\n((?:(?!\$ ).*\n)*)', text, re.M):
             run(command, expected)
-    elif kind in ('szn', 'sh'):
+    elif kind in ('szn', 'sh', 'text'):
         for name in re.findall(r'^[%#] ([\w.-]+)$', text, re.M)[:1]:
             (folder / name).write_text(text)
     elif kind in ('cpp', 'cmake'):
@@ -61,9 +63,15 @@ def check_block(kind, text):
 
 
 def check_references(text):
-    """Links lead to files, commands are in the usage, and a filter of tests finds some."""
+    """Links and paths lead to files, commands and presets are known, and a filter of tests finds some."""
     usage = (root / 'dev').read_text()
+    presets = {preset['name'] for preset in json.loads((root / 'CMakePresets.json').read_text())['configurePresets']}
+    paths = [path for path in re.findall(r'`((?:[\w.-]+/)+[\w.-]*)[` ]', text) if (root / path.split('/')[0]).is_dir()]
+    named = re.findall(r'--preset (\w+)|\./dev build (\w+)', text)
+    named += [(name, '') for listed in re.findall(r'The presets are (.*?)\.\s', text, re.S) for name in re.findall(r'`(\w+)`', listed)]
     missing = [link for link in re.findall(r'\]\(([\w./-]+)[)#]', text) if not (page.parent / link).exists()]
+    missing += [path for path in paths if not path.startswith('build/') and 'FAMILY' not in path and not (root / path).exists()]
+    missing += [f'preset {name}' for pair in named for name in pair if name and name not in presets]
     missing += [command for command in re.findall(r'\./dev [a-z-]+', text) if f'{command} ' not in usage]
     for name in re.findall(r'ctest --preset dev -R (\S+?)`', text):
         if 'Total Tests: 0' in subprocess.check_output(['ctest', '-N', '-R', name], cwd=build, text=True):

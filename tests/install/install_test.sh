@@ -41,6 +41,7 @@ find_package() {
   add_consumer "$tree"
   try_linked "$tree/bin/linked"
   "$tree/bin/sharing"
+  diff "$here/consumer/network.txt" <("$tree/bin/network")
 }
 
 pkg_config() {

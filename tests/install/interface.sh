@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # What the libraries show to others, compared with what is written down:
 #   interface.sh check|renew names|abi FOLDER     FOLDER holds the built libraries
-# names: the symbols of the module in module/exports.txt. Inline members are left out: a compiler emits them or not.
+# names: the symbols of the module in module/exports.txt, of the network library in network/exports.txt. Inline members are left out: a compiler emits them or not.
 # abi: classes, virtual tables and signatures in abi/, from debug information of g++ 12 on x86_64.
 set -euo pipefail
 action=$1 part=$2
@@ -15,7 +15,7 @@ fail() {
 }
 
 names() {
-  nm -D --defined-only "$folder/libZORVadStrings.so" |
+  nm -D --defined-only "$folder/lib$1.so" |
     awk '$2 !~ /[WVu]/ || $3 ~ /^_ZTV/ { print $3 }' | c++filt | sort -u
 }
 
@@ -29,8 +29,8 @@ suppress() {
   printf '[suppress_type]\nname_regexp = ^(std|__gnu_cxx)::\ndrop = yes\n'
 }
 
-check_names() { diff module/exports.txt <(names) || fail ZORVadStrings; }
-renew_names() { names >module/exports.txt; }
+check_names() { diff "$2/exports.txt" <(names "$1") || fail "$1"; }
+renew_names() { names "$1" >"$2/exports.txt"; }
 
 check_abi() { abidiff --no-unreferenced-symbols "${options[@]}" "abi/$1.abi" "$2" || fail "$1"; }
 renew_abi() {
@@ -39,13 +39,16 @@ renew_abi() {
 }
 
 case "$part" in
-  names) "${action}_names" ;;
+  names)
+    "${action}_names" ZORVadStrings module
+    "${action}_names" ZORNetwork network
+    ;;
   abi)
     command -v abidiff >/dev/null || exit 77
     scratch=$(mktemp)
     trap 'rm -f "$scratch"' EXIT
     options=(--exported-interfaces-only --suppressions "$scratch")
-    for library in ZORHost ZORVadStrings; do
+    for library in ZORHost ZORNetwork ZORVadStrings; do
       suppress "$folder/lib$library.so" >"$scratch"
       "${action}_abi" "$library" "$folder/lib$library.so"
     done

@@ -241,13 +241,13 @@ TEST(Reader, ReadsAllThereIs) {
   zornet::Diagnostics diagnostics;
   const zornet::Model model = zornet::Read(source, diagnostics).model;
   ASSERT_FALSE(diagnostics.Failed()) << zornet::Render(source, diagnostics, false);
-  ASSERT_EQ(model.variables.size(), 7u);
-  EXPECT_EQ(model.variables[2].texts, (std::vector<std::string>{"", "x"}));
-  EXPECT_EQ(model.variables[3].numbers, std::vector<ZORLong>{-5});
-  EXPECT_EQ(model.variables[4].numbers, (std::vector<ZORLong>{1, 1}));
-  EXPECT_EQ(model.variables[5].numbers, std::vector<ZORLong>{1});
-  EXPECT_EQ(model.variables[6].numbers, std::vector<ZORLong>{1});
-  EXPECT_EQ(model.outputs, (std::vector<int>{0, 2, 6}));
+  ASSERT_EQ(model.Variables().size(), 7u);
+  EXPECT_EQ(model.Variables()[2].texts, (std::vector<std::string>{"", "x"}));
+  EXPECT_EQ(model.Variables()[3].numbers, std::vector<std::int32_t>{-5});
+  EXPECT_EQ(model.Variables()[4].numbers, (std::vector<std::int32_t>{1, 1}));
+  EXPECT_EQ(model.Variables()[5].numbers, std::vector<std::int32_t>{1});
+  EXPECT_EQ(model.Variables()[6].numbers, std::vector<std::int32_t>{1});
+  EXPECT_EQ(model.Wanted(), (std::vector<int>{0, 2, 6}));
 }
 
 }  // namespace

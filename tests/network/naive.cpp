@@ -167,52 +167,21 @@ void Solve(const Network& network, const std::vector<std::string>& universe,
   Solver(network, universe, found).Run();
 }
 
-std::string Network::Write() const {
-  const auto constant = [](Type type, const Value& value) {
-    if (type == Type::Boolean) return std::string(value.number != 0 ? "true" : "false");
-    return IsText(type) ? '"' + value.text + '"' : std::to_string(value.number);
-  };
-  const auto set = [&](const Variable& variable) {
-    std::string text = "{";
-    for (const Value& value : variable.domain) text += (text.size() > 1 ? ", " : "") + constant(variable.type, value);
-    return text + "}";
-  };
-  std::string model;
-  for (std::size_t v = 0; v < variables.size(); ++v) {
-    const Variable& variable = variables[v];
-    std::string type, value;
-    const bool known = !variable.domain.empty();
-    switch (variable.type) {
-      case Type::Text:
-        type = "string";
-        break;
-      case Type::TextSet:
-        type = known ? set(variable) : "set string";
-        break;
-      case Type::Integer:
-        type = "int";
-        break;
-      case Type::IntegerSet:
-        type = set(variable);
-        break;
-      case Type::Boolean:
-        type = "bool";
-        break;
-      case Type::Interval:
-        type = std::to_string(variable.domain.front().number);
-        type += ".." + std::to_string(variable.domain.back().number);
-        break;
+zornet::Model Network::Build() const {
+  zornet::Model model;
+  for (const Variable& variable : variables) {
+    zornet::Variable declared{"v" + std::to_string(model.Variables().size()), static_cast<zornet::Sort>(variable.type)};
+    for (const Value& value : variable.domain) {
+      if (IsText(variable.type)) declared.texts.push_back(value.text);
+      if (!IsText(variable.type)) declared.numbers.push_back(static_cast<std::int32_t>(value.number));
     }
-    const bool single = variable.type == Type::Text || variable.type == Type::Integer || variable.type == Type::Boolean;
-    if (single && known) value = " = " + constant(variable.type, variable.domain.front());
-    model += "var " + type + ": v" + std::to_string(v) + value + ";\n";
+    if (variable.type == Type::Interval) declared.numbers = {declared.numbers.front(), declared.numbers.back()};
+    model.Add(std::move(declared));
   }
   for (const Constraint& constraint : constraints) {
-    model += "constraint " + constraint.name + "(";
-    for (std::size_t i = 0; i < constraint.arguments.size(); ++i) {
-      model += (i != 0 ? ", v" : "v") + std::to_string(constraint.arguments[i]);
-    }
-    model += ");\n";
+    std::vector<zornet::Var> arguments;
+    for (const int argument : constraint.arguments) arguments.push_back({argument});
+    model.Post(*zornet::FindKind(constraint.name), arguments);
   }
   return model;
 }

@@ -9,6 +9,8 @@
 #include <string>
 #include <vector>
 
+#include "network/ZORModel.h"
+
 namespace naive {
 
 inline constexpr std::size_t kLongest = 255;
@@ -21,7 +23,7 @@ struct Value {
   auto operator<=>(const Value&) const = default;
 };
 
-enum class Type { Text, TextSet, Integer, Interval, IntegerSet, Boolean };
+enum class Type { Text, TextSet, Integer, Interval, IntegerSet, Boolean };  // in the order of zornet::Sort
 inline bool IsText(Type type) { return type == Type::Text || type == Type::TextSet; }
 
 struct Variable {
@@ -38,7 +40,7 @@ struct Network {
   std::vector<Variable> variables;
   std::vector<Constraint> constraints;
 
-  std::string Write() const;  // as a model; variable 3 is called v3
+  zornet::Model Build() const;  // variable 3 is called v3
 };
 
 using Assignment = std::vector<Value>;

@@ -1,11 +1,9 @@
-// What networks settle to.
-#include "network/propagation.h"
-
+// What the networks of models settle to, and what a search finds in them.
 #include <fmt/core.h>
 #include <gtest/gtest.h>
 
 #include "network/search.h"
-#include "tests/network/support.h"
+#include "tests/language/support.h"
 #include "zornet/progress.h"
 
 namespace {
@@ -89,11 +87,8 @@ const Row kNetworks[] = {
 TEST(Propagation, SettlesTo) {
   for (const Row& row : kNetworks) {
     Solved solved(row.model);
-    solved.Settle();
-    std::string settled;
-    for (const int variable : solved.model.outputs)
-      settled += (settled.empty() ? "" : ", ") + solved.store[variable].Show();
-    EXPECT_EQ(settled, row.settled) << row.why << "\n" << row.model;
+    solved.Narrow();
+    EXPECT_EQ(solved.Print(), row.settled) << row.why << "\n" << row.model;
   }
 }
 
@@ -106,19 +101,19 @@ TEST(Propagation, GreatestText) {
                 "constraint str_concat(x, x, sums); constraint str_upper(in, up); var bool: top; constraint "
                 "str_eq_reif(over, \"" +
                 greatest + "\", top);");
-  EXPECT_EQ(solved.Settle(), zornet::Outcome::Settled);
-  EXPECT_EQ(solved.Show("over"), "Max");
-  EXPECT_EQ(solved.Show("in"), "Max");
-  EXPECT_EQ(solved.Show("sums"), "{ \"bb\", Max }");
-  EXPECT_EQ(solved.Show("up"), '"' + std::string(255, 'Z') + '"');
-  EXPECT_EQ(solved.Show("top"), "true");
+  EXPECT_EQ(solved.Narrow(), zornet::Outcome::Settled);
+  EXPECT_EQ(solved.Print("over"), "Max");
+  EXPECT_EQ(solved.Print("in"), "Max");
+  EXPECT_EQ(solved.Print("sums"), "{ \"bb\", Max }");
+  EXPECT_EQ(solved.Print("up"), '"' + std::string(255, 'Z') + '"');
+  EXPECT_EQ(solved.Print("top"), "true");
 }
 
 TEST(Propagation, GreatestTextIsItsOwnSuccessor) {
   Solved solved("var set string: before; var {\"" + std::string(255, 'z') +
                 "\"}: last; constraint str_next(before, last);");
-  EXPECT_EQ(solved.Settle(), zornet::Outcome::Settled);
-  EXPECT_EQ(solved.Show("before"), "{ \"" + std::string(254, 'z') + "y\", Max }");
+  EXPECT_EQ(solved.Narrow(), zornet::Outcome::Settled);
+  EXPECT_EQ(solved.Print("before"), "{ \"" + std::string(254, 'z') + "y\", Max }");
 }
 
 // The module gives up at the 257th pair, though many pairs give one text.
@@ -126,8 +121,8 @@ TEST(Propagation, MorePairsThanASetLists) {
   std::string set;
   for (std::size_t i = 0; i < 17; ++i) set += (i == 0 ? "{\"" : ", \"") + std::string(i, 'a') + '"';
   Solved solved("var " + set + "}: x; var " + set + "}: y; var set string: z; constraint str_concat(x, y, z);");
-  EXPECT_EQ(solved.Settle(), zornet::Outcome::Settled);
-  EXPECT_EQ(solved.store.List(solved.Find("z")).count, 33u);
+  EXPECT_EQ(solved.Narrow(), zornet::Outcome::Settled);
+  EXPECT_EQ(solved["z"].Texts().size(), 33u);
 }
 
 // Beyond the budget the module's operations on whole sets are left.
@@ -135,16 +130,16 @@ TEST(Propagation, Budget) {
   const std::string model =
       "var {\"a\", \"b\"}: x; var {\"c\", \"d\"}: y; var {\"ac\", \"bx\", \"q\"}: z; constraint str_concat(x, y, z);";
   Solved within(model), beyond(model, {1, 1000});
-  within.Settle();
-  beyond.Settle();
-  EXPECT_EQ(within.Show("x"), "\"a\"");
-  EXPECT_EQ(beyond.Show("x"), "{ \"a\", \"b\" }");
-  EXPECT_EQ(beyond.Show("z"), "\"ac\"");
+  within.Narrow();
+  beyond.Narrow();
+  EXPECT_EQ(within.Print("x"), "\"a\"");
+  EXPECT_EQ(beyond.Print("x"), "{ \"a\", \"b\" }");
+  EXPECT_EQ(beyond.Print("z"), "\"ac\"");
 }
 
 TEST(Propagation, StepLimit) {
   Solved solved("var string: x; constraint str_eq(x, \"a\"); constraint str_ne(x, \"b\");", {65536, 1});
-  EXPECT_EQ(solved.Settle(), zornet::Outcome::StepLimit);
+  EXPECT_EQ(solved.Narrow(), zornet::Outcome::StepLimit);
 }
 
 // Ten times the network, ten times the work.
@@ -155,29 +150,27 @@ TEST(Propagation, WorkGrowsWithTheNetwork) {
       model += fmt::format("var set string: x{};\nconstraint str_concat(x{}, \"b\", x{});\n", i, i - 1, i);
     }
     Solved solved(model);
-    EXPECT_EQ(solved.Settle(), zornet::Outcome::Settled);
-    EXPECT_EQ(solved.Show(fmt::format("x{}", size)), "Max");
-    return solved.propagation.Steps();
+    EXPECT_EQ(solved.Narrow(), zornet::Outcome::Settled);
+    EXPECT_EQ(solved.Print(fmt::format("x{}", size)), "Max");
+    return solved.Steps();
   };
   EXPECT_LE(passes(10000), 11 * passes(1000));
 }
 
 TEST(Search, TellsWhatCannotBeLabelled) {
   Solved solved("var string: x; var {\"a\", \"b\"}: y;");
-  ASSERT_EQ(solved.Settle(), zornet::Outcome::Settled);
-  zornet::Search search(solved.store, solved.propagation);
-  search.Run(10, [] {
+  const zornet::SearchResult result = solved.Search(10, [] {
     ADD_FAILURE() << "a full assignment";
     return true;
   });
-  EXPECT_EQ(search.Open(), 2u);
-  EXPECT_EQ(search.OpenVariable(), solved.Find("x"));
+  EXPECT_EQ(result.open, 2u);
+  EXPECT_EQ(result.openVariable, solved.Find("x"));
 }
 
 TEST(Search, StopsInTimeAndLeavesNoTrace) {
   struct {
     const char* why;
-    std::uint64_t limit, wanted, steps, found;
+    std::uint64_t most, wanted, steps, found;
     zornet::Outcome outcome;
   } const rows[] = {
       {"at the limit", 3, 9, 1000, 3, zornet::Outcome::Settled},
@@ -186,12 +179,12 @@ TEST(Search, StopsInTimeAndLeavesNoTrace) {
   };
   for (const auto& row : rows) {
     Solved solved("var {\"a\", \"b\"}: x; var {\"b\", \"c\"}: y; constraint str_ne(x, y);", {65536, row.steps});
-    solved.Settle();
-    zornet::Search search(solved.store, solved.propagation);
-    EXPECT_EQ(search.Run(row.limit, [&] { return search.Found() < row.wanted; }), row.outcome) << row.why;
-    EXPECT_EQ(search.Found(), row.found) << row.why;
-    EXPECT_FALSE(search.IsComplete()) << row.why;
-    EXPECT_EQ(solved.Show("x") + solved.Show("y"), "{ \"a\", \"b\" }{ \"b\", \"c\" }") << row.why;
+    std::uint64_t found = 0;
+    const zornet::SearchResult result = solved.Search(row.most, [&] { return ++found < row.wanted; });
+    EXPECT_EQ(result.outcome, row.outcome) << row.why;
+    EXPECT_EQ(result.solutions, row.found) << row.why;
+    EXPECT_FALSE(result.complete) << row.why;
+    EXPECT_EQ(solved.Print(), "{ \"a\", \"b\" }, { \"b\", \"c\" }") << row.why;
   }
 }
 
@@ -202,10 +195,10 @@ TEST(Progress, IsToldOnceInAWhile) {
   Solved solved(model);
   {
     zornet::ProgressLine shown(true, {}), silent(false, {}), patient(true);
-    solved.propagation.OnProgress([&](std::uint64_t steps, std::size_t waiting) {
+    solved.OnProgress([&](std::uint64_t steps, std::size_t waiting) {
       for (zornet::ProgressLine* line : {&shown, &silent, &patient}) line->Show(steps, waiting);
     });
-    solved.Settle();
+    solved.Narrow();
   }
   EXPECT_EQ(testing::internal::GetCapturedStderr(), "\r\x1b[K0.0 s: 256 passes, 345 constraints waiting\r\x1b[K");
 }

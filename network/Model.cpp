@@ -1,0 +1,131 @@
+#include <algorithm>
+#include <functional>
+#include <stdexcept>
+#include <utility>
+
+#include "host/ZORNumbers.h"
+#include "network/ZORModel.h"
+#include "network/texts.h"
+
+namespace zornet {
+
+namespace {
+
+[[noreturn]] void Refuse(const std::string& what) { throw std::invalid_argument(what); }
+
+void CheckText(const std::string& text) {
+  if (text.size() > kTextLimit)
+    Refuse("a text has at most " + std::to_string(kTextLimit) + " characters, this one has " +
+           std::to_string(text.size()));
+  if (!std::all_of(text.begin(), text.end(), zor::IsInAlphabet)) Refuse("a text has characters from space to z only");
+}
+
+std::size_t MostNumbers(Sort sort) {
+  if (IsText(sort)) return 0;
+  if (sort == Sort::IntegerSet) return ZORVadEnumInteger::kListLimit;
+  return sort == Sort::Interval ? 2 : 1;
+}
+
+void CheckValues(const Variable& variable) {
+  const std::size_t texts = variable.texts.size(), numbers = variable.numbers.size();
+  if (texts > 0 && !IsText(variable.sort)) Refuse("texts are no values for a number");
+  if (texts > 1 && variable.sort == Sort::Text) Refuse("one text, not " + std::to_string(texts));
+  if (numbers > MostNumbers(variable.sort))
+    Refuse("at most " + std::to_string(MostNumbers(variable.sort)) + " integers, not " + std::to_string(numbers));
+  if (numbers == 1 && variable.sort == Sort::Interval) Refuse("an interval has two ends");
+  for (const std::string& text : variable.texts) CheckText(text);
+}
+
+template <class T>
+void SortUnique(std::vector<T>& values) {
+  if (std::adjacent_find(values.begin(), values.end(), std::greater_equal<>()) == values.end()) return;
+  std::sort(values.begin(), values.end());
+  values.erase(std::unique(values.begin(), values.end()), values.end());
+}
+
+}  // namespace
+
+Var Model::Add(Variable variable) {
+  SortUnique(variable.texts);
+  if (variable.sort != Sort::Interval) SortUnique(variable.numbers);
+  CheckValues(variable);
+  mVariables.push_back(std::move(variable));
+  return {static_cast<int>(mVariables.size()) - 1};
+}
+
+Var Model::Text(std::string name) { return Add({std::move(name), Sort::Text}); }
+Var Model::Text(std::string name, std::string text) { return Add({std::move(name), Sort::Text, {std::move(text)}}); }
+
+Var Model::TextSet(std::string name) { return Add({std::move(name), Sort::TextSet}); }
+Var Model::TextSet(std::string name, std::vector<std::string> texts) {
+  if (texts.empty()) Refuse("a set has at least one text");
+  return Add({std::move(name), Sort::TextSet, std::move(texts)});
+}
+
+Var Model::Integer(std::string name) { return Add({std::move(name), Sort::Integer}); }
+Var Model::Integer(std::string name, std::int32_t number) {
+  return Add({std::move(name), Sort::Integer, {}, {number}});
+}
+
+Var Model::Interval(std::string name, std::int32_t first, std::int32_t last) {
+  if (first > last) Refuse("the upper end of an interval is less than the lower");
+  return Add({std::move(name), Sort::Interval, {}, {first, last}});
+}
+
+Var Model::IntegerSet(std::string name, std::vector<std::int32_t> numbers) {
+  if (numbers.empty()) Refuse("a set has at least one integer");
+  return Add({std::move(name), Sort::IntegerSet, {}, std::move(numbers)});
+}
+
+Var Model::Boolean(std::string name) { return Add({std::move(name), Sort::Boolean}); }
+Var Model::Boolean(std::string name, bool truth) { return Add({std::move(name), Sort::Boolean, {}, {truth ? 1 : 0}}); }
+
+Var Model::AddConstant(const Argument& value) {
+  if (const auto* text = std::get_if<std::string>(&value.mValue)) return Add({"", Sort::Text, {*text}, {}, true});
+  if (const auto* number = std::get_if<std::int32_t>(&value.mValue))
+    return Add({"", Sort::Integer, {}, {*number}, true});
+  if (const auto* truth = std::get_if<bool>(&value.mValue)) return Add({"", Sort::Boolean, {}, {*truth ? 1 : 0}, true});
+  return std::get<Var>(value.mValue);
+}
+
+int Model::Post(std::string_view name, std::initializer_list<Argument> arguments) {
+  const Kind* const kind = FindKind(name);
+  if (kind == nullptr) Refuse("there is no constraint '" + std::string(name) + "'");
+  const std::size_t before = mVariables.size();
+  try {
+    std::vector<Var> variables;
+    for (const Argument& argument : arguments) variables.push_back(AddConstant(argument));
+    return Post(*kind, variables);
+  } catch (...) {
+    mVariables.resize(before);
+    throw;
+  }
+}
+
+int Model::Post(const Kind& kind, std::span<const Var> arguments) {
+  if (static_cast<int>(arguments.size()) != kind.arity)
+    Refuse(std::string(kind.name) + " takes " + std::to_string(kind.arity) + " arguments, not " +
+           std::to_string(arguments.size()));
+  Constraint constraint{&kind};
+  for (std::size_t i = 0; i < arguments.size(); ++i) {
+    const auto at = static_cast<std::size_t>(arguments[i].index);
+    if (at >= mVariables.size()) Refuse("no variable of this model");
+    if (!Fits(mVariables[at].sort, kind.takes[i]))
+      Refuse(std::string(kind.name) + " cannot take '" + mVariables[at].name + "' for " + std::string(kind.roles[i]));
+    constraint.arguments[i] = arguments[i].index;
+  }
+  mConstraints.push_back(constraint);
+  return static_cast<int>(mConstraints.size()) - 1;
+}
+
+void Model::Want(Var variable) {
+  if (static_cast<std::size_t>(variable.index) >= mVariables.size()) Refuse("no variable of this model");
+  mWanted.push_back(variable.index);
+}
+
+void Model::Reserve(std::size_t variables, std::size_t constraints) {
+  mVariables.reserve(variables);
+  mConstraints.reserve(constraints);
+}
+
+}  // namespace zornet

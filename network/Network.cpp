@@ -1,0 +1,129 @@
+#include <utility>
+
+#include "network/ZORNetwork.h"
+#include "network/log.h"
+#include "network/propagation.h"
+#include "network/search.h"
+#include "network/session.h"
+#include "network/store.h"
+
+namespace zornet {
+
+bool Domain::IsNil() const { return mValue->IsNil(); }
+bool Domain::IsAny() const { return mValue->IsUndefined(); }
+bool Domain::IsKnown() const { return mValue->IsKnown(); }
+bool Domain::IsOne() const { return mValue->IsOne(); }
+
+std::vector<std::string> Domain::Texts() const {
+  std::vector<std::string> texts;
+  for (const ZORString& text : mValue->Texts()) texts.emplace_back(ToView(text));
+  return texts;
+}
+
+std::vector<std::int32_t> Domain::Numbers() const { return mValue->Numbers(); }
+std::int32_t Domain::Lowest() const { return mValue->LowestNumber(); }
+std::int32_t Domain::Highest() const { return mValue->HighestNumber(); }
+std::string Domain::Print() const { return mValue->Show(); }
+
+namespace {
+
+// Passes on what is narrowed.
+class Teller : public Watcher {
+ public:
+  explicit Teller(std::function<void(const Narrowing&)> told) : mTold(std::move(told)) {}
+  void Narrowed(const Narrowing& narrowing) override { mTold(narrowing); }
+
+ private:
+  std::function<void(const Narrowing&)> mTold;
+};
+
+// Where nothing is wanted in particular, all is.
+Model WithWanted(Model model) {
+  if (!model.Wanted().empty()) return model;
+  for (int v = 0; v < static_cast<int>(model.Variables().size()); ++v) {
+    if (!model.Variables()[static_cast<std::size_t>(v)].constant) model.Want({v});
+  }
+  return model;
+}
+
+}  // namespace
+
+// In the order in which they need each other: values must be gone before the session in which they were made.
+struct Network::Inside {
+  Inside(zornet::Model given, const Limits& bounds, const std::vector<std::string>& folders)
+      : model(WithWanted(std::move(given))),
+        limits(bounds),
+        session(folders),
+        store(session.Types(), model),
+        propagation(store, limits) {}
+
+  const Model model;
+  const Limits limits;
+  const Session session;
+  Store store;
+  Propagation propagation;
+  std::unique_ptr<Teller> teller;
+};
+
+Network::Network(Model model, const Limits& limits, const std::vector<std::string>& moduleFolders)
+    : mInside(std::make_unique<Inside>(std::move(model), limits, moduleFolders)) {}
+Network::~Network() = default;
+Network::Network(Network&&) noexcept = default;
+Network& Network::operator=(Network&&) noexcept = default;
+
+Outcome Network::Narrow() { return mInside->propagation.Run(); }
+
+SearchResult Network::Search(std::uint64_t most, const std::function<bool()>& found) {
+  SearchResult result;
+  result.outcome = Narrow();
+  result.complete = result.outcome == Outcome::Contradiction;
+  if (result.outcome != Outcome::Settled) return result;
+  zornet::Search search(mInside->store, mInside->propagation);
+  result.outcome = search.Run(most, found);
+  result.solutions = search.Found();
+  result.complete = search.IsComplete();
+  result.open = search.Open();
+  result.openVariable = {search.OpenVariable()};
+  if (result.complete && result.solutions == 0 && result.open == 0) result.outcome = Outcome::Contradiction;
+  return result;
+}
+
+const Model& Network::GetModel() const { return mInside->model; }
+Domain Network::operator[](Var variable) const { return Domain(mInside->store[variable.index]); }
+ZORVaDoAny& Network::Bare(Var variable) { return mInside->store.Bare(variable.index).Any(); }
+Var Network::FailedVariable() const { return {mInside->store.Failed()}; }
+int Network::FailedConstraint() const { return mInside->store.FailedConstraint(); }
+
+Explanation Network::Explain(Var variable) const {
+  Store store(mInside->session.Types(), mInside->model);
+  Log log(mInside->model);
+  store.Watch(&log);
+  Propagation(store, {mInside->limits.budget, mInside->propagation.Steps()}).Run();
+  Explanation explanation = log.Explain(variable.index);
+  const Store start(mInside->session.Types(), mInside->model);
+  for (Explanation::Start& declared : explanation.declared) declared.value = start[declared.variable.index].Show();
+  return explanation;
+}
+
+void Network::OnNarrowing(std::function<void(const Narrowing&)> told) {
+  mInside->teller = told ? std::make_unique<Teller>(std::move(told)) : nullptr;
+  mInside->store.Watch(mInside->teller.get());
+}
+
+void Network::OnProgress(std::function<void(std::uint64_t, std::size_t)> told) {
+  mInside->propagation.OnProgress(std::move(told));
+}
+
+std::uint64_t Network::Steps() const { return mInside->propagation.Steps(); }
+
+std::vector<OperationCount> Network::Counts() const {
+  std::vector<OperationCount> counts;
+  for (std::size_t i = 0; i < kOperations; ++i) {
+    const OperationCounts& count = mInside->store.Counts()[i];
+    if (count.calls != 0)
+      counts.push_back({NameOf(static_cast<Operation>(i)), count.calls, count.changes, count.contradictions});
+  }
+  return counts;
+}
+
+}  // namespace zornet

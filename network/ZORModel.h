@@ -1,0 +1,165 @@
+// A model: variables over texts, integers and truth values, and constraints between them.
+//
+//   zornet::Model model;
+//   const zornet::Var host = model.TextSet("host", {"north-7", "south-7"});
+//   model.Post("str_concat", {"north", "-7", host});
+//
+// A text has at most 255 characters, from the space to z. An integer has 32 bits. What a model cannot hold throws
+// std::invalid_argument, whose what() names it; the model is then as before.
+#pragma once
+
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <initializer_list>
+#include <span>
+#include <string>
+#include <string_view>
+#include <variant>
+#include <vector>
+
+#include "host/ZORExport.h"
+
+namespace zornet {
+
+// What a variable ranges over.
+enum class Sort {
+  Text,        // one text, known or not: a variable that could still be two texts counts as unknown
+  TextSet,     // a set of possible texts
+  Integer,     // one integer, known or not
+  Interval,    // the integers from one to another
+  IntegerSet,  // a set of at most 4096 possible integers
+  Boolean,
+};
+inline constexpr int kSorts = 6;
+
+struct SortNames {
+  std::string_view type;       // "set string": in reports
+  std::string_view described;  // "a set of texts": in messages
+  std::string_view solver;     // "enum string": what the solver's descriptor is called
+};
+ZOR_EXPORT const SortNames& NamesOf(Sort sort);
+
+constexpr bool IsText(Sort sort) { return sort == Sort::Text || sort == Sort::TextSet; }
+constexpr bool IsInteger(Sort sort) { return !IsText(sort) && sort != Sort::Boolean; }
+
+// A variable or constant of a model, by its number there.
+struct Var {
+  int index = -1;
+
+  friend bool operator==(Var, Var) = default;
+};
+
+// A variable as it is declared. Nothing is known of it when both lists are empty; else it is one of the texts, or one
+// of the numbers (of an interval its two ends, of a truth value 0 or 1).
+struct Variable {
+  std::string name;
+  Sort sort = Sort::Text;
+  std::vector<std::string> texts = {};
+  std::vector<std::int32_t> numbers = {};
+  bool constant = false;
+};
+
+// What a constraint says: a relation between its first two arguments, whose truth a reified relation puts into its
+// third, or a function that gives its last argument.
+enum class Meaning {
+  Equal,
+  Unequal,
+  LessOrEqual,
+  Less,
+  Concatenation,
+  Slice,  // characters from one position to another, both included
+  Length,
+  Lower,
+  Upper,
+  Minimum,
+  Maximum,
+  Successor,
+  TextForm,
+};
+
+enum class Takes { Text, Integer, Boolean, Anything };
+inline constexpr int kMostArguments = 4;
+
+// A constraint that can be posted.
+struct Kind {
+  std::string_view name;
+  Meaning meaning;
+  bool mirrored;  // the relation with first and second exchanged
+  bool reified;
+  int arity;
+  std::array<Takes, kMostArguments> takes;
+  std::array<std::string_view, kMostArguments> roles;
+
+  constexpr bool IsRelation() const { return meaning <= Meaning::Less; }
+  constexpr int Inputs() const { return arity - 1; }  // of a function: its result comes last
+};
+
+ZOR_EXPORT std::span<const Kind> Kinds();
+ZOR_EXPORT const Kind* FindKind(std::string_view name);  // null when there is none
+ZOR_EXPORT bool Fits(Sort sort, Takes takes);
+
+struct Constraint {
+  const Kind* kind = nullptr;
+  std::array<int, kMostArguments> arguments = {};  // variables by number
+
+  int Result() const { return arguments[static_cast<std::size_t>(kind->Inputs())]; }
+};
+
+// An argument of a constraint: a variable, or a constant.
+class Argument {
+ public:
+  // NOLINTBEGIN(google-explicit-constructor): arguments are written as what they are
+  Argument(Var variable) : mValue(variable) {}
+  Argument(const char* text) : mValue(std::string(text)) {}
+  Argument(std::string text) : mValue(std::move(text)) {}
+  Argument(std::int32_t number) : mValue(number) {}
+  Argument(bool truth) : mValue(truth) {}
+  // NOLINTEND(google-explicit-constructor)
+
+ private:
+  friend class Model;
+  std::variant<Var, std::string, std::int32_t, bool> mValue;
+};
+
+class ZOR_EXPORT Model {
+ public:
+  // clang-format off
+  // Variables, by a name for people, which may be empty. Without a value nothing is known of them.
+  Var Text      (std::string name);
+  Var Text      (std::string name, std::string text);
+  Var TextSet   (std::string name);
+  Var TextSet   (std::string name, std::vector<std::string> texts);  // at least one, in any order
+  Var Integer   (std::string name);
+  Var Integer   (std::string name, std::int32_t number);
+  Var Interval  (std::string name, std::int32_t first, std::int32_t last);
+  Var IntegerSet(std::string name, std::vector<std::int32_t> numbers);  // from 1 to 4096, in any order
+  Var Boolean   (std::string name);
+  Var Boolean   (std::string name, bool truth);
+  // clang-format on
+  Var Add(Variable variable);
+  Var AddConstant(const Argument& value);
+
+  // Posts the constraint of that name, such as "str_concat"; docs/language.md lists them with their arguments.
+  // Answers its number.
+  int Post(std::string_view name, std::initializer_list<Argument> arguments);
+  int Post(const Kind& kind, std::span<const Var> arguments);
+
+  // Names a variable that is wanted: solutions that differ elsewhere only are one solution. Without any, all
+  // variables are wanted.
+  void Want(Var variable);
+
+  const std::string& NameOf(Var variable) const { return mVariables[static_cast<std::size_t>(variable.index)].name; }
+  const std::vector<Variable>& Variables() const { return mVariables; }
+  const std::vector<Constraint>& Constraints() const { return mConstraints; }
+  const std::vector<int>& Wanted() const { return mWanted; }  // by number
+
+  void Reserve(std::size_t variables, std::size_t constraints);  // room, for large models
+
+ private:
+  std::vector<Variable> mVariables;
+  std::vector<Constraint> mConstraints;
+  std::vector<int> mWanted;
+};
+
+}  // namespace zornet

@@ -1,0 +1,143 @@
+// A network narrows the variables of a model to what its constraints leave possible. It always ends, and it never drops
+// a value that a solution needs; what is left need not be part of a solution, which Search finds out.
+//
+//   zornet::Network network(model);
+//   if (network.Narrow() == zornet::Outcome::Contradiction) ...
+//   network[host].Print();                   // "north-7"
+//   network.Search(10, [&] { ... return true; });
+//   for (const auto& step : network.Explain(host).narrowings) ...
+//
+// Networks are independent of each other; one belongs to one thread at a time.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <functional>
+#include <memory>
+#include <stdexcept>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "network/ZORModel.h"
+
+class ZORVaDoAny;
+
+namespace zornet {
+
+class Value;
+
+// The modules of the value types cannot be used: what() says which and why.
+struct ZOR_EXPORT ModuleFailure : std::runtime_error {
+  using std::runtime_error::runtime_error;
+};
+
+struct Limits {
+  std::size_t budget = 65536;         // combinations of values that one pass over a constraint may try
+  std::uint64_t steps = 100'000'000;  // passes over a constraint, and choices of a search, in all
+};
+
+enum class Outcome {
+  Settled,        // no constraint narrows anything further
+  Contradiction,  // there is no solution
+  StepLimit,
+};
+
+// What is still possible for a variable: a view, good until its network changes. Texts and numbers ascend.
+class ZOR_EXPORT Domain {
+ public:
+  explicit Domain(const Value& value) : mValue(&value) {}
+
+  bool IsNil() const;    // nothing: a contradiction
+  bool IsAny() const;    // nothing is known
+  bool IsKnown() const;  // neither: what follows is for a known domain
+  bool IsOne() const;    // one text, number or truth value is left
+
+  std::vector<std::string> Texts() const;
+  std::vector<std::int32_t> Numbers() const;  // of a set of integers
+  std::int32_t Lowest() const;                // of integers; of a truth value 0 or 1
+  std::int32_t Highest() const;
+
+  std::string Print() const;  // of any domain, as models write it: { "a", "b" }, 1..9, Any
+
+ private:
+  const Value* mValue;
+};
+
+inline constexpr int kNone = -1;  // no constraint
+
+// A step: a variable lost values by an operation of a constraint, or by a choice of a search.
+struct Narrowing {
+  int constraint = kNone;
+  std::string_view operation;
+  Var variable;
+  std::string before, after;  // as Domain::Print
+  bool failed = false;        // nothing is left
+};
+
+// Why a variable is what it is.
+struct Explanation {
+  struct Start {
+    Var variable;
+    std::string value;  // as Domain::Print
+  };
+  std::vector<Start> declared;        // variables that took part with what they were declared as
+  std::vector<Narrowing> narrowings;  // in the order in which they happened
+};
+
+struct OperationCount {
+  std::string_view operation;
+  std::uint64_t calls = 0, changes = 0, contradictions = 0;
+};
+
+struct SearchResult {
+  Outcome outcome = Outcome::Settled;  // Contradiction: it is sure that there is no solution
+  std::uint64_t solutions = 0;
+  bool complete = false;   // there are no more
+  std::uint64_t open = 0;  // assignments left out because a variable stays unknown in them
+  Var openVariable;        // one such variable
+};
+
+class ZOR_EXPORT Network {
+ public:
+  // Opens the modules, from beside the program, from the folders given, or from where this library is installed.
+  // Throws ModuleFailure.
+  explicit Network(Model model, const Limits& limits = {}, const std::vector<std::string>& moduleFolders = {});
+  ~Network();
+  Network(Network&&) noexcept;
+  Network& operator=(Network&&) noexcept;
+
+  // Narrows until nothing changes, until a contradiction, or until the limit of steps.
+  Outcome Narrow();
+
+  // Narrows, then looks for solutions, in which every wanted variable has one value, and stops at `most` of them. found
+  // is called at each, while the domains show it; it answers whether to go on. Afterwards the domains are as narrowed.
+  SearchResult Search(std::uint64_t most, const std::function<bool()>& found);
+
+  const Model& GetModel() const;
+  Domain operator[](Var variable) const;
+  Domain operator[](int variable) const { return (*this)[Var{variable}]; }
+
+  // After a contradiction: what nothing is left for, and the constraint that said so. Else -1 in both.
+  Var FailedVariable() const;
+  int FailedConstraint() const;
+
+  // Narrows once more from the start, to tell what brought a variable to its domain.
+  Explanation Explain(Var variable) const;
+
+  // The solver's own value, for the bare operations of its modules. What is narrowed after a change is not sound.
+  ZORVaDoAny& Bare(Var variable);
+
+  // Are called while it narrows: at each step, and now and then with the steps made and the constraints that wait.
+  void OnNarrowing(std::function<void(const Narrowing&)> told);
+  void OnProgress(std::function<void(std::uint64_t steps, std::size_t waiting)> told);
+
+  std::uint64_t Steps() const;                 // passes over a constraint, and choices
+  std::vector<OperationCount> Counts() const;  // of the operations that were called
+
+ private:
+  struct Inside;
+  std::unique_ptr<Inside> mInside;
+};
+
+}  // namespace zornet

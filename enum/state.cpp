@@ -4,8 +4,11 @@
 #include "enum/entries.h"
 #include "module/characters.h"
 #include "module/classdefinition.h"
+#include "module/valuetypes.h"
 
 ZOR_DEFINE_STRING_CLASS(ZORVadEnumString, ZORVaDoString, "enum string", ZORVaDoString::sDescriptor, 1);
+
+const ZORVaDoObjectDescriptor* zor::MakeEnumDescriptor() { return ZORVadEnumString::MakeDescriptor(); }
 
 ZORVadEnumString* ZORVadEnumString::Build(ZORStreamable* object) {
   return static_cast<ZORVadEnumString*>(zor::BuildForRead<ZORVadEnumString>(object));

@@ -1,9 +1,8 @@
 #include "module/InitModule.h"
 
-#include "enum/ZORVadEnumString.h"
 #include "module/ZORVaDoString.h"
 #include "module/characters.h"
-#include "single/ZORVadSingleString.h"
+#include "module/valuetypes.h"
 
 int InitModule(ZORVaDoModule* module, ZORVaDoModuleManager* manager) {
   if (module == nullptr || manager == nullptr) return 0;
@@ -11,8 +10,8 @@ int InitModule(ZORVaDoModule* module, ZORVaDoModuleManager* manager) {
   if (numbers == nullptr) return 0;
   module->AddLoadedModule(numbers);
   ZORVaDoString::MakeDescriptor();  // the parent of the two concrete types, not a type to be had by itself
-  module->AddObjectDescriptor(ZORVadSingleString::MakeDescriptor());
-  module->AddObjectDescriptor(ZORVadEnumString::MakeDescriptor());
+  module->AddObjectDescriptor(zor::MakeSingleDescriptor());
+  module->AddObjectDescriptor(zor::MakeEnumDescriptor());
   InitStrings();
   return 1;
 }

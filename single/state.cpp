@@ -2,9 +2,12 @@
 #include "host/Guard.h"
 #include "module/characters.h"
 #include "module/classdefinition.h"
+#include "module/valuetypes.h"
 #include "single/ZORVadSingleString.h"
 
 ZOR_DEFINE_STRING_CLASS(ZORVadSingleString, ZORVaDoString, "single string", ZORVaDoString::sDescriptor, 0);
+
+const ZORVaDoObjectDescriptor* zor::MakeSingleDescriptor() { return ZORVadSingleString::MakeDescriptor(); }
 
 ZORVadSingleString* ZORVadSingleString::Build(ZORStreamable* object) {
   return static_cast<ZORVadSingleString*>(zor::BuildForRead<ZORVadSingleString>(object));

@@ -52,6 +52,11 @@ install_pkg_config(zornetwork "Sound narrowing and search over networks of strin
 set_target_properties(zornet PROPERTIES INSTALL_RPATH "\$ORIGIN/../${CMAKE_INSTALL_LIBDIR}")
 install(TARGETS zornet)
 install(FILES zornet/zornet.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 OPTIONAL)
+install(FILES completions/zornet.bash DESTINATION share/bash-completion/completions RENAME zornet)
+install(FILES completions/_zornet DESTINATION share/zsh/site-functions)
+install(FILES completions/zornet.fish DESTINATION share/fish/vendor_completions.d)
+install(DIRECTORY editors/vim/ DESTINATION share/vim/vimfiles)
+install(FILES editors/zornet.tmLanguage.json DESTINATION share/zorvadstrings)
 install(FILES README.md CONTRIBUTING.md CHANGELOG.md SECURITY.md LICENSE DESTINATION ${CMAKE_INSTALL_DOCDIR})
 install(DIRECTORY docs DESTINATION ${CMAKE_INSTALL_DOCDIR}
   FILES_MATCHING PATTERN *.md PATTERN *.svg PATTERN *.cpp)

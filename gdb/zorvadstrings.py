@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: MIT
 """Shows texts and string values in gdb in their text form: "abc", { "a", "b", Max }, Nil.
 
 Reads memory alone and calls nothing in the program, so that core files and broken values can be looked at.

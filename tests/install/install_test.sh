@@ -104,6 +104,28 @@ clean_root() {
   in_root root /opt/app/bin/sharing
 }
 
+# What each shell offers behind "zornet --" are the options of the help.
+offered_by_bash() {
+  source "$tree/share/bash-completion/completions/zornet"
+  COMP_WORDS=(zornet --) COMP_CWORD=1 _zornet zornet -- zornet
+  printf '%s\n' "${COMPREPLY[@]}"
+}
+offered_by_zsh() {
+  # shellcheck disable=SC2016  # zsh expands it
+  zsh -fc '_arguments() { print -rl -- $@ }; source $1' zsh "$tree/share/zsh/site-functions/_zornet" |
+    grep -oE '^(\([^)]*\)|\*)*--[a-z-]+' | grep -oE -- '--[a-z-]+$'
+}
+offered_by_fish() {
+  fish --no-config -c "source $tree/share/fish/vendor_completions.d/zornet.fish; complete -C 'zornet --'" | cut -f1
+}
+completions() {
+  local shell options
+  options=$("$tree/bin/zornet" --help | grep -oE '^ +(-.,)?--[a-z-]+' | grep -oE -- '--[a-z-]+' | sort)
+  for shell in bash zsh fish; do
+    diff <(echo "$options") <("offered_by_$shell" | sort) || fail "$shell"
+  done
+}
+
 # ./dev with nothing left to build, from another folder.
 dev() {
   local command=$scratch/dev/dev tool

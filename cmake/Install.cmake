@@ -79,9 +79,24 @@ install(CODE "
 
 set(CPACK_GENERATOR DEB TGZ)
 set(CPACK_PACKAGE_NAME zorvadstrings)
-set(CPACK_PACKAGE_CONTACT "The ZORVadStrings developers <zorvadstrings@localhost>")
+set(ZOR_MAINTAINER "The ZORVadStrings authors <zorvadstrings@example.org>" CACHE STRING "Who answers for the packages")
+set(CPACK_PACKAGE_CONTACT ${ZOR_MAINTAINER})
 set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "String types for a subdefinite constraint solver, and a runner for its networks")
+set(CPACK_PACKAGE_DESCRIPTION
+"A variable of the solver holds what is still possible for it, at most one
+text or a set of texts, and operations narrow that: equality, order, length,
+case, concatenation and parts, each in both directions.
+.
+The program zornet narrows the variables of whole models, explains how it
+came to a result and searches for solutions. The libraries behind it, their
+headers and what CMake and pkg-config need are in this package too.")
 set(CPACK_STRIP_FILES ON)
+set(CPACK_PRE_BUILD_SCRIPTS ${PROJECT_SOURCE_DIR}/cmake/debian/Debian.cmake)
+set(CPACK_POST_BUILD_SCRIPTS ${PROJECT_SOURCE_DIR}/cmake/debian/Debian.cmake)
+set(CPACK_DEBIAN_PACKAGE_SECTION math)
+set(CPACK_DEBIAN_PACKAGE_RECOMMENDS graphviz)
+set(CPACK_DEBIAN_PACKAGE_CONTROL_EXTRA ${PROJECT_SOURCE_DIR}/cmake/debian/triggers)
+set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
 set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
 set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
 set(CPACK_DEBIAN_PACKAGE_GENERATE_SHLIBS ON)

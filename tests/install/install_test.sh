@@ -106,6 +106,7 @@ clean_root() {
 
 # What each shell offers behind "zornet --" are the options of the help.
 offered_by_bash() {
+  # shellcheck disable=SC1091  # not there before it is installed
   source "$tree/share/bash-completion/completions/zornet"
   COMP_WORDS=(zornet --) COMP_CWORD=1 _zornet zornet -- zornet
   printf '%s\n' "${COMPREPLY[@]}"
@@ -153,8 +154,12 @@ packages() {
   clean_root
   ls root/usr/share/gdb/auto-load/usr/lib/libZORHost.so.*-gdb.py
   [[ $(dpkg-deb -f ./*.deb Depends) == *libstdc++6* ]] || fail "the .deb does not tell what it needs"
+  [[ $(zcat root/usr/share/doc/zorvadstrings/changelog.gz) == "zorvadstrings ($(dpkg-deb -f ./*.deb Version))"* ]] ||
+    fail "CHANGELOG.md does not begin with this version"
   mkdir archive && tar -C archive --strip-components=1 -xf ./*.tar.gz
   narrow "$PWD/archive"
 }
+
+lintian() { command lintian --allow-root --fail-on error,warning "$scratch"/packages/*.deb; }
 
 "$2"

@@ -1,0 +1,7 @@
+# CPack runs this before and after it packs a tree.
+if(CPACK_GENERATOR STREQUAL "DEB" AND CPACK_PACKAGE_FILES)
+  execute_process(COMMAND ${CMAKE_CURRENT_LIST_DIR}/finish package ${CPACK_PACKAGE_FILES} COMMAND_ERROR_IS_FATAL ANY)
+elseif(CPACK_GENERATOR STREQUAL "DEB")
+  execute_process(COMMAND ${CMAKE_CURRENT_LIST_DIR}/finish tree ${CPACK_TEMPORARY_DIRECTORY} ${CPACK_PACKAGE_CONTACT}
+                  COMMAND_ERROR_IS_FATAL ANY)
+endif()

@@ -41,7 +41,7 @@ std::string FolderOf(const char* file) {
 
 // Without /proc, as in a bare root folder, the kernel still tells under which name it started the program.
 std::string ProgramFolder() {
-  const std::string folder = FolderOf("/proc/self/exe");
+  std::string folder = FolderOf("/proc/self/exe");
   if (!folder.empty()) return folder;
   return FolderOf(reinterpret_cast<const char*>(getauxval(AT_EXECFN)));  // NOLINT(performance-no-int-to-ptr)
 }

@@ -98,10 +98,11 @@ in_root() {
 clean_root() {
   dpkg-deb -x ./*.deb root
   add_consumer "$PWD/root/opt/app"
-  ldd root/usr/bin/zornet root/opt/app/bin/linked | tr -s '\t ' '\n' | grep -E '^/(usr/)?lib' | sort -u |
+  ldd root/usr/bin/zornet root/usr/lib/lib*.so | tr -s '\t ' '\n' | grep -E '^/(usr/)?lib' | sort -u |
     xargs cp -L --parents -t root
   in_root root /usr/bin/zornet /usr/share/doc/zorvadstrings/examples/hello.szn
   in_root root /opt/app/bin/sharing
+  diff "$here/consumer/network.txt" <(in_root root /opt/app/bin/network)
 }
 
 # What each shell offers behind "zornet --" are the options of the help.

@@ -8,10 +8,10 @@ namespace zor {
 
 namespace {
 
-constexpr unsigned int kAhead = 8;    // places between a text that is compared and one on its way into the cache
-constexpr unsigned int kSearch = 16;  // so many times larger a set is searched, not walked
+constexpr unsigned int kAhead = 8;    // how many texts ahead of the current one are prefetched
+constexpr unsigned int kSearch = 16;  // a set that many times larger is searched, not walked
 
-// Asks for the text that stands kAhead places behind position i.
+// Prefetches the text kAhead positions after i.
 void FetchAhead(ZORString* const* places, unsigned int i, unsigned int count) {
   if (i + kAhead < count) __builtin_prefetch(places[i + kAhead]);
 }
@@ -42,8 +42,8 @@ unsigned int TextSet::CountLessOrEqual(const ZORString& bound) const {
   return static_cast<unsigned int>(std::upper_bound(places, places + Count(), bound, less) - places);
 }
 
-// Our places move to the end of an array with room for all, and both runs are read from there into its front, which
-// never overtakes them.
+// Moves the own texts to the end of an array with room for all, then merges both runs into its front, which cannot
+// overtake them.
 bool TextSet::Merge(const ZORISVectorImp_String& texts, Equals equals) {
   const unsigned int own = Count(), more = texts.Count();
   const bool refuses = equals == Equals::Refused;
@@ -66,12 +66,12 @@ bool TextSet::Merge(const ZORISVectorImp_String& texts, Equals equals) {
   }
   while (next != end) *out++ = *next++;
   const auto count = static_cast<unsigned int>(out - places);
-  if (count > own) mVector.AddAt(places[count - 1], count - 1);  // where it stands, so that all up to it count
+  if (count > own) mVector.AddAt(places[count - 1], count - 1);  // already there: extends the elements up to it
   mVector.DetachAt(count, own + more - count, 0);
   return count == own + more;
 }
 
-// One walk, in which nothing is built: a text that is lost is deleted on the spot, those behind it move up.
+// One pass without allocation: a dropped text is deleted at once, and later ones move up.
 template <class Test>
 bool TextSet::KeepThose(Test test) {
   const unsigned int count = Count();

@@ -1,5 +1,4 @@
-// The operations of a string value on other values, in the order of the virtual table: one list for whoever runs all
-// of them, as code or as a table.
+// Every operation of a string value on other values, in the order of the virtual table, as a macro and as a table.
 #pragma once
 
 #include <algorithm>
@@ -12,11 +11,11 @@
 
 #include "module/ZORVaDoString.h"
 
-// Expands X(Shape, Name, operands...) for each operation. The first operand is the value that it is called on, all are
-// of the class that declares it, and the one that is not const is the target. Shapes:
-//   Algebra  answers nothing          Equality  of two values         Pair, Triple  of strings
-//   Test     narrows nothing          Truth     into a Boolean        Length, Form  of a string and another value
-//   Alone    without operands                                         Slice         of strings and positions
+// Expands X(Shape, Name, operands...) for each operation. The first operand is the object of the call; the non-const
+// one is the target. Shapes:
+//   Algebra  returns nothing      Equality  of any two values     Pair, Triple  of strings
+//   Test     narrows nothing      Truth     reified               Length, Form  of a string and another value
+//   Alone    no operands                                          Slice         of strings and positions
 // clang-format off
 #define ZOR_STRING_OPERATIONS(X)                                                                                   \
   X(Algebra,  Assign,                            ZORVaDoAny&, const ZORVaDoAny&)                                   \
@@ -67,7 +66,7 @@
 
 namespace zor {
 
-// Which operand is narrowed, 0 for the value that the operation is called on; kNoTarget when none is.
+// The index of the operand that is narrowed, kNoTarget when none is.
 constexpr std::size_t kNoTarget = 4;
 
 template <class... Operands>
@@ -84,10 +83,10 @@ struct Operation {
 
   Shape shape;
   std::string_view name;
-  std::size_t operands;                      // how many there are, with the value that it is called on
-  std::size_t target;                        // see TargetOf
-  std::array<Kind, 4> kinds;                 // the class of each
-  int (*call)(ZORVaDoAny* const* operands);  // each of the class that the operation takes; 0 of one without an answer
+  std::size_t operands;                      // how many, with the object of the call
+  std::size_t target;                        // index, or kNoTarget
+  std::array<Kind, 4> kinds;                 // the class of each operand
+  int (*call)(ZORVaDoAny* const* operands);  // operands of these classes; 0 for Algebra
 };
 
 template <class Operand>

@@ -52,8 +52,8 @@ class TextSet {
   bool Insert(Text&& text, Equals equals = Equals::Refused);
   bool Merge (const ZORISVectorImp_String& texts, Equals equals);
 
-  // Keep drops the texts that are not in others, ascending, or not marked, and returns whether it dropped any. Cut drops
-  // the positions [first, last).
+  // Keep drops the texts that are not in others, ascending, or not marked, and returns whether it dropped any. Cut
+  // drops the positions [first, last).
   bool Keep (const ZORISVectorImp_String& others);
   bool Keep (const Marks& marks);
   void Cut  (unsigned int first, unsigned int last);

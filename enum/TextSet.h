@@ -60,9 +60,9 @@ class TextSet {
   void Clear() { if (Count() > 0) mVector.Flush(1); }
   void Swap (TextSet& other) { mVector.Swap(other.mVector); }
 
-  // Narrowing without building the candidates: Mark each, then Keep the marked texts. CanMark: neither side is too large
-  // for that. Mark marks text if it is present, the first of its equals; next is a hint that starts at 0 and makes
-  // ascending candidates cheap.
+  // Narrowing without building the candidates: Mark each, then Keep the marked texts. CanMark: neither side is too
+  // large for that. Mark marks text if it is present, the first of its equals; next is a hint that starts at 0 and
+  // makes ascending candidates cheap.
   bool CanMark(std::size_t candidates) const { return Count() > 0 && Count() <= kSetLimit && candidates <= kSetLimit; }
   void Mark   (const ZORString& text, Marks& marks, unsigned int& next) const;
   // clang-format on

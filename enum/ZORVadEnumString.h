@@ -90,10 +90,11 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   int CalcInverseNotLessAndUnequalValue(      ZORVadEnumString& x) const;    // x
   int CalcInverseNotLessAndUnequalValue(      ZORVadSingleString& x) const;  // x
 
-  // *this = min(x, y), max(x, y). Forward adds the texts of both operands to *this, cuts at the bound and returns 1; a Min
-  // or full operand decides alone. With an Undefined operand the minimum cuts *this to the other, the maximum makes it
-  // Undefined. Inverse: an Undefined x copies *this if y is Undefined or has the same upper (maximum: lower) bound; a
-  // known x becomes Nil if its bound and that of y rule *this out.
+  // *this = min(x, y), max(x, y). Forward adds the texts of both operands to *this, cuts at the bound and returns 1; a
+  // Min or full operand decides alone. With an Undefined operand the minimum cuts *this to the other, the maximum makes
+  // it Undefined.
+  // Inverse: an Undefined x copies *this if y is Undefined or has the same upper (maximum: lower) bound; a known x
+  // becomes Nil if its bound and that of y rule *this out.
   // *this = the successor of x. Replaces the target by the successors or predecessors and returns 1.
   int CalcMinValue            (const ZORVadEnumString& x, const ZORVadEnumString& y);        // *this
   int CalcFirstInverseMinValue(      ZORVadEnumString& x, const ZORVadEnumString& y) const;  // x
@@ -113,8 +114,8 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   int CalcThirdInverseSubString (const ZORVadEnumString& x, const ZORVaDoInteger& start,       ZORVaDoInteger& end) const;  // nothing
 
   // *this = x in lower case, in upper case: keeps the texts that are a folded text of x, an Undefined *this takes them
-  // all. For a single x only the first text of *this is compared. The inverses only test x: text by text a known one must
-  // fold to *this, an Undefined one needs a folded text there; else x is Nil.
+  // all. For a single x only the first text of *this is compared. The inverses only test x: text by text a known one
+  // must fold to *this, an Undefined one needs a folded text there; else x is Nil.
   int CalcLowerValue       (const ZORVadEnumString& x);          // *this
   int CalcLowerValue       (const ZORVadSingleString& x);        // *this
   int CalcInverseLowerValue(      ZORVadEnumString& x) const;    // x

@@ -56,13 +56,13 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
   int CalcNotLessAndUnequalValue       (const ZORVadSingleString& x);        // *this
   int CalcInverseNotLessAndUnequalValue(      ZORVadSingleString& x) const;  // x
 
-  // *this = min(x, y), max(x, y). Forward: a Nil operand makes *this Nil, an Undefined one Undefined; else it settles on
-  // the lesser or greater text. The minimum of Max and Max makes *this Max whatever it was.
+  // *this = min(x, y), max(x, y). Forward: a Nil operand makes *this Nil, an Undefined one Undefined; else it settles
+  // on the lesser or greater text. The minimum of Max and Max makes *this Max whatever it was.
   // Inverse: an Undefined y changes nothing. A known x becomes Undefined with an Undefined *this, and Nil unless the
   // lesser or greater text of x and y is that of *this. An Undefined x copies *this where y permits it, else it is Nil.
-  // *this = the successor of x. An Undefined source changes nothing, a Nil one makes the target Nil, and so does a Max x;
-  // else the target settles on the successor or predecessor. A text without a successor makes an Undefined *this Max. One
-  // without a predecessor, the empty text or Min, makes x Nil.
+  // *this = the successor of x. An Undefined source changes nothing, a Nil one makes the target Nil, and so does a Max
+  // x; else the target settles on the successor or predecessor. A text without a successor makes an Undefined *this
+  // Max. One without a predecessor, the empty text or Min, makes x Nil.
   int CalcMinValue            (const ZORVadSingleString& x, const ZORVadSingleString& y);        // *this
   int CalcFirstInverseMinValue(      ZORVadSingleString& x, const ZORVadSingleString& y) const;  // x
   int CalcMaxValue            (const ZORVadSingleString& x, const ZORVadSingleString& y);        // *this
@@ -70,27 +70,28 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
   int CalcNextValue           (const ZORVadSingleString& x);                                     // *this
   int CalcInverseNextValue    (      ZORVadSingleString& x) const;                               // x
 
-  // *this = x + y. Forward: a Nil value among the three makes *this Nil, an Undefined operand makes it Undefined, even if
-  // it was known; a Max operand, or more than 255 characters, make it Max; else it settles on the text.
-  // Inverse: a Nil source makes the target Nil, an Undefined or Max one Undefined. Where the other operand occurs in the
-  // text of *this, x settles on what precedes its first occurrence, y on what follows as many characters as x has;
+  // *this = x + y. Forward: a Nil value among the three makes *this Nil, an Undefined operand makes it Undefined, even
+  // if it was known; a Max operand, or more than 255 characters, make it Max; else it settles on the text.
+  // Inverse: a Nil source makes the target Nil, an Undefined or Max one Undefined. Where the other operand occurs in
+  // the text of *this, x settles on what precedes its first occurrence, y on what follows as many characters as x has;
   // elsewhere the target becomes Nil. The result need not satisfy the relation.
   int CalcConcatenation             (const ZORVadSingleString& x, const ZORVadSingleString& y);        // *this
   int CalcFirstInverseConcatenation (      ZORVadSingleString& x, const ZORVadSingleString& y) const;  // x
   int CalcSecondInverseConcatenation(const ZORVadSingleString& x,       ZORVadSingleString& y) const;  // y
 
-  // *this = x[start .. end], positions from 0, both included, truncated at the ends of x. An Undefined operand makes the
-  // target Undefined, a Nil one Nil; a Min x makes *this Min first. Forward: settles on the slice. Inverse: with both
-  // positions known the target becomes Nil unless the slice is the text of *this. An unknown position settles where a
-  // slice of that length matches: at the known position, or at the first occurrence when both are unknown.
+  // *this = x[start .. end], positions from 0, both included, truncated at the ends of x. An Undefined operand makes
+  // the target Undefined, a Nil one Nil; a Min x makes *this Min first. Forward: settles on the slice.
+  // Inverse: with both positions known the target becomes Nil unless the slice is the text of *this. An unknown
+  // position settles where a slice of that length matches: at the known position, or at the first occurrence when both
+  // are unknown.
   int CalcSubString             (const ZORVadSingleString& x, const ZORVaDoInteger& start, const ZORVaDoInteger& end);        // *this
   int CalcFirstInverseSubString (      ZORVadSingleString& x, const ZORVaDoInteger& start, const ZORVaDoInteger& end) const;  // x
   int CalcSecondInverseSubString(const ZORVadSingleString& x,       ZORVaDoInteger& start, const ZORVaDoInteger& end) const;  // start
   int CalcThirdInverseSubString (const ZORVadSingleString& x, const ZORVaDoInteger& start,       ZORVaDoInteger& end) const;  // end
 
   // *this = x in lower case, in upper case. Forward: settles on the folded text, or on Min or Max of such an x; an
-  // Undefined x makes *this Nil if its text has a letter in the other case. The inverse only tests x, because many texts
-  // fold to one: Nil if x folds to another text, or an Undefined x cannot fold to the text of *this.
+  // Undefined x makes *this Nil if its text has a letter in the other case. The inverse only tests x, because many
+  // texts fold to one: Nil if x folds to another text, or an Undefined x cannot fold to the text of *this.
   int CalcLowerValue       (const ZORVadSingleString& x);        // *this
   int CalcInverseLowerValue(      ZORVadSingleString& x) const;  // x
   int CalcUpperValue       (const ZORVadSingleString& x);        // *this

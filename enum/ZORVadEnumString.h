@@ -28,6 +28,27 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   ZOR_DECLARE_STRING_CLASS(ZORVadEnumString);
 
  public:
+  // Those without a typed form:
+  //   PrintOn, InputValue    Nil, Any, Max, Min, one text in double quotes, or { "a", "b" }, with the state Max
+  //                          { "a", Max }, which cannot be read; any other input gives Nil
+  //   Write, Read            the state, and the texts of an Exact value; broken input gives Nil
+  //   GetCardinality         Nil 0, Undefined 256, else Count()
+  //   IsIntersected          0 if either value is Nil, else 1 if either is Undefined, else whether *this lists a text
+  //                          of the other, or the other is Max for a full *this. The other may be a single value
+  //   Bisect                 changes nothing, except that a wrong operand or selection makes *this Nil
+  //   GetLowerBound          Nil: "". Any, Min: one space. Full: the greatest text. Else the first text
+  //   GetUpperBound          Nil: "". Min: one space. Any, Max: the greatest text. Else the last text
+  //   GetNextExactValue      the first text >= the argument; the argument itself if that is the last text or none
+  //   GetPrevExactValue      the last text <= the argument; the argument itself if that is the last text or none
+  //   SetExactValue          makes *this Exact with that text alone
+  //   InsertExactValue       adds the text and makes *this Exact; with 256 texts it becomes Any. Any and full stay
+  //   RemoveExactValue       drops the text; an Exact value without texts is Nil
+  //   SetLowerBound          drops the texts up to the bound and lists it; Nil and Any stay
+  //   SetUpperBound          drops the texts from the bound on and lists it; Max if it is the greatest text, else Exact
+  //   CalcLength             n becomes Nil or Undefined with *this, 1, else is intersected with the lengths
+  //   CalcInverseLength      keeps the texts whose length n allows, becomes Exact, 1; Nil if n is Nil or negative. An
+  //                          Undefined n changes nothing. With more than 256 texts left *this becomes Any
+  //   CalcStringRepresentation and its inverse narrow nothing, 0
   ZOR_DECLARE_STRING_OPERATIONS();
   static ZORVadEnumString* Build(ZORStreamable* object);  // stream factory; null when out of memory
 
@@ -59,9 +80,10 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   int        CutLower(const ZORString& bound);         // drops the texts < bound
   int        CutUpper(const ZORString& bound);         // drops the texts > bound, and Max if bound is less
 
-  // Intersect, with CalcEqualValue, keeps the texts that both list, whatever the state Max; a full *this stays if other
-  // is Max. A single other that is listed becomes the only text, else *this is Nil; a Max single changes nothing. The
-  // inverse gives an Undefined single target the only text of *this, and makes a known one Nil unless it is listed.
+  // Intersect, with CalcEqualValue, keeps the texts that both list, whatever the state Max; an Undefined *this copies
+  // other, and a full one becomes Nil unless other is Max. A single other that is listed becomes the only text, else
+  // *this is Nil; a Max single changes nothing. The inverse gives an Undefined single target the only text of *this,
+  // and makes a known one Nil unless it is listed.
   // Unite adds the texts of other; an Undefined side makes *this Undefined. Bisect splits no set.
   int  Intersect            (const ZORVadEnumString& other);
   int  Intersect            (const ZORISVectorImp_String& texts);
@@ -76,7 +98,8 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
 
   // *this < x, <= x, >= x, > x. The lesser side of <= is cut to the upper bound of the other; the greater side gets
   // the lower bound of the other as its own, listed even if it was not. Strict relations cut nothing: unless the upper
-  // bound of the lesser side is less, the target becomes Nil.
+  // bound of the lesser side is less, the target becomes Nil. A single x that gets a bound becomes that text; in the
+  // other inverses it is compared with the last text of *this, or the greatest of a full one, and becomes Nil.
   int CalcLessOrEqualValue             (const ZORVadEnumString& x);          // *this
   int CalcLessOrEqualValue             (const ZORVadSingleString& x);        // *this
   int CalcInverseLessOrEqualValue      (      ZORVadEnumString& x) const;    // x
@@ -95,7 +118,9 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   // it Undefined.
   // Inverse: an Undefined x copies *this if y is Undefined or has the same upper (maximum: lower) bound; a known x
   // becomes Nil if its bound and that of y rule *this out.
-  // *this = the successor of x. Replaces the target by the successors or predecessors and returns 1.
+  // *this = the successor of x. Replaces the target by the successors or predecessors and returns 1. A text without a
+  // successor is its own; "" has no predecessor. A full *this makes x Max with the text before the greatest, a Min one
+  // makes it Min.
   int CalcMinValue            (const ZORVadEnumString& x, const ZORVadEnumString& y);        // *this
   int CalcFirstInverseMinValue(      ZORVadEnumString& x, const ZORVadEnumString& y) const;  // x
   int CalcMaxValue            (const ZORVadEnumString& x, const ZORVadEnumString& y);        // *this
@@ -115,7 +140,8 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
 
   // *this = x in lower case, in upper case: keeps the texts that are a folded text of x, an Undefined *this takes them
   // all. For a single x only the first text of *this is compared. The inverses only test x: text by text a known one
-  // must fold to *this, an Undefined one needs a folded text there; else x is Nil.
+  // must fold to *this, an Undefined one needs a folded text there; else x is Nil. A Min or full value goes with its
+  // like alone.
   int CalcLowerValue       (const ZORVadEnumString& x);          // *this
   int CalcLowerValue       (const ZORVadSingleString& x);        // *this
   int CalcInverseLowerValue(      ZORVadEnumString& x) const;    // x

@@ -19,6 +19,21 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
   ZOR_DECLARE_STRING_CLASS(ZORVadSingleString);
 
  public:
+  // Those without a typed form:
+  //   PrintOn, InputValue    Nil, Any, Max, Min, or the text in double quotes; any other input gives Nil
+  //   Write, Read            the state, and the text of an Exact value; broken input gives Nil
+  //   GetCardinality         Nil 0, Undefined 255, else 1
+  //   IsIntersected          0 if either value is Nil, else 1 if either is Undefined, else whether the texts are equal
+  //   Bisect                 makes *this Nil
+  //   bounds, neighbours     the text, whatever the state
+  //   SetExactValue, SetLowerBound, SetUpperBound   make *this Exact with the text
+  //   InsertExactValue       a Nil value takes the text; one with another text becomes Undefined
+  //   RemoveExactValue       makes a value with that text Nil
+  //   CalcLength             n becomes Nil or Undefined with *this, else equal to the length
+  //   CalcInverseLength      Nil unless n is a single integer, and Undefined or the length; an Undefined *this stays
+  //                          unless n is negative
+  //   CalcStringRepresentation         becomes Exact with the text form of x, 1
+  //   CalcInverseStringRepresentation  x reads its text form from the text, 1
   ZOR_DECLARE_STRING_OPERATIONS();
   static ZORVadSingleString* Build(ZORStreamable* object);  // stream factory; null when out of memory
 
@@ -91,7 +106,8 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
 
   // *this = x in lower case, in upper case. Forward: settles on the folded text, or on Min or Max of such an x; an
   // Undefined x makes *this Nil if its text has a letter in the other case. The inverse only tests x, because many
-  // texts fold to one: Nil if x folds to another text, or an Undefined x cannot fold to the text of *this.
+  // texts fold to one: Nil if x folds to another text, or an Undefined x cannot fold to the text of *this. Min and Max
+  // go with their like alone, whatever the text.
   int CalcLowerValue       (const ZORVadSingleString& x);        // *this
   int CalcInverseLowerValue(      ZORVadSingleString& x) const;  // x
   int CalcUpperValue       (const ZORVadSingleString& x);        // *this

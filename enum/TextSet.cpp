@@ -16,12 +16,6 @@ void FetchAhead(ZORString* const* places, unsigned int i, unsigned int count) {
   if (i + kAhead < count) __builtin_prefetch(places[i + kAhead]);
 }
 
-unsigned int CountIn(const ZORISVectorImp_String& texts, const ZORString& bound) {
-  ZORString* const* const places = &texts[0];
-  const auto less = [](const ZORString* listed, const ZORString& limit) { return *listed < limit; };
-  return static_cast<unsigned int>(std::lower_bound(places, places + texts.Count(), bound, less) - places);
-}
-
 }  // namespace
 
 void TextSet::Die() {
@@ -33,8 +27,6 @@ void TextSet::Reserve(unsigned int places) {
   Require(mVector.Good());
   if (places > mVector.Limit()) Require(mVector.Resize(places));
 }
-
-unsigned int TextSet::CountLess(const ZORString& bound) const { return CountIn(mVector, bound); }
 
 unsigned int TextSet::CountLessOrEqual(const ZORString& bound) const {
   ZORString* const* const places = &mVector[0];
@@ -96,7 +88,7 @@ bool TextSet::Keep(const ZORISVectorImp_String& others) {
   unsigned int j = 0;
   return KeepThose([&](unsigned int i) {
     FetchAhead(places, i, count);
-    if (searches) j = std::max(j, CountIn(others, *places[i]));
+    if (searches) j = std::max(j, CountLess(others, *places[i]));
     std::strong_ordering order = std::strong_ordering::less;
     while (j < otherCount && (order = *places[i] <=> *others[j]) > 0) FetchAhead(&others[0], ++j, otherCount);
     const bool isListed = j < otherCount && order == 0;
@@ -107,10 +99,6 @@ bool TextSet::Keep(const ZORISVectorImp_String& others) {
 
 bool TextSet::Keep(const Marks& marks) {
   return marks.count() < Count() && KeepThose([&](unsigned int i) { return marks[i]; });
-}
-
-void TextSet::Cut(unsigned int first, unsigned int last) {
-  if (first < last) mVector.DetachAt(first, last - first, 1);
 }
 
 void TextSet::Mark(const ZORString& text, Marks& marks, unsigned int& next) const {

@@ -43,7 +43,7 @@ class TextSet {
   unsigned int Find            (const ZORString* text)  const { return mVector.Find(text); }
   unsigned int FindLowerBound  (const ZORString& text)  const { return mVector.FindLowerBound(&text, 0); }
   unsigned int FindUpperBound  (const ZORString& text)  const { return mVector.FindUpperBound(&text, 0); }
-  unsigned int CountLess       (const ZORString& bound) const;
+  unsigned int CountLess       (const ZORString& bound) const { return CountLess(mVector, bound); }
   unsigned int CountLessOrEqual(const ZORString& bound) const;
 
   // Insert returns whether text was inserted; it comes after its equals. Merge inserts ascending texts and returns
@@ -56,7 +56,7 @@ class TextSet {
   // drops the positions [first, last).
   bool Keep (const ZORISVectorImp_String& others);
   bool Keep (const Marks& marks);
-  void Cut  (unsigned int first, unsigned int last);
+  void Cut  (unsigned int first, unsigned int last) { if (first < last) mVector.DetachAt(first, last - first, 1); }
   void Clear() { if (Count() > 0) mVector.Flush(1); }
   void Swap (TextSet& other) { mVector.Swap(other.mVector); }
 
@@ -70,6 +70,7 @@ class TextSet {
  private:
   static constexpr unsigned int kFew = 20;  // initial capacity, and growth of the vector
 
+  static unsigned int CountLess(const ZORISVectorImp_String& texts, const ZORString& bound);
   template <class Test>
   bool KeepThose(Test test);
   void Reserve(unsigned int places);
@@ -80,6 +81,12 @@ class TextSet {
 
   ZORISVectorImp_String mVector;
 };
+
+inline unsigned int TextSet::CountLess(const ZORISVectorImp_String& texts, const ZORString& bound) {
+  ZORString* const* const places = &texts[0];
+  const auto less = [](const ZORString* listed, const ZORString& limit) { return *listed < limit; };
+  return static_cast<unsigned int>(std::lower_bound(places, places + texts.Count(), bound, less) - places);
+}
 
 // Texts mostly arrive in order, so the end is tried first.
 template <class Text>

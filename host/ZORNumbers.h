@@ -36,36 +36,6 @@ class ZORIntegerSet;
   const char* CastableID() const override;                 \
   const ZORVaDoObjectDescriptor* GetDescriptor() const override
 
-// The overrides that numbers and truth values have in common.
-#define ZOR_DECLARE_NUMBER_OPERATIONS()                                                      \
- public:                                                                                     \
-  void Write(ZORopstream& out) const override;                                               \
-  void Read(ZORipstream& in) override;                                                       \
-  void PrintOn(ZORostrstream& out) const override;                                           \
-  void InputValue(ZORistrstream& in) override;                                               \
-  void Assign(const ZORVaDoAny& other) override;                                             \
-  int IsIntersected(const ZORVaDoAny& other) const override;                                 \
-  void Intersect(const ZORVaDoAny& other) override;                                          \
-  void Unite(const ZORVaDoAny& other) override;                                              \
-  void Bisect(ZORVaDoObject& other, ValueSelection selection) override;                      \
-  int CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
-  int CalcMinValue() override;                                                               \
-  int CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
-  int CalcMaxValue() override;                                                               \
-  int CalcEqualValue(const ZORVaDoAny& other) override;                                      \
-  int CalcInverseEqualValue(ZORVaDoAny& target) const override;                              \
-  int CalcUnequalValue(const ZORVaDoAny& other) override;                                    \
-  int CalcInverseUnequalValue(ZORVaDoAny& target) const override;                            \
-  int CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;           \
-  int CalcLessOrEqualValue(const ZORVaDoAny& other) override;                                \
-  int CalcInverseLessOrEqualValue(ZORVaDoAny& target) const override;                        \
-  int CalcNotLessAndUnequalValue(const ZORVaDoAny& other) override;                          \
-  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;                  \
-  int CalcIsLessOrEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;     \
-  int CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
-  int CalcFirstInverseMaxValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
-  static_assert(true)
-
 // A Boolean domain; false is less than true.
 class ZOR_EXPORT ZORVaDoBoolean : public ZORVaDoAny {
   ZOR_DECLARE_TYPE_TEST(ZORVaDoBoolean);
@@ -89,7 +59,11 @@ class ZOR_EXPORT ZORVadSingleBoolean : public ZORVaDoBoolean {
   ZORVadSingleBoolean() = default;
   explicit ZORVadSingleBoolean(ZORStreamableInit) {}
 
-  ZOR_DECLARE_NUMBER_OPERATIONS();
+  ZOR_DECLARE_VALUE_OPERATIONS();
+  int CalcUnequalValue(const ZORVaDoAny& other) override;
+  int CalcInverseUnequalValue(ZORVaDoAny& target) const override;
+  int CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
+  int CalcIsLessOrEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
   void SetNilValue() override;
   void SetUndefinedValue() override;
   int IsNil() const override;
@@ -114,7 +88,11 @@ class ZOR_EXPORT ZORVaDoInteger : public ZORVaDoScalar {
  public:
   // Assign takes the smallest domain of the class that has every number of other. CalcMinValue() and CalcMaxValue()
   // keep the least and the greatest 32-bit number.
-  ZOR_DECLARE_NUMBER_OPERATIONS();
+  ZOR_DECLARE_VALUE_OPERATIONS();
+  int CalcUnequalValue(const ZORVaDoAny& other) override;
+  int CalcInverseUnequalValue(ZORVaDoAny& target) const override;
+  int CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
+  int CalcIsLessOrEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
 
   // clang-format off
   int CalcLessValue          (const ZORVaDoScalar& other) override;

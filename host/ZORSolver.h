@@ -114,6 +114,31 @@ class ZOR_EXPORT ZORVaDoAny : public ZORVaDoObject {
   int IsDerivedFrom(const char* ident) const override;
 };
 
+// Overrides of every concrete class of values.
+#define ZOR_DECLARE_VALUE_OPERATIONS()                                                       \
+  void Write(ZORopstream& out) const override;                                               \
+  void Read(ZORipstream& in) override;                                                       \
+  void PrintOn(ZORostrstream& out) const override;                                           \
+  void InputValue(ZORistrstream& in) override;                                               \
+  void Assign(const ZORVaDoAny& other) override;                                             \
+  int IsIntersected(const ZORVaDoAny& other) const override;                                 \
+  void Intersect(const ZORVaDoAny& other) override;                                          \
+  void Unite(const ZORVaDoAny& other) override;                                              \
+  void Bisect(ZORVaDoObject& other, ValueSelection selection) override;                      \
+  int CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
+  int CalcMinValue() override;                                                               \
+  int CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
+  int CalcMaxValue() override;                                                               \
+  int CalcEqualValue(const ZORVaDoAny& other) override;                                      \
+  int CalcInverseEqualValue(ZORVaDoAny& target) const override;                              \
+  int CalcLessOrEqualValue(const ZORVaDoAny& other) override;                                \
+  int CalcInverseLessOrEqualValue(ZORVaDoAny& target) const override;                        \
+  int CalcNotLessAndUnequalValue(const ZORVaDoAny& other) override;                          \
+  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;                  \
+  int CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
+  int CalcFirstInverseMaxValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
+  static_assert(true)
+
 // A domain whose elements are ordered.
 class ZOR_EXPORT ZORVaDoScalar : public ZORVaDoAny {
  public:

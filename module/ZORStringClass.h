@@ -44,34 +44,14 @@
 // The overrides of a concrete class. The contracts of operations are with the typed forms of the class and in the base
 // classes. SetLowerBound and SetUpperBound are new and end the virtual table.
 #define ZOR_DECLARE_STRING_OPERATIONS()                                                                       \
-  void Write(ZORopstream& out) const override;                                                                \
-  void Read(ZORipstream& in) override;                                                                        \
-  void PrintOn(ZORostrstream& out) const override;                                                            \
-  void InputValue(ZORistrstream& in) override;                                                                \
-  void Assign(const ZORVaDoAny& other) override;                                                              \
+  ZOR_DECLARE_VALUE_OPERATIONS();                                                                             \
   void SetNilValue() override;                                                                                \
   void SetUndefinedValue() override;                                                                          \
   int IsNil() const final { return mState == ZorStringNil; }                                                  \
   int IsUndefined() const final { return mState == ZorStringAny; }                                            \
   int CheckNil() const { return IsNil(); }                                                                    \
   int CheckAny() const { return IsUndefined(); }                                                              \
-  int IsIntersected(const ZORVaDoAny& other) const override;                                                  \
-  void Intersect(const ZORVaDoAny& other) override;                                                           \
-  void Unite(const ZORVaDoAny& other) override;                                                               \
   unsigned long GetCardinality() const override;                                                              \
-  void Bisect(ZORVaDoObject& other, ValueSelection selection) override;                                       \
-  int CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                                        \
-  int CalcMinValue() override;                                                                                \
-  int CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                                        \
-  int CalcMaxValue() override;                                                                                \
-  int CalcEqualValue(const ZORVaDoAny& other) override;                                                       \
-  int CalcInverseEqualValue(ZORVaDoAny& target) const override;                                               \
-  int CalcLessOrEqualValue(const ZORVaDoAny& other) override;                                                 \
-  int CalcInverseLessOrEqualValue(ZORVaDoAny& target) const override;                                         \
-  int CalcNotLessAndUnequalValue(const ZORVaDoAny& other) override;                                           \
-  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;                                   \
-  int CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override;                  \
-  int CalcFirstInverseMaxValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override;                  \
   int CalcLessValue(const ZORVaDoScalar& other) override;                                                     \
   int CalcInverseLessValue(ZORVaDoScalar& target) const override;                                             \
   int CalcNotLessValue(const ZORVaDoScalar& other) override;                                                  \

@@ -12,9 +12,9 @@ namespace zor {
 constexpr char kLeastCharacter = ' ', kGreatestCharacter = 'z';  // the alphabet is every code between them
 constexpr bool IsInAlphabet(char c) { return c >= kLeastCharacter && c <= kGreatestCharacter; }
 
-constexpr int kLengthLimit = 255;                                // characters of the longest text
-constexpr unsigned int kReadableLimit = 254;                     // characters of the longest text that can be read
-constexpr std::size_t kSetLimit = 256;                           // texts of a set that grows through InsertExactValue
+constexpr int kLengthLimit = 255;             // characters of the longest text
+constexpr unsigned int kReadableLimit = 254;  // characters of the longest text that can be read
+constexpr std::size_t kSetLimit = 256;        // texts of a set that grows through InsertExactValue
 
 // The characters of text, valid until it changes. Views order like the texts.
 inline std::string_view View(const ZORString& text) {

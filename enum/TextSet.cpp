@@ -53,8 +53,7 @@ bool TextSet::Merge(const ZORISVectorImp_String& texts, Equals equals) {
     std::strong_ordering order = std::strong_ordering::greater;
     while (next != end && ((order = **next <=> text) < 0 || (order == 0 && !refuses))) *out++ = *next++;
     const bool listed = (next != end && order == 0) || (added != nullptr && *added == text);
-    if (listed && refuses) continue;
-    added = *out++ = new ZORString(text);
+    if (!listed || !refuses) added = *out++ = new ZORString(text);
   }
   while (next != end) *out++ = *next++;
   const auto count = static_cast<unsigned int>(out - places);

@@ -8,18 +8,12 @@ namespace zor {
 
 namespace {
 
-constexpr unsigned int kAhead = 8;    // places between a text that is compared and one on its way into the cache
-constexpr unsigned int kSearch = 16;  // so many times larger a set is searched, not walked
+constexpr unsigned int kAhead = 8;    // how many texts ahead of the current one are prefetched
+constexpr unsigned int kSearch = 16;  // a set that many times larger is searched, not walked
 
-// Asks for the text that stands kAhead places behind position i.
+// Prefetches the text kAhead positions after i.
 void FetchAhead(ZORString* const* places, unsigned int i, unsigned int count) {
   if (i + kAhead < count) __builtin_prefetch(places[i + kAhead]);
-}
-
-unsigned int CountIn(const ZORISVectorImp_String& texts, const ZORString& bound) {
-  ZORString* const* const places = &texts[0];
-  const auto less = [](const ZORString* listed, const ZORString& limit) { return *listed < limit; };
-  return static_cast<unsigned int>(std::lower_bound(places, places + texts.Count(), bound, less) - places);
 }
 
 }  // namespace
@@ -34,16 +28,14 @@ void TextSet::Reserve(unsigned int places) {
   if (places > mVector.Limit()) Require(mVector.Resize(places));
 }
 
-unsigned int TextSet::CountLess(const ZORString& bound) const { return CountIn(mVector, bound); }
-
 unsigned int TextSet::CountLessOrEqual(const ZORString& bound) const {
   ZORString* const* const places = &mVector[0];
   const auto less = [](const ZORString& limit, const ZORString* listed) { return limit < *listed; };
   return static_cast<unsigned int>(std::upper_bound(places, places + Count(), bound, less) - places);
 }
 
-// Our places move to the end of an array with room for all, and both runs are read from there into its front, which
-// never overtakes them.
+// Moves the own texts to the end of an array with room for all, then merges both runs into its front, which cannot
+// overtake them.
 bool TextSet::Merge(const ZORISVectorImp_String& texts, Equals equals) {
   const unsigned int own = Count(), more = texts.Count();
   const bool refuses = equals == Equals::Refused;
@@ -61,17 +53,16 @@ bool TextSet::Merge(const ZORISVectorImp_String& texts, Equals equals) {
     std::strong_ordering order = std::strong_ordering::greater;
     while (next != end && ((order = **next <=> text) < 0 || (order == 0 && !refuses))) *out++ = *next++;
     const bool listed = (next != end && order == 0) || (added != nullptr && *added == text);
-    if (listed && refuses) continue;
-    added = *out++ = new ZORString(text);
+    if (!listed || !refuses) added = *out++ = new ZORString(text);
   }
   while (next != end) *out++ = *next++;
   const auto count = static_cast<unsigned int>(out - places);
-  if (count > own) mVector.AddAt(places[count - 1], count - 1);  // where it stands, so that all up to it count
+  if (count > own) mVector.AddAt(places[count - 1], count - 1);  // already there: extends the elements up to it
   mVector.DetachAt(count, own + more - count, 0);
   return count == own + more;
 }
 
-// One walk, in which nothing is built: a text that is lost is deleted on the spot, those behind it move up.
+// One pass without allocation: a dropped text is deleted at once, and later ones move up.
 template <class Test>
 bool TextSet::KeepThose(Test test) {
   const unsigned int count = Count();
@@ -96,7 +87,7 @@ bool TextSet::Keep(const ZORISVectorImp_String& others) {
   unsigned int j = 0;
   return KeepThose([&](unsigned int i) {
     FetchAhead(places, i, count);
-    if (searches) j = std::max(j, CountIn(others, *places[i]));
+    if (searches) j = std::max(j, CountLess(others, *places[i]));
     std::strong_ordering order = std::strong_ordering::less;
     while (j < otherCount && (order = *places[i] <=> *others[j]) > 0) FetchAhead(&others[0], ++j, otherCount);
     const bool isListed = j < otherCount && order == 0;
@@ -107,10 +98,6 @@ bool TextSet::Keep(const ZORISVectorImp_String& others) {
 
 bool TextSet::Keep(const Marks& marks) {
   return marks.count() < Count() && KeepThose([&](unsigned int i) { return marks[i]; });
-}
-
-void TextSet::Cut(unsigned int first, unsigned int last) {
-  if (first < last) mVector.DetachAt(first, last - first, 1);
 }
 
 void TextSet::Mark(const ZORString& text, Marks& marks, unsigned int& next) const {

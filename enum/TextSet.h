@@ -1,4 +1,4 @@
-// The ordered texts behind a value of ZORVadEnumString. Not exported: programs see it as a member and never call it.
+// The ordered texts of a ZORVadEnumString. A member of an exported class, but not exported itself.
 #pragma once
 
 #include <algorithm>
@@ -13,15 +13,15 @@
 
 namespace zor {
 
-// Texts in ascending order, each an object of the set's own, counted from 0. Texts are copied in, or moved when they
-// are given away. Equal ones stand side by side where they were let in on purpose. The places grow by half, so that
-// building a large set stays linear. Memory that cannot be had ends the process: a lost text would be a wrong answer.
+// Texts in ascending order at positions from 0; the set owns them all. Inserting copies a text, or moves an rvalue.
+// Equal texts are adjacent, and only there when they were accepted. Capacity grows by half, so building a large set is
+// linear. Running out of memory ends the process: a lost text would be a wrong answer.
 class TextSet {
  public:
-  enum class Equals { Refused, Accepted };  // what becomes of a text that is listed already
+  enum class Equals { Refused, Accepted };  // whether a text that is present is inserted again
   using Marks = std::bitset<kSetLimit>;     // of positions
 
-  // Places for as many texts, up to the limit of a set.
+  // Reserves capacity for the expected texts, up to kSetLimit.
   explicit TextSet(std::size_t expected = kFew)
       : mVector(static_cast<unsigned int>(std::min(expected, kSetLimit)), kFew) {}
   ~TextSet() { Clear(); }
@@ -34,41 +34,43 @@ class TextSet {
   ZORString&   First     () const { return *mVector[0]; }
   ZORString&   Last      () const { return *mVector[Count() - 1]; }
 
-  // The same texts as a vector, and as pointers to walk over.
+  // The texts as a vector, and as a range of pointers.
   const ZORISVectorImp_String& Vector() const { return mVector; }
   std::span<const ZORString* const> All() const { return {&mVector[0], Count()}; }
 
-  // Positions, above Count() when there is none: see the vector. How many texts are less, and less or equal.
+  // Positions as the vector returns them, greater than Count() when there is none. The counts are of texts less than
+  // bound, and less than or equal to it.
   unsigned int Find            (const ZORString* text)  const { return mVector.Find(text); }
   unsigned int FindLowerBound  (const ZORString& text)  const { return mVector.FindLowerBound(&text, 0); }
   unsigned int FindUpperBound  (const ZORString& text)  const { return mVector.FindUpperBound(&text, 0); }
-  unsigned int CountLess       (const ZORString& bound) const;
+  unsigned int CountLess       (const ZORString& bound) const { return CountLess(mVector, bound); }
   unsigned int CountLessOrEqual(const ZORString& bound) const;
 
-  // Insert answers whether text came in; of equal ones it is the last. Merge inserts texts in order, and answers
-  // whether all of them came in.
+  // Insert returns whether text was inserted; it comes after its equals. Merge inserts ascending texts and returns
+  // whether all were inserted.
   template <class Text>
   bool Insert(Text&& text, Equals equals = Equals::Refused);
   bool Merge (const ZORISVectorImp_String& texts, Equals equals);
 
-  // Drop texts where they are: Keep those that are not among others, or not marked, and answers whether there were
-  // any; Cut those from position first up to last, not including it.
+  // Keep drops the texts that are not in others, ascending, or not marked, and returns whether it dropped any. Cut
+  // drops the positions [first, last).
   bool Keep (const ZORISVectorImp_String& others);
   bool Keep (const Marks& marks);
-  void Cut  (unsigned int first, unsigned int last);
+  void Cut  (unsigned int first, unsigned int last) { if (first < last) mVector.DetachAt(first, last - first, 1); }
   void Clear() { if (Count() > 0) mVector.Flush(1); }
   void Swap (TextSet& other) { mVector.Swap(other.mVector); }
 
-  // Candidates can be looked up one by one, and need not be built, when none of the texts is beyond the marks. Mark
-  // marks text, if it is listed; of equal texts the first. next is where the search begins, and goes on from there:
-  // candidates mostly come in order.
+  // Narrowing without building the candidates: Mark each, then Keep the marked texts. CanMark: neither side is too
+  // large for that. Mark marks text if it is present, the first of its equals; next is a hint that starts at 0 and
+  // makes ascending candidates cheap.
   bool CanMark(std::size_t candidates) const { return Count() > 0 && Count() <= kSetLimit && candidates <= kSetLimit; }
   void Mark   (const ZORString& text, Marks& marks, unsigned int& next) const;
   // clang-format on
 
  private:
-  static constexpr unsigned int kFew = 20;  // places of a new value, and the step in which a vector grows by itself
+  static constexpr unsigned int kFew = 20;  // initial capacity, and growth of the vector
 
+  static unsigned int CountLess(const ZORISVectorImp_String& texts, const ZORString& bound);
   template <class Test>
   bool KeepThose(Test test);
   void Reserve(unsigned int places);
@@ -79,6 +81,12 @@ class TextSet {
 
   ZORISVectorImp_String mVector;
 };
+
+inline unsigned int TextSet::CountLess(const ZORISVectorImp_String& texts, const ZORString& bound) {
+  ZORString* const* const places = &texts[0];
+  const auto less = [](const ZORString* listed, const ZORString& limit) { return *listed < limit; };
+  return static_cast<unsigned int>(std::lower_bound(places, places + texts.Count(), bound, less) - places);
+}
 
 // Texts mostly arrive in order, so the end is tried first.
 template <class Text>

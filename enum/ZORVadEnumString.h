@@ -1,4 +1,4 @@
-// A string variable that holds an ordered, finite set of the texts that are still possible.
+// The domain of a string variable as an ordered, finite set of texts.
 #pragma once
 
 #include "enum/TextSet.h"
@@ -7,40 +7,60 @@
 #include "single/ZORVadSingleString.h"
 #include "vector/ZORISVectorImp_String.h"
 
-// The state and, beside it, the listed texts in ascending order, each an object of this value's own.
-//   Exact  the texts, one or more. Min is the Exact value that lists "" alone; one space is an ordinary text here.
-//   Any    nothing is known; no texts.
+// A state and the listed texts in ascending order, all owned by the value.
+//   Exact  one text or more. Min is the Exact value that lists "" alone; one space is an ordinary text here.
+//   Any    Undefined; no texts.
 //   Nil    contradiction; no texts.
-//   Max    the texts and the greatest text, which the state holds. Without texts the value is full: the greatest
-//          and nothing else.
-// An Exact value never keeps an empty set: an operation that would leave one makes the value Nil.
+//   Max    the listed texts and the greatest text, which the state stands for. Without texts the value is full.
+// An operation that would leave an Exact value without texts makes it Nil.
 //
-// Texts are copied in and stay the caller's. Equal texts stand side by side only after InputValue and Read, and where
-// Insert or Append add to an Any or Nil value, which compares nothing. There is no limit on their length, and one of
-// 256 texts only where InsertExactValue is at work: the 257th turns the value into Any. Memory that cannot be had
-// ends the process, since a lost text would be a wrong answer.
+// Texts are copied in. Equal texts occur only after InputValue and Read, and where Insert or Append add to an Any or
+// Nil value, which they do without comparing. The number of texts is limited only in InsertExactValue,
+// CalcInverseLength and where candidates are built: kSetLimit. Running out of memory ends the process: a lost text
+// would be a wrong answer.
 //
-// An operation stands here in its typed forms, some with a single string as operand. Its entry in the solver's table
-// goes to the form that fits after these tests: an operand that is missing or fits no form changes nothing, 0 (Assign,
-// Intersect, Unite and Bisect make the value Nil); a Nil target stays, 0; a Nil source makes the target Nil; an
-// Undefined source tells nothing, 0. Operands may be one and the same object. Substring and text representation tell a
-// set nothing: both forms answer 0.
+// These are the typed forms, some of them with a single string. A virtual form calls the one that fits after these
+// checks: a missing or wrong operand changes nothing, 0, but makes *this Nil in Assign, Intersect, Unite and Bisect. In
+// orders, minimum, maximum, successor, case and concatenation a Nil target then stays Nil, a Nil source makes it Nil,
+// and an Undefined source changes nothing. Operands may be the same object. Unless stated otherwise an operation
+// returns 1 for a change, else 0.
 class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   ZOR_DECLARE_STRING_CLASS(ZORVadEnumString);
 
  public:
+  // Those without a typed form:
+  //   PrintOn, InputValue    Nil, Any, Max, Min, one text in double quotes, or { "a", "b" }, with the state Max
+  //                          { "a", Max }, which cannot be read; any other input gives Nil
+  //   Write, Read            the state, and the texts of an Exact value; broken input gives Nil
+  //   GetCardinality         Nil 0, Undefined 256, else Count()
+  //   IsIntersected          0 if either value is Nil, else 1 if either is Undefined, else whether *this lists a text
+  //                          of the other, or the other is Max for a full *this. The other may be a single value
+  //   Bisect                 changes nothing, except that a wrong operand or selection makes *this Nil
+  //   GetLowerBound          Nil: "". Any, Min: one space. Full: the greatest text. Else the first text
+  //   GetUpperBound          Nil: "". Min: one space. Any, Max: the greatest text. Else the last text
+  //   GetNextExactValue      the first text >= the argument; the argument itself if that is the last text or none
+  //   GetPrevExactValue      the last text <= the argument; the argument itself if that is the last text or none
+  //   SetExactValue          makes *this Exact with that text alone
+  //   InsertExactValue       adds the text and makes *this Exact; with 256 texts it becomes Any. Any and full stay
+  //   RemoveExactValue       drops the text; an Exact value without texts is Nil
+  //   SetLowerBound          drops the texts up to the bound and lists it; Nil and Any stay
+  //   SetUpperBound          drops the texts from the bound on and lists it; Max if it is the greatest text, else Exact
+  //   CalcLength             n becomes Nil or Undefined with *this, 1, else is intersected with the lengths
+  //   CalcInverseLength      keeps the texts whose length n allows, becomes Exact, 1; Nil if n is Nil or negative. An
+  //                          Undefined n changes nothing. With more than 256 texts left *this becomes Any
+  //   CalcStringRepresentation and its inverse narrow nothing, 0
   ZOR_DECLARE_STRING_OPERATIONS();
-  static ZORVadEnumString* Build(ZORStreamable* object);  // null: a new value for Read, or null without memory
+  static ZORVadEnumString* Build(ZORStreamable* object);  // stream factory; null when out of memory
 
   ZORVadEnumString();  // Any
   ZORVadEnumString(const ZORVadEnumString& other);
   ZORVadEnumString(const ZORVadSingleString& other);  // NOLINT(google-explicit-constructor)
   ZORVadEnumString(const ZORString& text);            // NOLINT(google-explicit-constructor)
-  ZORVadEnumString(const void* text);                 // NOLINT(google-explicit-constructor): zero-ended
+  ZORVadEnumString(const void* text);                 // NOLINT(google-explicit-constructor): zero-terminated
   explicit ZORVadEnumString(ZORStreamableInit);       // for Read
   ~ZORVadEnumString() override;
 
-  // Copies. Of a set Copy answers what Append does; of a single value that is Any, Nil or Max comes the state alone.
+  // Copy. A single value that is Any, Nil or Max gives its state alone. Copy of a set returns what Append does.
   // clang-format off
   ZORVadEnumString& operator=(const ZORVadEnumString& other);
   int Assign(const ZORVadEnumString& other);    // 1
@@ -48,23 +68,26 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   int Copy  (const ZORVadEnumString& other);
   int Copy  (const ZORVadSingleString& other);  // 1
 
-  // Membership. Contains: the position from 1 where the text is listed, 0 when it is not, -1 of a full value.
-  // Insert and Append leave the state; Append answers 1 when every text was new, for a set without texts 0.
+  // Membership. Contains: the position of text from 1, 0 when it is not listed, -1 for a full value. Insert and Append
+  // keep the state and return 1 if every text was new; Append of a set without texts returns 0. Cuts return Count().
   int        Contains(const ZORString& text) const;
   int        Contains(const ZORString* text) const;
   int        Insert  (const ZORString& text);
   int        Append  (const ZORVadEnumString& other);
   int        Append  (const ZORISVectorImp_String& texts);
   int        Count   () const;
-  ZORString& GetValue(int position) const;             // from 0, below Count(); still the value's
-  int        CutLower(const ZORString& bound);         // drops the texts below bound, answers Count()
-  int        CutUpper(const ZORString& bound);         // drops those above and, bound being below the greatest, the Max
+  ZORString& GetValue(int position) const;             // 0 <= position < Count(); owned by *this
+  int        CutLower(const ZORString& bound);         // drops the texts < bound
+  int        CutUpper(const ZORString& bound);         // drops the texts > bound, and Max if bound is less
 
-  // Set operations. Intersect keeps the texts that both list; the Max of a state takes no part. A single value
-  // leaves its text alone, or nothing. Bisect splits no set.
+  // Intersect, with CalcEqualValue, keeps the texts that both list, whatever the state Max; an Undefined *this copies
+  // other, and a full one becomes Nil unless other is Max. A single other that is listed becomes the only text, else
+  // *this is Nil; a Max single changes nothing. The inverse gives an Undefined single target the only text of *this,
+  // and makes a known one Nil unless it is listed.
+  // Unite adds the texts of other; an Undefined side makes *this Undefined. Bisect splits no set.
   int  Intersect            (const ZORVadEnumString& other);
   int  Intersect            (const ZORISVectorImp_String& texts);
-  int  Intersect            (const ZORVadSingleString& other);        // 1 also when the text was alone before
+  int  Intersect            (const ZORVadSingleString& other);        // 1 even if it was the only text
   int  IntersectInverse     (ZORVadSingleString& target) const;       // target
   int  CalcEqualValue       (const ZORVadEnumString& other);
   int  CalcEqualValue       (const ZORVadSingleString& other);
@@ -73,8 +96,10 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   void Unite                (const ZORVadEnumString& other);
   void Unite                (const ZORVadSingleString& other);
 
-  // Relations of *this, left, and x, right. The lesser side of <= is cut; the greater side is set to a bound, which is
-  // listed afterwards whether or not it was. The strict ones compare the greatest texts and cut nothing. Narrows:
+  // *this < x, <= x, >= x, > x. The lesser side of <= is cut to the upper bound of the other; the greater side gets
+  // the lower bound of the other as its own, listed even if it was not. Strict relations cut nothing: unless the upper
+  // bound of the lesser side is less, the target becomes Nil. A single x that gets a bound becomes that text; in the
+  // other inverses it is compared with the last text of *this, or the greatest of a full one, and becomes Nil.
   int CalcLessOrEqualValue             (const ZORVadEnumString& x);          // *this
   int CalcLessOrEqualValue             (const ZORVadSingleString& x);        // *this
   int CalcInverseLessOrEqualValue      (      ZORVadEnumString& x) const;    // x
@@ -88,8 +113,14 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   int CalcInverseNotLessAndUnequalValue(      ZORVadEnumString& x) const;    // x
   int CalcInverseNotLessAndUnequalValue(      ZORVadSingleString& x) const;  // x
 
-  // *this = min(x, y), max(x, y), the successor of x. The forward forms add to what a target lists, or replace it,
-  // and answer 1 without comparing. The inverses of minimum and maximum compare bounds.
+  // *this = min(x, y), max(x, y). Forward adds the texts of both operands to *this, cuts at the bound and returns 1; a
+  // Min or full operand decides alone. With an Undefined operand the minimum cuts *this to the other, the maximum makes
+  // it Undefined.
+  // Inverse: an Undefined x copies *this if y is Undefined or has the same upper (maximum: lower) bound; a known x
+  // becomes Nil if its bound and that of y rule *this out.
+  // *this = the successor of x. Replaces the target by the successors or predecessors and returns 1. A text without a
+  // successor is its own; "" has no predecessor. A full *this makes x Max with the text before the greatest, a Min one
+  // makes it Min.
   int CalcMinValue            (const ZORVadEnumString& x, const ZORVadEnumString& y);        // *this
   int CalcFirstInverseMinValue(      ZORVadEnumString& x, const ZORVadEnumString& y) const;  // x
   int CalcMaxValue            (const ZORVadEnumString& x, const ZORVadEnumString& y);        // *this
@@ -97,8 +128,8 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   int CalcNextValue           (const ZORVadEnumString& x);                                   // *this
   int CalcInverseNextValue    (      ZORVadEnumString& x) const;                             // x
 
-  // *this = x + y, over all pairs, met with what *this holds. More than 256 results tell nothing. The typed inverses
-  // answer 0; their entries pass a contradiction on.
+  // *this = x + y: keeps the texts that are a pair of x and y, an Undefined *this takes all pairs; more than kSetLimit
+  // results change nothing. A full operand makes *this full. The inverses and substrings narrow nothing, 0.
   int CalcConcatenation             (const ZORVadEnumString& x, const ZORVadEnumString& y);        // *this
   int CalcFirstInverseConcatenation (      ZORVadEnumString& x, const ZORVadEnumString& y) const;  // nothing
   int CalcSecondInverseConcatenation(const ZORVadEnumString& x,       ZORVadEnumString& y) const;  // nothing
@@ -107,8 +138,10 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   int CalcSecondInverseSubString(const ZORVadEnumString& x,       ZORVaDoInteger& start, const ZORVaDoInteger& end) const;  // nothing
   int CalcThirdInverseSubString (const ZORVadEnumString& x, const ZORVaDoInteger& start,       ZORVaDoInteger& end) const;  // nothing
 
-  // *this = lower or upper case of x: the folds, met with what *this holds; against a single x the first text of
-  // *this alone is compared. The inverses test x text by text and narrow nothing.
+  // *this = x in lower case, in upper case: keeps the texts that are a folded text of x, an Undefined *this takes them
+  // all. For a single x only the first text of *this is compared. The inverses only test x: text by text a known one
+  // must fold to *this, an Undefined one needs a folded text there; else x is Nil. A Min or full value goes with its
+  // like alone.
   int CalcLowerValue       (const ZORVadEnumString& x);          // *this
   int CalcLowerValue       (const ZORVadSingleString& x);        // *this
   int CalcInverseLowerValue(      ZORVadEnumString& x) const;    // x
@@ -126,12 +159,12 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
 
   explicit ZORVadEnumString(ZORStringStateTag state);
 
-  // Replace state and texts, 1.
+  // Replace state and texts; return 1.
   int Become(ZORStringStateTag state);
   int Become(ZORStringStateTag state, const ZORString& text);
   int Become(ZORStringStateTag state, Texts&& texts);
 
-  // Insert compares nothing while the value is open. Include is InsertExactValue.
+  // An Any or Nil value accepts equal texts.
   Texts::Equals OfEquals() const { return IsUndefined() || IsNil() ? Texts::Equals::Accepted : Texts::Equals::Refused; }
   bool CanMark(std::size_t candidates) const { return !IsUndefined() && mTexts.CanMark(candidates); }
   template <class Wanted>
@@ -147,7 +180,7 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   Texts mTexts;
 };
 
-// Keeps the texts that are wanted, a vector or marks; without a text the value is Nil.
+// Keeps the wanted texts, given by a vector or by marks; Nil if none is left.
 template <class Wanted>
 int ZORVadEnumString::Keep(const Wanted& wanted) {
   if (!mTexts.Keep(wanted)) return 0;

@@ -5,7 +5,7 @@
 
 namespace {
 
-// What Unite does with either class of x; add adds the texts of a known x to a known z.
+// Unite with either class of x; add adds the texts of a known x to a known z.
 template <class X, class Add>
 void UniteWith(ZORVadEnumString& z, const X& x, Add add) {
   if (z.IsUndefined()) return;
@@ -38,7 +38,7 @@ int ZORVadEnumString::Intersect(const ZORISVectorImp_String& texts) {
   return 1;
 }
 
-// The end of the operations that build candidates.
+// Intersects with candidates, which an operation has built.
 int ZORVadEnumString::Narrow(Texts&& candidates) {
   const bool some = candidates.Count() > 0;
   if (IsUndefined()) return Become(some ? ZorStringExact : ZorStringNil, std::move(candidates));
@@ -46,7 +46,7 @@ int ZORVadEnumString::Narrow(Texts&& candidates) {
   return Keep(candidates.Vector());
 }
 
-// Both tests of the single value's extremes stand before every look at the target's content.
+// An Undefined or Max operand returns before the content of *this is examined.
 int ZORVadEnumString::Intersect(const ZORVadSingleString& other) {
   if (IsNil()) return 0;
   if (other.IsNil()) return Nil();

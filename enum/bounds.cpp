@@ -17,7 +17,7 @@ ZORString ZORVadEnumString::GetUpperBound() const {
   return mTexts.Last();
 }
 
-// Neither looks at the state, and a listed text that is not the last answers itself.
+// Both ignore the state. A listed text that is not the last is its own neighbour.
 ZORString ZORVadEnumString::GetNextExactValue(const ZORString& text) const {
   const unsigned int position = mTexts.FindUpperBound(text);
   if (position > mTexts.Count()) return text;
@@ -28,7 +28,7 @@ ZORString ZORVadEnumString::GetNextExactValue(const ZORString& text) const {
 ZORString ZORVadEnumString::GetPrevExactValue(const ZORString& text) const {
   const unsigned int position = mTexts.FindLowerBound(text);
   if (position > mTexts.Count()) return text;
-  if (position == mTexts.Count() - 1) return text;  // the last here too, not the first
+  if (position == mTexts.Count() - 1) return text;  // the last, not the first, here too
   return mTexts[position];
 }
 
@@ -47,7 +47,7 @@ int ZORVadEnumString::CutUpper(const ZORString& bound) {
 
 void ZORVadEnumString::SetLowerBound(const ZORString& text) {
   if (IsNil() || IsUndefined()) return;
-  ZORString bound(text);  // before texts go: text may be one of them
+  ZORString bound(text);  // text may be one of those that Cut deletes
   mTexts.Cut(0, mTexts.CountLessOrEqual(bound));
   mTexts.Insert(std::move(bound));
 }

@@ -10,19 +10,20 @@ namespace {
 using zor::TextSet;
 using zor::View;
 
-// Marks the texts that are a head and a tail. Those that begin with one head stand together, in the order of what
-// follows it, so that one walk compares them with the tails. Of equal texts the first alone can be meant.
+// Marks the texts that are a head followed by a tail. Texts with the same head are adjacent and ordered by what follows
+// it, so one pass compares them with the tails. Of equal texts only the first is marked.
 TextSet::Marks MarkPairs(const TextSet& texts, const TextSet& heads, const TextSet& tails) {
+  const unsigned int count = texts.Count(), tailCount = tails.Count();
   TextSet::Marks marks;
   for (const ZORString* const first : heads.All()) {
     const std::string_view head = View(*first);
     unsigned int t = 0;
-    for (unsigned int i = texts.CountLess(*first); i < texts.Count(); ++i) {
+    for (unsigned int i = texts.CountLess(*first); i < count; ++i) {
       const std::string_view text = View(texts[i]);
       if (text.substr(0, head.size()) != head) break;
       const std::string_view rest = text.substr(head.size());
-      while (t < tails.Count() && View(tails[t]) < rest) ++t;
-      if (t == tails.Count()) break;
+      while (t < tailCount && View(tails[t]) < rest) ++t;
+      if (t == tailCount) break;
       if (View(tails[t]) == rest && (i == 0 || texts[i - 1] != texts[i])) marks.set(i);
     }
   }
@@ -40,7 +41,7 @@ int ZORVadEnumString::CalcConcatenation(const ZORVadEnumString& x, const ZORVadE
   Texts candidates(pairs);
   for (const ZORString* const head : x.mTexts.All()) {
     for (const ZORString* const tail : y.mTexts.All()) {
-      if (candidates.Count() == zor::kSetLimit) return 0;  // more than a set can hold tells nothing
+      if (candidates.Count() == zor::kSetLimit) return 0;  // too many results: nothing is narrowed
       candidates.Insert(ZORString::Concatenation(*head, *tail));
     }
   }
@@ -54,7 +55,7 @@ int ZORVadEnumString::CalcConcatenation(const ZORVaDoString& x, const ZORVaDoStr
   return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcConcatenation(a, b); });
 }
 
-// All that a set tells the parts of a concatenation is a contradiction.
+// The inverses pass on a contradiction and narrow nothing else.
 int ZORVadEnumString::CalcFirstInverseConcatenation(ZORVaDoString& x, const ZORVaDoString& y) const {
   return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcFirstInverseConcatenation(a, b); });
 }

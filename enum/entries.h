@@ -1,4 +1,4 @@
-// From an entry of the solver's table to a typed form on sets.
+// Entries of the virtual table of sets.
 #pragma once
 
 #include <type_traits>
@@ -8,8 +8,7 @@
 
 namespace zor {
 
-// The tests of states that the entries share: a Nil target stays Nil, a Nil source makes it Nil, an Undefined source
-// changes nothing.
+// Checks common to the entries: a Nil target stays Nil, a Nil source makes it Nil, an Undefined source changes nothing.
 template <class Target, class Body, class... Sources>
 int NarrowedFrom(Target& target, Body body, const Sources&... sources) {
   if (target.IsNil()) return 0;
@@ -18,8 +17,8 @@ int NarrowedFrom(Target& target, Body body, const Sources&... sources) {
   return body();
 }
 
-// Guarded, and then body behind those tests. A self that is not const is the target, its operands are the sources; of
-// a const self the operand that is not const is the target and self the source.
+// Guarded, then those checks, then body. A non-const self is the target and its operands are the sources; otherwise the
+// non-const operand is the target and self the source.
 template <class... Classes, class Self, class X, class Body>
 int Narrowed(Self& self, X& x, Body body) {
   return Guarded<Classes...>(x, [&](auto& a) {

@@ -8,8 +8,8 @@
 
 namespace {
 
-// The inverse of either extreme: bound is the end that decides, beyond tells on which side of y no extreme of x and y
-// can lie. Where all three share the bound nothing can be told.
+// The inverse of minimum and maximum. bound is the upper bound for the minimum, the lower for the maximum; beyond(a, b)
+// is then whether a > b, a < b.
 template <class Beyond>
 int TestChoice(const ZORVadEnumString& z, ZORVadEnumString& x, const ZORVadEnumString& y,
                ZORString (ZORVaDoString::*bound)() const, Beyond beyond) {
@@ -38,7 +38,7 @@ int ZORVadEnumString::CalcMaxValue(const ZORVadEnumString& x, const ZORVadEnumSt
   if (x.IsFull() || y.IsFull()) return CalcMaxValue();
   if (x.IsUndefined() || y.IsUndefined()) return Any();
   const ZORString bound = std::max(x.GetLowerBound(), y.GetLowerBound());
-  mState = ZorStringExact;  // what is listed stays
+  mState = ZorStringExact;  // keeps the listed texts
   Append(x);
   Append(y);
   SetLowerBound(bound);
@@ -53,7 +53,7 @@ int ZORVadEnumString::CalcMinValue(const ZORVadEnumString& x, const ZORVadEnumSt
   if (x.IsFull() && y.IsFull()) return CalcMaxValue();
   const bool cuts = !x.IsFull() && !y.IsFull();
   const ZORString bound = std::min(x.GetUpperBound(), y.GetUpperBound());
-  mState = ZorStringExact;  // what is listed stays, and a full operand adds nothing
+  mState = ZorStringExact;  // keeps the listed texts; a full operand adds none
   Append(x);
   Append(y);
   if (cuts) CutUpper(bound);
@@ -68,7 +68,7 @@ int ZORVadEnumString::CalcFirstInverseMinValue(ZORVadEnumString& x, const ZORVad
   return TestChoice(*this, x, y, &ZORVaDoString::GetUpperBound, std::greater());
 }
 
-// The target is replaced, not narrowed. A text without a successor stands for itself.
+// Replaces the target instead of narrowing it. A text without a successor is its own.
 int ZORVadEnumString::CalcNextValue(const ZORVadEnumString& x) {
   if (x.IsUndefined()) return 0;
   if (x.IsFull()) return CalcMaxValue();
@@ -78,7 +78,7 @@ int ZORVadEnumString::CalcNextValue(const ZORVadEnumString& x) {
   return Become(ZorStringExact, std::move(next));
 }
 
-// The greatest text has two predecessors, the text below it and itself. The empty text has none.
+// The greatest text has two predecessors, the text before it and itself; the empty text has none.
 int ZORVadEnumString::CalcInverseNextValue(ZORVadEnumString& x) const {
   if (IsUndefined()) return x.Any();
   if (IsNil()) return x.Nil();
@@ -100,7 +100,7 @@ int ZORVadEnumString::CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) {
   return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcMinValue(a, b); });
 }
 
-// A second operand of which nothing is known does not keep the result from telling something.
+// An Undefined second operand does not stop the inverses, which treat it as unconstrained.
 int ZORVadEnumString::CalcFirstInverseMaxValue(ZORVaDoAny& x, const ZORVaDoAny& y) const {
   return zor::Narrowed<Enum>(*this, x, y, [&](auto& a, auto& b) { return CalcFirstInverseMaxValue(a, b); });
 }

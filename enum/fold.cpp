@@ -29,7 +29,7 @@ bool HasFold(const ZORVadEnumString& z, Fold fold) {
   return false;
 }
 
-// Both values must be at the same extreme or at none. An Undefined x stays as long as some text could fold to ours.
+// Both values must be the same extreme, or neither be one. An Undefined x stays if some text of z is folded.
 template <class X>
 int TestFolds(const ZORVadEnumString& z, X& x, Fold fold) {
   if (z.IsUndefined()) return 0;
@@ -45,7 +45,7 @@ int TestFolds(const ZORVadEnumString& z, X& x, Fold fold) {
 
 }  // namespace
 
-// The extremes fold to themselves, whatever their text.
+// Min and Max fold to themselves, whatever their text.
 template <class X>
 int ZORVadEnumString::CalcFoldValue(const X& x, Fold fold) {
   if (IsNil()) return 0;
@@ -65,7 +65,7 @@ int ZORVadEnumString::MeetFolds(const Enum& x, Fold fold) {
   }
   Texts folds(x.mTexts.Count());
   for (const ZORString* const text : x.mTexts.All()) {
-    if (folds.Count() == zor::kSetLimit) return 0;  // more than a set can hold tells nothing
+    if (folds.Count() == zor::kSetLimit) return 0;  // too many results: nothing is narrowed
     folds.Insert(Folded(*text, fold));
   }
   return Narrow(std::move(folds));

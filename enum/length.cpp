@@ -15,7 +15,7 @@ int ZORVadEnumString::CalcLength(ZORVaDoInteger& n) const {
   return 0;
 }
 
-// Answers 1 also when no text is dropped. The Max of the state goes.
+// Returns 1 even if it drops no text. The state Max becomes Exact.
 int ZORVadEnumString::CalcInverseLength(const ZORVaDoInteger& n) {
   if (n.IsNil()) return Nil();
   if (n.IsUndefined() || IsNil() || IsUndefined()) return 0;

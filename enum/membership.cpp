@@ -1,4 +1,4 @@
-// Texts of sets one at a time, and many that are added.
+// Texts of sets: testing, adding and removing them.
 #include "enum/ZORVadEnumString.h"
 
 int ZORVadEnumString::Contains(const ZORString& text) const { return Contains(&text); }
@@ -31,7 +31,7 @@ ZORString& ZORVadEnumString::GetValue(int position) const { return mTexts[static
 
 void ZORVadEnumString::SetExactValue(const ZORString& text) { Become(ZorStringExact, text); }
 
-// The limit comes before the test for a listed text; larger sets take further texts.
+// At the limit a listed text makes the value Undefined, too; a set that is larger already takes more.
 void ZORVadEnumString::InsertExactValue(const ZORString& text) {
   if (IsUndefined() || IsFull()) return;
   if (mTexts.Count() == zor::kSetLimit) return SetUndefinedValue();

@@ -8,7 +8,7 @@ namespace {
 using Enum = ZORVadEnumString;
 using Single = ZORVadSingleString;
 
-// z <= x, cutting z: both classes of x answer the same questions.
+// z <= x, cutting z; x is of either class.
 template <class X>
 int CutToUpperBound(Enum& z, const X& x) {
   if (z.IsNil() || x.IsNil()) return z.Nil();
@@ -24,7 +24,7 @@ int CutToUpperBound(Enum& z, const X& x) {
   return 1;
 }
 
-// The same relation, narrowing x: it is set to the bound even when all its texts are less.
+// z <= x, narrowing x, which gets the bound as a text even if all its texts are less.
 template <class X>
 int RaiseToLowerBound(const Enum& z, X& x) {
   if (z.IsNil() || x.IsNil()) return x.Nil();
@@ -35,7 +35,7 @@ int RaiseToLowerBound(const Enum& z, X& x) {
   return 1;
 }
 
-// A single x against the last text that z lists; the Max of a set with texts does not count.
+// Compares a single x with the last text of z; the state Max counts only for a full z.
 template <class Fails>
 int TestAgainstLast(const Enum& z, Single& x, Fails fails) {
   if (x.IsUndefined()) return 0;
@@ -75,7 +75,7 @@ int ZORVadEnumString::CalcInverseNotLessAndUnequalValue(ZORVadSingleString& x) c
   return TestAgainstLast(*this, x, std::greater_equal());
 }
 
-// An order relation takes a single string where it has a form for one.
+// Entries accept a single string where there is a typed form for one.
 int ZORVadEnumString::CalcLessOrEqualValue(const ZORVaDoAny& x) {
   return zor::Narrowed<Enum, Single>(*this, x, [&](auto& a) { return CalcLessOrEqualValue(a); });
 }

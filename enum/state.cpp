@@ -1,4 +1,4 @@
-// What a set of texts is: its statics, construction, copies and states.
+// Statics, construction, copies and states of sets of texts.
 #include <utility>
 
 #include "enum/entries.h"
@@ -50,7 +50,7 @@ int ZORVadEnumString::Become(ZORStringStateTag state) {
 }
 
 int ZORVadEnumString::Become(ZORStringStateTag state, const ZORString& text) {
-  ZORString own(text);  // before the others go: text may be one of them
+  ZORString own(text);  // text may be one of those that are deleted
   Become(state);
   mTexts.Insert(std::move(own));
   return 1;

@@ -20,7 +20,7 @@ void ZORVadEnumString::InputValue(ZORistrstream& in) {
   InputSet(in);
 }
 
-// Texts in quotes with commas between them, up to the closing brace; in any order, and equal ones stay.
+// Quoted texts separated by commas, in any order, up to the closing brace. Equal texts are kept.
 void ZORVadEnumString::InputSet(ZORistrstream& in) {
   Become(ZorStringExact);
   char next = '\0';
@@ -43,7 +43,7 @@ void ZORVadEnumString::Write(ZORopstream& out) const {
   for (const ZORString* const text : mTexts.All()) out.WriteString(text->CastToCharPtr());
 }
 
-// A state that is none, an empty set and a text that is missing give Nil. Nothing is made for a count alone.
+// An unknown state, an empty set and a missing text give Nil. The stored count reserves nothing: it is not trusted.
 void ZORVadEnumString::Read(ZORipstream& in) {
   ZORLong state = ZorStringNil;
   in >> state;

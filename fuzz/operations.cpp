@@ -3,11 +3,13 @@
 // operands that coincide must count as what they were before.
 //
 // With ZOR_TRACE in the environment each operation is told, with what it answered and left.
+#include "module/operations.h"
 #include "fuzz/operands.h"
 
 namespace {
 
 using namespace zor::fuzz;
+using Shape = zor::Operation::Shape;
 
 // What an operation may do that others must not.
 enum Licence : unsigned {
@@ -24,6 +26,45 @@ enum Licence : unsigned {
 #define CALL(licence, Name, ...) \
   Make<__VA_ARGS__>(#Name "(" #__VA_ARGS__ ")", licence, [](auto& v, auto&&... x) { return v.Name(x...); })
 #define DO(licence, name, body, ...) Make<__VA_ARGS__>(name, licence, body)
+
+// Whether an operation may answer 1 for a target that stays as it was. A set takes a single value as its only text,
+// and replaces what the extremes and lengths narrow.
+constexpr unsigned LicenceOf(std::string_view name, Shape shape) {
+  if (shape == Shape::Form) return kRepeats | kAddsEquals;
+  if (shape == Shape::Length) return kSetRepeats;
+  if (shape == Shape::Alone) return kStrict;
+  for (const std::string_view repeating :
+       {"CalcEqualValue", "CalcMinValue", "CalcMaxValue", "CalcNextValue", "CalcInverseNextValue"})
+    if (name == repeating) return kSetRepeats;
+  return kStrict;
+}
+constexpr unsigned LicenceOfTyped(std::string_view name, Shape shape) {
+  return name == "Assign" ? kRepeats : name == "CalcEqualValue" ? kStrict : LicenceOf(name, shape);
+}
+
+// An operand as a form takes it: that of a text form must be there, and a typed form takes values of its own class.
+template <bool kGiven, class Operand>
+using Taken = std::conditional_t<kGiven, Given<std::remove_reference_t<Operand>>, Operand>;
+template <class Value, class Operand, bool kConst = std::is_const_v<std::remove_reference_t<Operand>>>
+using Typed = std::conditional_t<!std::is_base_of_v<std::remove_cvref_t<Operand>, Value>, Operand,
+                                 std::conditional_t<kConst, const Value&, Value&>>;
+
+template <Shape kShape, class Self, class... Operands, class Body>
+constexpr Operation MakeEntry(const char* name, unsigned licence, Body body) {
+  return Make<Self, Taken<kShape == Shape::Form, Operands>...>(name, licence, body);
+}
+
+template <class Value, class... Operands, class Body>
+constexpr Operation MakeTyped(const char* name, unsigned licence, Body body) {
+  return Make<Typed<Value, Operands>...>(name, licence, body);
+}
+
+#define ENTRY(shape, Name, ...)                                                                    \
+  MakeEntry<Shape::shape, __VA_ARGS__>(#Name "(" #__VA_ARGS__ ")", LicenceOf(#Name, Shape::shape), \
+                                       [](auto& v, auto&&... x) { return v.Name(x...); }),
+#define TYPED(shape, Name, ...)                                                      \
+  MakeTyped<Value, __VA_ARGS__>("typed " #Name, LicenceOfTyped(#Name, Shape::shape), \
+                                [](auto& v, auto&&... x) { return v.Name(x...); }),
 
 // The entries of the solver's table: those that all values have are called on all, the rest on strings.
 constexpr Operation kEntries[] = {
@@ -42,34 +83,8 @@ constexpr Operation kEntries[] = {
     CALL(kStrict, GetNextExactValue, const String&, const Text&), CALL(kStrict, GetPrevExactValue, const String&, const Text&),
     CALL(kStrict, SetExactValue, String&, const Text&), CALL(kStrict, InsertExactValue, String&, const Text&), CALL(kStrict, RemoveExactValue, String&, const Text&),
 
-    CALL(kStrict, Assign, Any&, const Any&), CALL(kStrict, Intersect, Any&, const Any&), CALL(kStrict, Unite, Any&, const Any&),
-    CALL(kStrict, IsIntersected, const Any&, const Any&),
     DO(kStrict, "Bisect", [](String& v, Any& x, int selection) { v.Bisect(x, static_cast<Any::ValueSelection>(selection % 6)); }, String&, Any&, int),
-    CALL(kSetRepeats, CalcEqualValue, Any&, const Any&), CALL(kStrict, CalcInverseEqualValue, const Any&, Any&),
-    CALL(kStrict, CalcUnequalValue, Any&, const Any&), CALL(kStrict, CalcInverseUnequalValue, const Any&, Any&),
-    CALL(kStrict, CalcIsEqual, const Any&, const Any&, Given<Boolean>), CALL(kStrict, CalcIsLessOrEqual, const Any&, const Any&, Given<Boolean>),
-    CALL(kStrict, CalcIsLess, const Scalar&, const Scalar&, Given<Boolean>),
-
-    CALL(kStrict, CalcLessOrEqualValue, Any&, const Any&), CALL(kStrict, CalcInverseLessOrEqualValue, const Any&, Any&),
-    CALL(kStrict, CalcNotLessAndUnequalValue, Any&, const Any&), CALL(kStrict, CalcInverseNotLessAndUnequalValue, const Any&, Any&),
-    CALL(kStrict, CalcLessValue, Scalar&, const Scalar&), CALL(kStrict, CalcInverseLessValue, const Scalar&, Scalar&),
-    CALL(kStrict, CalcNotLessValue, Scalar&, const Scalar&), CALL(kStrict, CalcInverseNotLessValue, const Scalar&, Scalar&),
-
-    CALL(kStrict, CalcMinValue, Any&), CALL(kStrict, CalcMaxValue, Any&), CALL(kStrict, CalcEmptyValue, String&), CALL(kStrict, CalcFullValue, String&),
-    CALL(kSetRepeats, CalcMinValue, Any&, const Any&, const Any&), CALL(kStrict, CalcFirstInverseMinValue, const Any&, Any&, const Any&),
-    CALL(kSetRepeats, CalcMaxValue, Any&, const Any&, const Any&), CALL(kStrict, CalcFirstInverseMaxValue, const Any&, Any&, const Any&),
-    CALL(kSetRepeats, CalcNextValue, Scalar&, const Scalar&), CALL(kSetRepeats, CalcInverseNextValue, const Scalar&, Scalar&),
-
-    CALL(kSetRepeats, CalcLength, const String&, Given<Integer>), CALL(kSetRepeats, CalcInverseLength, String&, Given<const Integer>),
-    CALL(kRepeats, CalcStringRepresentation, String&, Given<const Any>), CALL(kRepeats | kAddsEquals, CalcInverseStringRepresentation, const String&, Given<Any>),
-    CALL(kStrict, CalcLowerValue, String&, const String&), CALL(kStrict, CalcInverseLowerValue, const String&, String&),
-    CALL(kStrict, CalcUpperValue, String&, const String&), CALL(kStrict, CalcInverseUpperValue, const String&, String&),
-    CALL(kStrict, CalcConcatenation, String&, const String&, const String&),
-    CALL(kStrict, CalcFirstInverseConcatenation, const String&, String&, const String&), CALL(kStrict, CalcSecondInverseConcatenation, const String&, const String&, String&),
-    CALL(kStrict, CalcSubString, String&, const String&, Given<const Integer>, Given<const Integer>),
-    CALL(kStrict, CalcFirstInverseSubString, const String&, String&, Given<const Integer>, Given<const Integer>),
-    CALL(kStrict, CalcSecondInverseSubString, const String&, const String&, Given<Integer>, Given<const Integer>),
-    CALL(kStrict, CalcThirdInverseSubString, const String&, const String&, Given<const Integer>, Given<Integer>),
+    ZOR_STRING_OPERATIONS(ENTRY)
     // clang-format on
 };
 
@@ -101,28 +116,9 @@ constexpr Operation kForms[] = {
     DO(kStrict, "copy", [](Value& v, const Value& x) { Value copy(x); v = copy; }, Value&, const Value&),
     DO(kStrict, "from characters", [](Value& v, Text x) { v = Value(static_cast<const void*>(x.CastToCharPtr())); }, Value&, const Text&),
     DO(kStrict, "operator=", [](Value& v, const Value& x) { v = x; }, Value&, const Value&),
-    CALL(kRepeats, Assign, Value&, const Value&), CALL(kTellsOther, Copy, Value&, const Value&),
-    CALL(kStrict, Nil, Value&), CALL(kStrict, Any, Value&),
+    CALL(kTellsOther, Copy, Value&, const Value&), CALL(kStrict, Nil, Value&), CALL(kStrict, Any, Value&),
     CALL(kStrict, SetLowerBound, Value&, const Text&), CALL(kStrict, SetUpperBound, Value&, const Text&),
-    CALL(kStrict, Intersect, Value&, const Value&), CALL(kStrict, CalcEqualValue, Value&, const Value&), CALL(kStrict, Unite, Value&, const Value&),
-
-    CALL(kStrict, CalcLessValue, Value&, const Value&), CALL(kStrict, CalcInverseLessValue, const Value&, Value&),
-    CALL(kStrict, CalcLessOrEqualValue, Value&, const Value&), CALL(kStrict, CalcInverseLessOrEqualValue, const Value&, Value&),
-    CALL(kStrict, CalcNotLessValue, Value&, const Value&), CALL(kStrict, CalcInverseNotLessValue, const Value&, Value&),
-    CALL(kStrict, CalcNotLessAndUnequalValue, Value&, const Value&), CALL(kStrict, CalcInverseNotLessAndUnequalValue, const Value&, Value&),
-
-    CALL(kSetRepeats, CalcMinValue, Value&, const Value&, const Value&), CALL(kStrict, CalcFirstInverseMinValue, const Value&, Value&, const Value&),
-    CALL(kSetRepeats, CalcMaxValue, Value&, const Value&, const Value&), CALL(kStrict, CalcFirstInverseMaxValue, const Value&, Value&, const Value&),
-    CALL(kSetRepeats, CalcNextValue, Value&, const Value&), CALL(kSetRepeats, CalcInverseNextValue, const Value&, Value&),
-
-    CALL(kStrict, CalcLowerValue, Value&, const Value&), CALL(kStrict, CalcInverseLowerValue, const Value&, Value&),
-    CALL(kStrict, CalcUpperValue, Value&, const Value&), CALL(kStrict, CalcInverseUpperValue, const Value&, Value&),
-    CALL(kStrict, CalcConcatenation, Value&, const Value&, const Value&),
-    CALL(kStrict, CalcFirstInverseConcatenation, const Value&, Value&, const Value&), CALL(kStrict, CalcSecondInverseConcatenation, const Value&, const Value&, Value&),
-    CALL(kStrict, CalcSubString, Value&, const Value&, Given<const Integer>, Given<const Integer>),
-    CALL(kStrict, CalcFirstInverseSubString, const Value&, Value&, Given<const Integer>, Given<const Integer>),
-    CALL(kStrict, CalcSecondInverseSubString, const Value&, const Value&, Given<Integer>, Given<const Integer>),
-    CALL(kStrict, CalcThirdInverseSubString, const Value&, const Value&, Given<const Integer>, Given<Integer>),
+    ZOR_STRING_OPERATIONS(TYPED)
     // clang-format on
 };
 
@@ -139,7 +135,7 @@ constexpr Operation kOwnForms[] = {
     CALL(kAddsToOpen, Insert, Set&, const Text&), CALL(kTellsOther | kAddsToOpen, Append, Set&, const Set&), CALL(kTellsOther | kAddsToOpen, Append, Set&, const Vector&),
     CALL(kTellsOther, CutLower, Set&, const Text&), CALL(kTellsOther, CutUpper, Set&, const Text&),
     CALL(kStrict | kAddsEquals, Intersect, Set&, const Vector&), CALL(kRepeats, Intersect, Set&, const Single&), CALL(kStrict, IntersectInverse, const Set&, Single&),
-    CALL(kRepeats, CalcEqualValue, Set&, const Single&), CALL(kStrict, CalcInverseEqualValue, const Set&, Single&), CALL(kStrict, CalcInverseEqualValue, const Set&, Set&),
+    CALL(kRepeats, CalcEqualValue, Set&, const Single&), CALL(kStrict, CalcInverseEqualValue, const Set&, Single&),
     CALL(kStrict, Unite, Set&, const Single&),
     CALL(kStrict, CalcLessOrEqualValue, Set&, const Single&), CALL(kStrict, CalcInverseLessOrEqualValue, const Set&, Single&),
     CALL(kStrict, CalcInverseNotLessValue, const Set&, Single&), CALL(kStrict, CalcInverseNotLessAndUnequalValue, const Set&, Single&),

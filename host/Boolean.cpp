@@ -1,4 +1,4 @@
-// Truth values are few enough to try them all: an operation keeps the truths that have partners in its relation.
+// There are two truth values, so an operation tries them all and keeps those with a support in its relation.
 #include "host/Guard.h"
 #include "host/NumberText.h"
 #include "host/ZORNumbers.h"
@@ -13,7 +13,7 @@ int Guarded(Args&&... args) {
   return zor::Guarded<ZORVadSingleBoolean>(args...);
 }
 
-// Sets of truths: bit 0 for false, bit 1 for true.
+// A set of truth values: bit 0 is false, bit 1 is true.
 template <class Test>
 unsigned Where(Test test) {
   return (test(false) ? 1u : 0u) | (test(true) ? 2u : 0u);
@@ -25,20 +25,20 @@ bool Some(unsigned truths, Test test) {
 }
 
 template <class Relation>
-unsigned Partners(unsigned x, Relation holds) {
+unsigned Supported(unsigned x, Relation holds) {
   return Where([&](bool a) { return Some(x, [&](bool b) { return holds(a, b); }); });
 }
 
 template <class Relation>
-unsigned Partners(unsigned x, unsigned y, Relation holds) {
+unsigned Supported(unsigned x, unsigned y, Relation holds) {
   return Where(
       [&](bool a) { return Some(x, [&](bool b) { return Some(y, [&](bool c) { return holds(a, b, c); }); }); });
 }
 
 template <class Relation>
 int CalcRelation(unsigned x, unsigned y, ZORVaDoBoolean& result, Relation holds) {
-  const bool canBeFalse = (x & Partners(y, [&](bool a, bool b) { return !holds(a, b); })) != 0;
-  const bool canBeTrue = (x & Partners(y, holds)) != 0;
+  const bool canBeFalse = (x & Supported(y, [&](bool a, bool b) { return !holds(a, b); })) != 0;
+  const bool canBeTrue = (x & Supported(y, holds)) != 0;
   return result.CalcOutcome(canBeFalse, canBeTrue);
 }
 
@@ -113,58 +113,58 @@ int ZORVadSingleBoolean::CalcMaxValue() { return CalcTrueValue(); }
 
 int ZORVadSingleBoolean::CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) {
   return Guarded(x, y, [&](auto& p, auto& q) {
-    return Keep(Partners(p.mTruths, q.mTruths, [](bool a, bool b, bool c) { return a == (b && c); }));
+    return Keep(Supported(p.mTruths, q.mTruths, [](bool a, bool b, bool c) { return a == (b && c); }));
   });
 }
 
 int ZORVadSingleBoolean::CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) {
   return Guarded(x, y, [&](auto& p, auto& q) {
-    return Keep(Partners(p.mTruths, q.mTruths, [](bool a, bool b, bool c) { return a == (b || c); }));
+    return Keep(Supported(p.mTruths, q.mTruths, [](bool a, bool b, bool c) { return a == (b || c); }));
   });
 }
 
 int ZORVadSingleBoolean::CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const {
   return Guarded(target, second, [&](auto& p, auto& q) {
-    return p.Keep(Partners(mTruths, q.mTruths, [](bool a, bool b, bool c) { return b == (a && c); }));
+    return p.Keep(Supported(mTruths, q.mTruths, [](bool a, bool b, bool c) { return b == (a && c); }));
   });
 }
 
 int ZORVadSingleBoolean::CalcFirstInverseMaxValue(ZORVaDoAny& target, const ZORVaDoAny& second) const {
   return Guarded(target, second, [&](auto& p, auto& q) {
-    return p.Keep(Partners(mTruths, q.mTruths, [](bool a, bool b, bool c) { return b == (a || c); }));
+    return p.Keep(Supported(mTruths, q.mTruths, [](bool a, bool b, bool c) { return b == (a || c); }));
   });
 }
 
 int ZORVadSingleBoolean::CalcEqualValue(const ZORVaDoAny& other) {
-  return Guarded(other, [&](auto& y) { return Keep(Partners(y.mTruths, Equal)); });
+  return Guarded(other, [&](auto& y) { return Keep(Supported(y.mTruths, Equal)); });
 }
 
 int ZORVadSingleBoolean::CalcInverseEqualValue(ZORVaDoAny& target) const {
-  return Guarded(target, [&](auto& y) { return y.Keep(Partners(mTruths, Equal)); });
+  return Guarded(target, [&](auto& y) { return y.Keep(Supported(mTruths, Equal)); });
 }
 
 int ZORVadSingleBoolean::CalcUnequalValue(const ZORVaDoAny& other) {
-  return Guarded(other, [&](auto& y) { return Keep(Partners(y.mTruths, Unequal)); });
+  return Guarded(other, [&](auto& y) { return Keep(Supported(y.mTruths, Unequal)); });
 }
 
 int ZORVadSingleBoolean::CalcInverseUnequalValue(ZORVaDoAny& target) const {
-  return Guarded(target, [&](auto& y) { return y.Keep(Partners(mTruths, Unequal)); });
+  return Guarded(target, [&](auto& y) { return y.Keep(Supported(mTruths, Unequal)); });
 }
 
 int ZORVadSingleBoolean::CalcLessOrEqualValue(const ZORVaDoAny& other) {
-  return Guarded(other, [&](auto& y) { return Keep(Partners(y.mTruths, LessOrEqual)); });
+  return Guarded(other, [&](auto& y) { return Keep(Supported(y.mTruths, LessOrEqual)); });
 }
 
 int ZORVadSingleBoolean::CalcInverseLessOrEqualValue(ZORVaDoAny& target) const {
-  return Guarded(target, [&](auto& y) { return y.Keep(Partners(mTruths, GreaterOrEqual)); });
+  return Guarded(target, [&](auto& y) { return y.Keep(Supported(mTruths, GreaterOrEqual)); });
 }
 
 int ZORVadSingleBoolean::CalcNotLessAndUnequalValue(const ZORVaDoAny& other) {
-  return Guarded(other, [&](auto& y) { return Keep(Partners(y.mTruths, Greater)); });
+  return Guarded(other, [&](auto& y) { return Keep(Supported(y.mTruths, Greater)); });
 }
 
 int ZORVadSingleBoolean::CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const {
-  return Guarded(target, [&](auto& y) { return y.Keep(Partners(mTruths, Less)); });
+  return Guarded(target, [&](auto& y) { return y.Keep(Supported(mTruths, Less)); });
 }
 
 int ZORVadSingleBoolean::CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const {

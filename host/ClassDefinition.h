@@ -1,4 +1,4 @@
-// Definitions that the solver's classes have alike, in the host and in its modules.
+// Definitions that classes of the host and of modules have in common.
 #pragma once
 
 #include <new>
@@ -8,13 +8,13 @@
 
 namespace zor {
 
-// The factory scheme of the stream layer: an object given is answered, for a null one a new one is made for Read.
+// Stream factory: returns object, or for null a new object for Read to fill.
 template <class Class>
 ZORStreamable* BuildForRead(ZORStreamable* object) {
   return object != nullptr ? object : new Class(ZorStreamableInit);
 }
 
-// A value in the caller's memory; null for a null place and for a class that cannot be made.
+// Constructs a value in the caller's memory; null for a null place and for an abstract class.
 template <class Class, class... From>
 ZORVaDoObject* CreateAt(void* place, From... from) {
   if constexpr (std::is_abstract_v<Class>) {
@@ -26,7 +26,7 @@ ZORVaDoObject* CreateAt(void* place, From... from) {
 
 }  // namespace zor
 
-// A type is told by the address of its sIdent, or by that of a type it derives from.
+// Types are identified by the address of sIdent, their own or that of a base.
 #define ZOR_DEFINE_DERIVATION(Class, Base)                                                                    \
   int Class::IsDerivedFrom(const char* ident) const { return ident == sIdent || Base::IsDerivedFrom(ident); } \
   static_assert(true)

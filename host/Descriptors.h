@@ -1,4 +1,4 @@
-// The descriptors of the host's own types.
+// Descriptors of the host's types.
 #pragma once
 
 #include <cstddef>
@@ -7,8 +7,8 @@
 
 namespace zorhost {
 
-// The maker of Value, known to the streams as ident. A known value is read from its text form. The descriptors of
-// the host are static objects, which no module owns.
+// Makes values of one class; ident is its name in streams. A value with content is read from its text form. Descriptors
+// of the host are static objects and owned by no module.
 template <class Value, const char* ident>
 class HostDescriptor final : public ZORVaDoObjectDescriptor {
  public:
@@ -27,7 +27,7 @@ class HostDescriptor final : public ZORVaDoObjectDescriptor {
   std::size_t GetObjectSize() const override { return sizeof(Value); }
 };
 
-// Hands module the types of numbers.
+// Registers the number types with module.
 void AddNumberDescriptors(ZORVaDoModule& module);
 
 }  // namespace zorhost

@@ -64,7 +64,7 @@ int ZORVadEnumInteger::Keep(const ZORIntegerSet& allowed) {
   return changed;
 }
 
-// All numbers become the allowed ones, if these are few enough to be listed.
+// Undefined becomes the allowed numbers, if the list can hold them.
 int ZORVadEnumInteger::List(const ZORIntegerSet& allowed) {
   ZORSVectorImp_SubIntBase listed;
   for (std::int64_t value = ZORIntegerSet::kLeast;; ++value) {

@@ -1,23 +1,22 @@
-// The guarded entry of an operation. The solver passes values of any class, and null references where an operand is
-// missing; an entry tests its operands, first to last, and goes on to the typed body.
+// Argument checks of virtual operations. The solver passes operands of any class, and null references for missing ones;
+// an entry checks its operands in order and calls the typed body.
 #pragma once
 
 #include "host/ZORSolver.h"
 
 namespace zor {
 
-// Whether the reference refers to anything. The compilers keep this test only under -fno-delete-null-pointer-checks.
+// Whether the reference is not null. Compilers keep this test only with -fno-delete-null-pointer-checks.
 inline bool IsPresent(const ZORVaDoBase& value) {
   const ZORVaDoBase* const address = &value;
   return address != nullptr;
 }
 
-// The state of an operand of any class; a missing one has none.
+// The state of an operand of any class; false for a missing one.
 inline bool IsNil(const ZORVaDoAny& value) { return IsPresent(value) && value.IsNil() != 0; }
 inline bool IsUndefined(const ZORVaDoAny& value) { return IsPresent(value) && value.IsUndefined() != 0; }
 
-// Answers what body answers on value as the first of the classes that it is of, and what otherwise answers when value
-// is missing or of none of them.
+// Calls body on value as the first of the classes it belongs to, or otherwise when it is missing or belongs to none.
 template <class Class, class... More, class Arg, class Otherwise, class Body>
 int GuardedElse(Arg& value, Otherwise otherwise, Body body) {
   if (auto* const typed = Class::DynamicCast(&value)) return body(*typed);
@@ -28,14 +27,14 @@ int GuardedElse(Arg& value, Otherwise otherwise, Body body) {
   }
 }
 
-// The same where an operand that does not fit makes target Nil.
+// The same; a missing or wrong operand makes target Nil.
 template <class... Classes, class Target, class Arg, class Body>
 int GuardedOrNil(Target& target, Arg& value, Body body) {
   const auto nil = [&] { return target.Nil(); };
   return GuardedElse<Classes...>(value, nil, body);
 }
 
-// The same where it changes nothing, 0.
+// The same; a missing or wrong operand changes nothing, 0.
 template <class... Classes, class X, class Body>
 int Guarded(X& x, Body body) {
   const auto unchanged = [] { return 0; };
@@ -43,7 +42,7 @@ int Guarded(X& x, Body body) {
 }
 
 template <class... Classes, class X, class Y, class Body>
-int Guarded(X& x, Y& y, Body body) {  // x is tested before y
+int Guarded(X& x, Y& y, Body body) {  // checks x first
   return Guarded<Classes...>(x, [&](auto& a) { return Guarded<Classes...>(y, [&](auto& b) { return body(a, b); }); });
 }
 

@@ -1,4 +1,4 @@
-// What all integers do alike: each operation says which numbers its relation allows and keeps those.
+// Operations common to all integers: each computes the numbers that its relation allows and keeps those.
 #include "host/Guard.h"
 #include "host/IntegerSet.h"
 #include "host/NumberText.h"
@@ -26,20 +26,20 @@ int Guarded(Args&&... args) {
 
 bool IsExact(const ZORVaDoInteger& x) { return Lower(x) == Upper(x); }
 
-// Whether some number of x lies below some number of y by that distance or more.
-bool CanBeBelow(const ZORVaDoInteger& x, const ZORVaDoInteger& y, int distance) {
+// Whether a + distance <= b for some a in x and b in y.
+bool CanBeLess(const ZORVaDoInteger& x, const ZORVaDoInteger& y, int distance) {
   return Lower(x) + distance <= Upper(y);
 }
 
-// The numbers that lie below or above some number of x by that distance or more.
-Range Below(const ZORVaDoInteger& x, int distance) {
+// The numbers less, greater than some number of x by distance or more.
+Range LessThan(const ZORVaDoInteger& x, int distance) {
   return {kLeast, x.IsUndefined() != 0 ? kGreatest : Upper(x) - distance};
 }
-Range Above(const ZORVaDoInteger& x, int distance) {
+Range GreaterThan(const ZORVaDoInteger& x, int distance) {
   return {x.IsUndefined() != 0 ? kLeast : Lower(x) + distance, kGreatest};
 }
 
-// The least and the greatest number that both have; one above or below all numbers when there is none.
+// The least and the greatest common number; beyond the 32-bit range when there is none.
 std::int64_t LeastCommon(const ZORVaDoInteger& x, const ZORVaDoInteger& y) {
   std::int64_t value = Lower(x);
   while (value <= kGreatest && y.FindAtLeast(value) != value) value = x.FindAtLeast(y.FindAtLeast(value));
@@ -126,35 +126,35 @@ int ZORVaDoInteger::CalcInverseUnequalValue(ZORVaDoAny& target) const {
 
 int ZORVaDoInteger::CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const {
   return Guarded(other, [&](auto& y) {
-    return result.CalcOutcome(CanBeBelow(*this, y, 1) || CanBeBelow(y, *this, 1), IsIntersected(y) != 0);
+    return result.CalcOutcome(CanBeLess(*this, y, 1) || CanBeLess(y, *this, 1), IsIntersected(y) != 0);
   });
 }
 
 int ZORVaDoInteger::CalcIsLessOrEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const {
-  return Guarded(other, [&](auto& y) { return result.CalcOutcome(CanBeBelow(y, *this, 1), CanBeBelow(*this, y, 0)); });
+  return Guarded(other, [&](auto& y) { return result.CalcOutcome(CanBeLess(y, *this, 1), CanBeLess(*this, y, 0)); });
 }
 
 int ZORVaDoInteger::CalcIsLess(const ZORVaDoScalar& other, ZORVaDoBoolean& result) const {
-  return Guarded(other, [&](auto& y) { return result.CalcOutcome(CanBeBelow(y, *this, 0), CanBeBelow(*this, y, 1)); });
+  return Guarded(other, [&](auto& y) { return result.CalcOutcome(CanBeLess(y, *this, 0), CanBeLess(*this, y, 1)); });
 }
 
 int ZORVaDoInteger::CalcLessValue(const ZORVaDoScalar& other) {
-  return Guarded(other, [&](auto& y) { return Keep(Below(y, 1)); });
+  return Guarded(other, [&](auto& y) { return Keep(LessThan(y, 1)); });
 }
 
 int ZORVaDoInteger::CalcLessOrEqualValue(const ZORVaDoAny& other) {
-  return Guarded(other, [&](auto& y) { return Keep(Below(y, 0)); });
+  return Guarded(other, [&](auto& y) { return Keep(LessThan(y, 0)); });
 }
 
 int ZORVaDoInteger::CalcNotLessValue(const ZORVaDoScalar& other) {
-  return Guarded(other, [&](auto& y) { return Keep(Above(y, 0)); });
+  return Guarded(other, [&](auto& y) { return Keep(GreaterThan(y, 0)); });
 }
 
 int ZORVaDoInteger::CalcNotLessAndUnequalValue(const ZORVaDoAny& other) {
-  return Guarded(other, [&](auto& y) { return Keep(Above(y, 1)); });
+  return Guarded(other, [&](auto& y) { return Keep(GreaterThan(y, 1)); });
 }
 
-// The inverse of a relation is the mirrored relation, called on the other side.
+// The inverse of a relation is its mirror image, called on the other operand.
 int ZORVaDoInteger::CalcInverseLessValue(ZORVaDoScalar& target) const {
   return Guarded(target, [&](auto& y) { return y.CalcNotLessAndUnequalValue(*this); });
 }
@@ -184,7 +184,7 @@ int ZORVaDoInteger::CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) {
       x, y, [&](auto& a, auto& b) { return Keep(Union(Part(a, Lower(b), kGreatest), Part(b, Lower(a), kGreatest))); });
 }
 
-// Either target is the minimum itself, or second is and target lies at it or above.
+// Either target is the minimum, or second is and target is not less.
 int ZORVaDoInteger::CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const {
   return Guarded(target, second, [&](auto& x, auto& y) {
     return x.Keep(Union(Part(*this, kLeast, Upper(y)), Range(LeastCommon(*this, y), kGreatest)));

@@ -1,5 +1,5 @@
-// Sets of integers that are asked, not stored: what a relation allows, given its operands. They look at their
-// operands while they live and hold no copy.
+// Sets of integers that are computed, not stored: what a relation allows, given its operands. They refer to their
+// operands, which must outlive them.
 #pragma once
 
 #include <algorithm>
@@ -8,8 +8,8 @@
 
 #include "host/ZORNumbers.h"
 
-// FindAtLeast and FindAtMost as in ZORVaDoInteger. The numbers are 32 bits wide, the answers wider, so that a step
-// beyond the ends cannot wrap.
+// FindAtLeast and FindAtMost as in ZORVaDoInteger. Numbers have 32 bits and results 64, so that a step beyond the ends
+// cannot overflow.
 class ZORIntegerSet {
  public:
   static constexpr std::int64_t kLeast = std::numeric_limits<ZORLong>::min();
@@ -27,7 +27,7 @@ class ZORIntegerSet {
 
 namespace zorhost {
 
-// All from lower to upper.
+// The numbers from lower to upper.
 class Range final : public ZORIntegerSet {
  public:
   constexpr Range(std::int64_t lower, std::int64_t upper) : mLower(lower), mUpper(upper) {}
@@ -42,7 +42,7 @@ class Range final : public ZORIntegerSet {
   std::int64_t mLower, mUpper;
 };
 
-// All but one.
+// All numbers but one.
 class AllBut final : public ZORIntegerSet {
  public:
   explicit AllBut(std::int64_t value) : mValue(value) {}
@@ -53,7 +53,7 @@ class AllBut final : public ZORIntegerSet {
   std::int64_t mValue;
 };
 
-// The numbers of an integer, each moved by a distance.
+// The numbers of a domain, shifted by a distance.
 class Numbers final : public ZORIntegerSet {
  public:
   explicit Numbers(const ZORVaDoInteger& integer, std::int64_t distance = 0) : mInteger(integer), mDistance(distance) {}
@@ -69,7 +69,7 @@ class Numbers final : public ZORIntegerSet {
   std::int64_t mDistance;
 };
 
-// Those of the numbers of an integer that lie in a range.
+// The numbers of a domain that are in a range.
 class Part final : public ZORIntegerSet {
  public:
   Part(const ZORVaDoInteger& integer, std::int64_t lower, std::int64_t upper)
@@ -88,7 +88,7 @@ class Part final : public ZORIntegerSet {
   std::int64_t mLower, mUpper;
 };
 
-// The numbers of either.
+// The numbers of either set.
 class Union final : public ZORIntegerSet {
  public:
   Union(const ZORIntegerSet& first, const ZORIntegerSet& second) : mFirst(first), mSecond(second) {}

@@ -15,7 +15,7 @@ ZORVadIntervalInteger::ZORVadIntervalInteger() = default;
 ZORVadIntervalInteger::ZORVadIntervalInteger(ZORStreamableInit) {}
 ZORVadIntervalInteger::ZORVadIntervalInteger(ZORLong lower, ZORLong upper) { Become(lower, upper); }
 
-// All intervals without a number are one and the same.
+// Every empty interval is stored alike.
 void ZORVadIntervalInteger::Become(std::int64_t lower, std::int64_t upper) {
   mLower = lower <= upper ? static_cast<ZORLong>(lower) : 1;
   mUpper = lower <= upper ? static_cast<ZORLong>(upper) : 0;

@@ -17,10 +17,10 @@ constexpr char kEntry[] = "InitModule";
 
 using Entry = int (*)(ZORVaDoModule* module, ZORVaDoModuleManager* manager);
 
-constinit ZORVaDoModule* sInUse = nullptr;            // the module that is being taken into use
-constinit ZORVaDoModuleManager* sManagers = nullptr;  // those that are alive
+constinit ZORVaDoModule* sInUse = nullptr;            // the module that is being opened
+constinit ZORVaDoModuleManager* sManagers = nullptr;  // every live manager
 
-// While it lives, new descriptors belong to module, or to nobody when that is null.
+// While in scope, new descriptors are owned by module, or by nobody when it is null.
 class TakingIntoUse {
  public:
   explicit TakingIntoUse(ZORVaDoModule* module) : mBefore(std::exchange(sInUse, module)) {}
@@ -52,13 +52,13 @@ std::string HostFolder() {
   return dladdr(&sManagers, &info) != 0 ? FolderOf(info.dli_fname) : "";
 }
 
-// Descriptors among the static objects of a library are the library's own.
+// Descriptors that are static objects of the library are not owned by a module.
 void* OpenLibrary(const std::string& file) {
   const TakingIntoUse nobody(nullptr);
   return dlopen(file.c_str(), RTLD_NOW | RTLD_LOCAL);
 }
 
-// The loader's last complaint about file, which it often opens with the name of the file.
+// The loader's last error, without the file name that it often begins with.
 std::string LoaderReason(const std::string& file) {
   const char* text = dlerror();
   std::string reason = text != nullptr ? text : "unknown reason";
@@ -156,12 +156,12 @@ ZORVaDoModule* ZORVaDoModuleManager::Load(const ZORString& name, const std::stri
   void* library = OpenLibrary(file);
   if (library == nullptr) return Fail(file, LoaderReason(file));
   const Opened opened{new ZORVaDoModule(name), library};
-  mOpened.push_back(opened);  // already now: what it needs may need it in turn
+  mOpened.push_back(opened);  // before it is initialised: modules may need each other
   std::string reason = TakeIntoUse(*opened.module, library);
   const auto place =
       std::find_if(mOpened.begin(), mOpened.end(), [&](const Opened& other) { return other.module == opened.module; });
   if (reason.empty()) {
-    std::rotate(place, place + 1, mOpened.end());  // behind what it needs, so that it goes first
+    std::rotate(place, place + 1, mOpened.end());  // after the modules it needs, to be unloaded before them
     return opened.module;
   }
   mOpened.erase(place);
@@ -170,7 +170,7 @@ ZORVaDoModule* ZORVaDoModuleManager::Load(const ZORString& name, const std::stri
   return Fail(file, reason);
 }
 
-// Answers why it cannot be used.
+// Returns why the module cannot be used; empty on success.
 std::string ZORVaDoModuleManager::TakeIntoUse(ZORVaDoModule& module, void* library) {
   const auto entry = reinterpret_cast<Entry>(dlsym(library, kEntry));
   if (entry == nullptr) return std::string("has no ") + kEntry;
@@ -180,7 +180,7 @@ std::string ZORVaDoModuleManager::TakeIntoUse(ZORVaDoModule& module, void* libra
   return std::string(kEntry) + " answered 0" + cause;
 }
 
-// A library stays loaded while another manager uses it, and so must the descriptors made from it.
+// A library stays loaded while another manager uses it; that manager's module then inherits the descriptors.
 void ZORVaDoModuleManager::Unload(const Opened& opened) {
   for (const auto* manager = sManagers; manager != nullptr && opened.library != nullptr; manager = manager->mNext) {
     for (const Opened& other : manager->mOpened) {

@@ -1,4 +1,4 @@
-// Words and numbers in the text form of the number types.
+// Words and numbers in the text forms of numbers and truth values.
 #pragma once
 
 #include <optional>
@@ -11,8 +11,8 @@ namespace zorhost {
 inline constexpr char kNilWord[] = "Nil";
 inline constexpr char kAnyWord[] = "Any";
 
-std::string ReadWord(ZORistrstream& in);               // the letters that come next behind white space
-std::optional<ZORLong> ReadNumber(ZORistrstream& in);  // none when no number of 32 bits comes next
+std::string ReadWord(ZORistrstream& in);               // skips white space, then takes the letters
+std::optional<ZORLong> ReadNumber(ZORistrstream& in);  // none unless a 32-bit number follows
 void PrintNumber(ZORostrstream& out, ZORLong value);
 
 }  // namespace zorhost

@@ -1,4 +1,4 @@
-// The number types as the solver and the streams know them.
+// Identity, casts, descriptors and stream records of the number types.
 #include "host/ZORNumbers.h"
 
 #include "host/Descriptors.h"

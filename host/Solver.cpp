@@ -14,7 +14,7 @@ const char* const ZORVaDoObjectDescriptor::sIdent = "ZORVaDoObjectDescriptor";
 void* ZORVaDoBase::operator new(std::size_t size) noexcept { return ::operator new(size, std::nothrow); }
 void ZORVaDoBase::operator delete(void* memory) noexcept { ::operator delete(memory); }
 
-// Only a class whose record says so is known to stand below ZORVaDoBase.
+// Only the record tells whether a class derives from ZORVaDoBase.
 ZORVaDoBase* ZORVaDoBase::FromStream(ZORStreamable* object) {
   if (object == nullptr) return nullptr;
   const ZORStreamableClass* const record = ZORStreamableClass::Find(object->CastableID());
@@ -67,7 +67,7 @@ void ZORVaDoObjectDescriptor::Read(ZORipstream& in) {
   ZORStreamable* const parent = in.ReadObjectPointer();
   const ZORVaDoBase* const base = FromStream(parent);
   mParent = IsKindOf(base, sIdent) ? static_cast<const ZORVaDoObjectDescriptor*>(base) : nullptr;
-  if (mParent != nullptr && IsMatched(mParent) != 0) mParent = nullptr;  // a type cannot be above itself
+  if (mParent != nullptr && IsMatched(mParent) != 0) mParent = nullptr;  // a type cannot be its own ancestor
   if (mParent != parent) in.SetFail();
 }
 
@@ -96,5 +96,5 @@ const ZORStreamableClass kScalarDescriptorRecord(kScalarDescriptorIdent, zor::Bu
 
 }  // namespace
 
-// Known before any static object is built, as only its address is taken.
+// Constant-initialised, since it is only an address: valid before any static object is built.
 const ZORVaDoObjectDescriptor* const ZORVaDoScalar::sDescriptor = &kScalar;

@@ -144,7 +144,7 @@ ZORStreamable* ZORipstream::Build(const char* text) {
 void ZORipstream::ReadContent(ZORStreamable& object) {
   if (mNesting == kNestingLimit) mFail = true;
   ++mNesting;
-  object.Read(*this);  // also after a failure, since an object has no state before
+  object.Read(*this);  // even after a failure: an object is not initialised before Read
   --mNesting;
 }
 

@@ -12,7 +12,7 @@ namespace {
 constexpr char kRunCharacter = 'z';
 constexpr std::size_t kLongestRun = 256;
 
-// The longest run and its zero; each shorter one is a tail of it.
+// The longest run of z with its terminating zero; each shorter run is a tail of it.
 constexpr std::array<char, kLongestRun + 1> MakeRun() {
   std::array<char, kLongestRun + 1> run{};
   for (std::size_t i = 0; i < kLongestRun; ++i) run[i] = kRunCharacter;
@@ -45,7 +45,7 @@ ZORString::ZORString(const ZORChar& c, std::size_t count) : ZORString() {
   }
 }
 
-// A block of our own that is large enough is kept.
+// Reuses an owned block that is large enough.
 ZORString& ZORString::operator=(const ZORString& other) {
   if (this == &other) return *this;
   if (!IsOwner() || other.mCapacity == kShared || other.mLength >= mCapacity) return *this = ZORString(other);
@@ -114,7 +114,7 @@ void ZORString::FlipCase(char first, char last) {
   }
 }
 
-// Gives the text storage of its own with room for length characters and the zero.
+// Ensures owned storage for length characters and the terminating zero.
 char* ZORString::Reserve(std::size_t length) {
   if (mCapacity == kInside && length <= kInline) return mInside;
   if (IsOwner() && length < mCapacity) return mOutside;
@@ -134,7 +134,7 @@ void ZORString::CopyBlock(const ZORString& other) {
   Extend(other.View());
 }
 
-// Text must not lie in storage that Reserve lets go.
+// text must not be in storage that Reserve frees.
 void ZORString::Extend(std::string_view text) {
   const std::size_t length = mLength + text.size();
   char* room = Reserve(length);

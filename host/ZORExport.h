@@ -1,4 +1,4 @@
-// What a library of the solver shows to others; everything else in it stays hidden.
+// Marks what a library exports; everything else is hidden.
 #pragma once
 
 #if __cplusplus <= 201703L

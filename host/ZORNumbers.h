@@ -1,12 +1,12 @@
-// The Boolean and the integer domains, the types of the built-in module "ZORVadNumbers": "single boolean",
-// "single integer", "interval integer" and "enum integer".
+// Boolean and integer domains, the types of the built-in module "ZORVadNumbers": "single boolean", "single integer",
+// "interval integer" and "enum integer".
 //
-// Every operation narrows by intersection, keeping each number or truth value that the relation still allows as far
-// as the class can tell. A Nil operand makes the target Nil; one of another kind (no integer, no Boolean) leaves it
-// as it is and gives the answer 0, but makes the target of Assign, Intersect and Unite Nil. The relations into a
-// Boolean leave it alone while they are open.
+// Every operation narrows by intersection: it keeps each number or truth value that the relation still allows, as far
+// as the class can represent the result. A Nil operand makes the target Nil. An operand of another kind (no integer, no
+// Boolean) changes nothing, 0, but makes the target of Assign, Intersect and Unite Nil. A reified relation leaves its
+// Boolean alone while the relation is open.
 //
-// Text forms: Nil, Any, true, false, 7, 2..9, { 1, 5 }. Whatever else is read gives Nil.
+// Text forms: Nil, Any, true, false, 7, 2..9, { 1, 5 }. Any other input gives Nil.
 #pragma once
 
 #include <cstddef>
@@ -17,7 +17,7 @@
 
 class ZORIntegerSet;
 
-// DynamicCast answers null for a null pointer and for an object of another class.
+// DynamicCast returns null for null and for an object of another class.
 #define ZOR_DECLARE_TYPE_TEST(Class)                          \
  public:                                                      \
   static const char* const sIdent;                            \
@@ -27,7 +27,7 @@ class ZORIntegerSet;
  protected:                                                   \
   int IsDerivedFrom(const char* ident) const override
 
-// A class that values can have. sDescriptor is never null.
+// A concrete class. sDescriptor is never null.
 #define ZOR_DECLARE_NUMBER_CLASS(Class)                    \
   ZOR_DECLARE_TYPE_TEST(Class);                            \
                                                            \
@@ -36,50 +36,22 @@ class ZORIntegerSet;
   const char* CastableID() const override;                 \
   const ZORVaDoObjectDescriptor* GetDescriptor() const override
 
-// Overrides of what any value does with others, on numbers and truth values alike.
-#define ZOR_DECLARE_NUMBER_OPERATIONS()                                                      \
- public:                                                                                     \
-  void Write(ZORopstream& out) const override;                                               \
-  void Read(ZORipstream& in) override;                                                       \
-  void PrintOn(ZORostrstream& out) const override;                                           \
-  void InputValue(ZORistrstream& in) override;                                               \
-  void Assign(const ZORVaDoAny& other) override;                                             \
-  int IsIntersected(const ZORVaDoAny& other) const override;                                 \
-  void Intersect(const ZORVaDoAny& other) override;                                          \
-  void Unite(const ZORVaDoAny& other) override;                                              \
-  void Bisect(ZORVaDoObject& other, ValueSelection selection) override;                      \
-  int CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
-  int CalcMinValue() override;                                                               \
-  int CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
-  int CalcMaxValue() override;                                                               \
-  int CalcEqualValue(const ZORVaDoAny& other) override;                                      \
-  int CalcInverseEqualValue(ZORVaDoAny& target) const override;                              \
-  int CalcUnequalValue(const ZORVaDoAny& other) override;                                    \
-  int CalcInverseUnequalValue(ZORVaDoAny& target) const override;                            \
-  int CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;           \
-  int CalcLessOrEqualValue(const ZORVaDoAny& other) override;                                \
-  int CalcInverseLessOrEqualValue(ZORVaDoAny& target) const override;                        \
-  int CalcNotLessAndUnequalValue(const ZORVaDoAny& other) override;                          \
-  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;                  \
-  int CalcIsLessOrEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;     \
-  int CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
-  int CalcFirstInverseMaxValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
-  static_assert(true)
-
-// A truth value. False is less than true.
+// A Boolean domain; false is less than true.
 class ZOR_EXPORT ZORVaDoBoolean : public ZORVaDoAny {
   ZOR_DECLARE_TYPE_TEST(ZORVaDoBoolean);
 
  public:
+  // Keep false, true.
   virtual int CalcFalseValue() = 0;
   virtual int CalcTrueValue() = 0;
 
-  // Takes in the truth of a relation: open when it can be either, a contradiction when it can be neither.
+  // Takes the outcome of a reified relation: unchanged when it can be both, Nil when it can be neither.
   int CalcOutcome(bool canBeFalse, bool canBeTrue);
 
   bool CanBe(bool truth) const;
 };
 
+// The Boolean of the solver: false, true, both or neither.
 class ZOR_EXPORT ZORVadSingleBoolean : public ZORVaDoBoolean {
   ZOR_DECLARE_NUMBER_CLASS(ZORVadSingleBoolean);
 
@@ -87,7 +59,11 @@ class ZOR_EXPORT ZORVadSingleBoolean : public ZORVaDoBoolean {
   ZORVadSingleBoolean() = default;
   explicit ZORVadSingleBoolean(ZORStreamableInit) {}
 
-  ZOR_DECLARE_NUMBER_OPERATIONS();
+  ZOR_DECLARE_VALUE_OPERATIONS();
+  int CalcUnequalValue(const ZORVaDoAny& other) override;
+  int CalcInverseUnequalValue(ZORVaDoAny& target) const override;
+  int CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
+  int CalcIsLessOrEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
   void SetNilValue() override;
   void SetUndefinedValue() override;
   int IsNil() const override;
@@ -104,15 +80,19 @@ class ZOR_EXPORT ZORVadSingleBoolean : public ZORVaDoBoolean {
   unsigned mTruths = kEither;
 };
 
-// An integer of 32 bits. Nil: no number is possible; Undefined: every number is. An order relation learns nothing
-// from an Undefined operand: it would only shave the ends off the range of all numbers, one by one.
+// A domain of 32-bit integers. Undefined has them all. An order relation narrows nothing by an Undefined operand: that
+// would only shave the ends off the full range, one number at a time.
 class ZOR_EXPORT ZORVaDoInteger : public ZORVaDoScalar {
   ZOR_DECLARE_TYPE_TEST(ZORVaDoInteger);
 
  public:
-  // Assign comes as close as the class can hold the value, and drops no number of it. Bisect gives the other value the
-  // numbers that go. CalcMinValue() and CalcMaxValue() keep the least and the greatest of all numbers.
-  ZOR_DECLARE_NUMBER_OPERATIONS();
+  // Assign takes the smallest domain of the class that has every number of other. CalcMinValue() and CalcMaxValue()
+  // keep the least and the greatest 32-bit number.
+  ZOR_DECLARE_VALUE_OPERATIONS();
+  int CalcUnequalValue(const ZORVaDoAny& other) override;
+  int CalcInverseUnequalValue(ZORVaDoAny& target) const override;
+  int CalcIsEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
+  int CalcIsLessOrEqual(const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
 
   // clang-format off
   int CalcLessValue          (const ZORVaDoScalar& other) override;
@@ -124,18 +104,17 @@ class ZOR_EXPORT ZORVaDoInteger : public ZORVaDoScalar {
   int CalcInverseNextValue   (ZORVaDoScalar& target) const override;
   // clang-format on
 
-  virtual void SetExactValue(ZORLong value);
-  virtual ZORLong GetExactValue() const;  // of several the greatest, so that below 0 means that all are
+  virtual void SetExactValue(ZORLong value);  // keeps value alone
+  virtual ZORLong GetExactValue() const;      // the greatest number, so that a negative one means all are
 
-  // The next possible number from a value on, upwards or downwards; where there is none, one above or below all
-  // numbers.
+  // The nearest number of the domain that is at least, at most value; beyond the 32-bit range when there is none.
   virtual std::int64_t FindAtLeast(std::int64_t value) const = 0;
   virtual std::int64_t FindAtMost(std::int64_t value) const = 0;
 
  protected:
-  // The rest of what a class of integers is made of. Keep drops what is not allowed, as far as the class can tell;
-  // allowed may be a view of *this. Join adds the numbers of other, where both have some but not all. The forms are
-  // those of a value that is neither Nil nor Undefined; those that read find the value Nil.
+  // What a class of integers implements. Keep intersects with allowed, which may be a view of *this. Join adds the
+  // numbers of other; neither side is Nil or Undefined. The forms are those of a value that is neither; *this is Nil
+  // when one is read.
   virtual int Keep(const ZORIntegerSet& allowed) = 0;
   virtual void Join(const ZORVaDoInteger& other) = 0;
   virtual void PrintKnown(ZORostrstream& out) const = 0;
@@ -147,7 +126,7 @@ class ZOR_EXPORT ZORVaDoInteger : public ZORVaDoScalar {
   int KeepEqual(const ZORVaDoInteger& other);
 };
 
-// Overrides of what a class of integers is made of.
+// The overrides of a class of integers.
 #define ZOR_DECLARE_INTEGER_CLASS(Class)                       \
   ZOR_DECLARE_NUMBER_CLASS(Class);                             \
                                                                \
@@ -170,15 +149,15 @@ class ZOR_EXPORT ZORVaDoInteger : public ZORVaDoScalar {
   void WriteKnown(ZORopstream& out) const override;            \
   void ReadKnown(ZORipstream& in) override
 
-// No number, one, or all.
+// An integer domain with no number, one, or all.
 class ZOR_EXPORT ZORVadSingleInteger : public ZORVaDoInteger {
   ZOR_DECLARE_INTEGER_CLASS(ZORVadSingleInteger);
 
  public:
-  static const ZORLong sNC_INT_ANY;  // the least number, and what an integer without a number holds
+  static const ZORLong sNC_INT_ANY;  // the least number; GetValue of a Nil or Undefined integer
 
   ZORLong GetValue() const { return mValue; }
-  void SetExactValue(ZORLong value) override;  // whatever was held
+  void SetExactValue(ZORLong value) override;  // replaces the value
 
  private:
   enum State { kExact, kAny, kNil };
@@ -189,12 +168,12 @@ class ZOR_EXPORT ZORVadSingleInteger : public ZORVaDoInteger {
   ZORLong mValue = sNC_INT_ANY;
 };
 
-// All numbers from a lower to an upper end.
+// An integer domain with all numbers from a lower to an upper bound.
 class ZOR_EXPORT ZORVadIntervalInteger : public ZORVaDoInteger {
   ZOR_DECLARE_INTEGER_CLASS(ZORVadIntervalInteger);
 
  public:
-  ZORVadIntervalInteger(ZORLong lower, ZORLong upper);  // Nil when lower is above upper
+  ZORVadIntervalInteger(ZORLong lower, ZORLong upper);  // Nil when lower > upper
 
   ZORLong GetLower() const { return mLower; }
   ZORLong GetUpper() const { return mUpper; }
@@ -206,13 +185,13 @@ class ZOR_EXPORT ZORVadIntervalInteger : public ZORVaDoInteger {
   ZORLong mUpper = INT32_MAX;
 };
 
-// Numbers in ascending order, each once.
+// Distinct numbers in ascending order.
 class ZOR_EXPORT ZORSVectorImp_SubIntBase {
  public:
   std::size_t Count() const { return mValues.size(); }
   std::vector<ZORLong>::const_iterator begin() const { return mValues.begin(); }
   std::vector<ZORLong>::const_iterator end() const { return mValues.end(); }
-  std::vector<ZORLong>::const_iterator FindLowerBound(std::int64_t value) const;  // first number not below value
+  std::vector<ZORLong>::const_iterator FindLowerBound(std::int64_t value) const;  // the first number >= value
   void Insert(ZORLong value);
   void Flush() { mValues.clear(); }
 
@@ -220,7 +199,7 @@ class ZOR_EXPORT ZORSVectorImp_SubIntBase {
   std::vector<ZORLong> mValues;
 };
 
-// Any numbers, up to kListLimit of them; one more makes it Undefined.
+// An integer domain that lists up to kListLimit numbers; one more makes it Undefined. IntersectInverse narrows target.
 class ZOR_EXPORT ZORVadEnumInteger : public ZORVaDoInteger {
   ZOR_DECLARE_INTEGER_CLASS(ZORVadEnumInteger);
 

@@ -1,9 +1,8 @@
-// The solver runtime as its modules see it: objects and values with their tables of virtual operations, the
-// descriptors through which values are made, modules and their manager. The order in which virtual operations are
-// declared is part of the binary interface.
+// The solver runtime as its modules see it: objects, values, the descriptors that make values, modules and their
+// manager. The declaration order of virtual functions is part of the binary interface.
 //
-// A narrowing operation (Calc...) answers 1 when it changed its target and 0 when it did not; a contradiction makes
-// the target Nil. Its target is *this, or for a const operation its one argument that is not const.
+// An operation named Calc... narrows one target: *this, or for a const operation its only non-const argument. It
+// returns 1 when the target changed, else 0. A contradiction makes the target Nil. Operands are never kept.
 #pragma once
 
 #include <cstddef>
@@ -21,7 +20,7 @@ class ZORVaDoNetwork;
 class ZORVaDoObjectDescriptor;
 class ZORVaDoObjectEnvironment;
 
-// Root of the solver's classes. Types are told apart by the address of a class's sIdent.
+// Root of the solver's classes. A type is identified by the address of its sIdent.
 class ZOR_EXPORT ZORVaDoBase : public ZORStreamable {
  public:
   static const char* const sIdent;
@@ -31,13 +30,13 @@ class ZOR_EXPORT ZORVaDoBase : public ZORStreamable {
   static void operator delete(void* memory) noexcept;
   static void operator delete(void*, void*) noexcept {}
 
-  // Factory of the classes that cannot be made: answers what it is given.
+  // Stream factory of an abstract class: returns its argument.
   static ZORStreamable* Build(ZORStreamable* object) { return object; }
 
-  // What a stream made as one of the solver's objects, which can be asked for its type; null when it is none.
+  // Downcasts an object made by a stream; null when its class does not derive from this one. No ownership changes.
   static ZORVaDoBase* FromStream(ZORStreamable* object);
 
-  // Whether object is of the class with this ident or of one below it; no for a null object.
+  // Whether object is of the class with this ident or of a derived one; false for null.
   static bool IsKindOf(const ZORVaDoBase* object, const char* ident) {
     return object != nullptr && object->IsDerivedFrom(ident) != 0;
   }
@@ -46,7 +45,7 @@ class ZOR_EXPORT ZORVaDoBase : public ZORStreamable {
   virtual int IsDerivedFrom(const char* ident) const;
 };
 
-// An object of the solver's network.
+// An object of the solver's network. Activate, ActivateByArgument and Filter do nothing unless a class overrides them.
 class ZOR_EXPORT ZORVaDoObject : public ZORVaDoBase {
  public:
   static const char* const sIdent;
@@ -58,21 +57,25 @@ class ZOR_EXPORT ZORVaDoObject : public ZORVaDoBase {
   virtual void Activate(ZORVaDoNetwork* network);
   virtual void ActivateByArgument(unsigned int argument, std::int64_t offset, ZORVaDoNetwork* network);
   virtual FilterResult Filter(const ZORVaDoObjectEnvironment& environment, std::int64_t offset);
-  virtual void PrintOn(ZORostrstream& out) const;  // the text form
-  virtual void InputValue(ZORistrstream& in);      // replaces the value by what the text says
+  virtual void PrintOn(ZORostrstream& out) const;  // writes the text form
+  virtual void InputValue(ZORistrstream& in);      // reads it; bad input makes a value Nil
 
  protected:
   int IsDerivedFrom(const char* ident) const override;
 };
 
-// Any value: what is still possible for a variable. Nil: nothing; Undefined: everything.
+// The domain of a variable: what it can still be. Nil is the empty domain, Undefined the full one.
 class ZOR_EXPORT ZORVaDoAny : public ZORVaDoObject {
  public:
   static const char* const sIdent;
 
-  // Which part of a value Bisect leaves in it. Any other number may be passed.
+  // The part that Bisect keeps. Callers may pass other numbers.
   enum ValueSelection : int { ZorSelectLeast, ZorSelectGreatest, ZorSelectLowerHalf, ZorSelectUpperHalf };
 
+  // Whole domains. Assign copies other, Intersect keeps what both have, Unite adds what other has; all three make the
+  // value Nil when other is of an unrelated class. IsIntersected: whether both share an element. Bisect keeps the
+  // selected part and moves the rest to other. Width and cardinality count elements; the relative width is a fraction
+  // of whole, 0 unless whole is positive.
   // clang-format off
   virtual void          Assign            (const ZORVaDoAny& other) = 0;
   virtual void          SetNilValue       () = 0;
@@ -87,6 +90,8 @@ class ZOR_EXPORT ZORVaDoAny : public ZORVaDoObject {
   virtual double        GetRelativeWidth  (double whole) const;
   virtual void          Bisect            (ZORVaDoObject& other, ValueSelection selection) = 0;
 
+  // Relations of *this and other, reified ones into result. *this = min(x, y), max(x, y); without operands, *this is
+  // the least or greatest element.
   virtual int CalcMinValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) = 0;
   virtual int CalcMinValue                     () = 0;
   virtual int CalcMaxValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) = 0;
@@ -109,7 +114,32 @@ class ZOR_EXPORT ZORVaDoAny : public ZORVaDoObject {
   int IsDerivedFrom(const char* ident) const override;
 };
 
-// A value with an order.
+// Overrides of every concrete class of values.
+#define ZOR_DECLARE_VALUE_OPERATIONS()                                                       \
+  void Write(ZORopstream& out) const override;                                               \
+  void Read(ZORipstream& in) override;                                                       \
+  void PrintOn(ZORostrstream& out) const override;                                           \
+  void InputValue(ZORistrstream& in) override;                                               \
+  void Assign(const ZORVaDoAny& other) override;                                             \
+  int IsIntersected(const ZORVaDoAny& other) const override;                                 \
+  void Intersect(const ZORVaDoAny& other) override;                                          \
+  void Unite(const ZORVaDoAny& other) override;                                              \
+  void Bisect(ZORVaDoObject& other, ValueSelection selection) override;                      \
+  int CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
+  int CalcMinValue() override;                                                               \
+  int CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                       \
+  int CalcMaxValue() override;                                                               \
+  int CalcEqualValue(const ZORVaDoAny& other) override;                                      \
+  int CalcInverseEqualValue(ZORVaDoAny& target) const override;                              \
+  int CalcLessOrEqualValue(const ZORVaDoAny& other) override;                                \
+  int CalcInverseLessOrEqualValue(ZORVaDoAny& target) const override;                        \
+  int CalcNotLessAndUnequalValue(const ZORVaDoAny& other) override;                          \
+  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;                  \
+  int CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
+  int CalcFirstInverseMaxValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override; \
+  static_assert(true)
+
+// A domain whose elements are ordered.
 class ZOR_EXPORT ZORVaDoScalar : public ZORVaDoAny {
  public:
   static const char* const sIdent;
@@ -118,6 +148,7 @@ class ZOR_EXPORT ZORVaDoScalar : public ZORVaDoAny {
   ZORVaDoScalar() = default;
   explicit ZORVaDoScalar(ZORStreamableInit) {}
 
+  // *this < other, *this >= other, *this = the successor of other.
   // clang-format off
   virtual int CalcLessValue          (const ZORVaDoScalar& other) = 0;
   virtual int CalcInverseLessValue   (ZORVaDoScalar& target) const = 0;
@@ -132,13 +163,13 @@ class ZOR_EXPORT ZORVaDoScalar : public ZORVaDoAny {
   int IsDerivedFrom(const char* ident) const override;
 };
 
-// The maker of one value type. The memory of a value is the caller's: it has GetObjectSize bytes.
+// Makes the values of one type, in memory of GetObjectSize() bytes that the caller owns.
 class ZOR_EXPORT ZORVaDoObjectDescriptor : public ZORVaDoBase {
  public:
   static const char* const sIdent;
 
-  // name is copied; flag is kept as it is given. A descriptor made while a module is taken into use belongs to that
-  // module's object, which deletes it when the module is unloaded.
+  // Copies name and stores flag. A descriptor made while a module is being opened is owned by that module, which
+  // deletes it when it is unloaded.
   ZORVaDoObjectDescriptor(const ZORString& name, const ZORVaDoObjectDescriptor* parent, int flag);
   explicit ZORVaDoObjectDescriptor(ZORStreamableInit);
   ~ZORVaDoObjectDescriptor() override;
@@ -152,14 +183,16 @@ class ZOR_EXPORT ZORVaDoObjectDescriptor : public ZORVaDoBase {
   int IsDerivedFrom(const char* ident) const override;
 
  public:
-  virtual ZORVaDoObject* CreateObject(void* place, const void* text) const = 0;  // known; null for a null place
-  virtual ZORVaDoObject* CreateObject(void* place) const = 0;                    // Undefined; null for a null place
-  virtual void DestroyObject(ZORVaDoObject* object) const;                       // runs the destructor, frees nothing
-  virtual std::size_t GetObjectSize() const = 0;                                 // in bytes
+  // CreateObject makes an Undefined value, or one from text, zero-terminated; null for a null place and for an abstract
+  // type. DestroyObject runs the destructor and frees nothing.
+  virtual ZORVaDoObject* CreateObject(void* place, const void* text) const = 0;
+  virtual ZORVaDoObject* CreateObject(void* place) const = 0;
+  virtual void DestroyObject(ZORVaDoObject* object) const;
+  virtual std::size_t GetObjectSize() const = 0;  // in bytes
   virtual unsigned int GetNumberOfArguments() const;
   virtual std::int64_t GetArgumentsSize() const;
-  virtual int IsMatched(const ZORVaDoObjectDescriptor* other) const;  // 1 when other is this type or one below it
-  virtual void PrintOn(ZORostrstream& out) const;                     // the display name
+  virtual int IsMatched(const ZORVaDoObjectDescriptor* other) const;  // 1 when other is this type or derived from it
+  virtual void PrintOn(ZORostrstream& out) const;                     // writes the display name
 
   const ZORString& GetName() const { return mName; }
   const ZORVaDoObjectDescriptor* GetParent() const { return mParent; }
@@ -174,11 +207,11 @@ class ZOR_EXPORT ZORVaDoObjectDescriptor : public ZORVaDoBase {
   ZORVaDoModule* mOwner = nullptr;
 };
 
-// A module that is in use: what it needs and what value types it brings, in the order in which they came.
+// An open module: the modules it needs and the value types it registered, each in order of registration.
 class ZOR_EXPORT ZORVaDoModule {
  public:
   explicit ZORVaDoModule(const ZORString& name);
-  virtual ~ZORVaDoModule();  // deletes the descriptors that were made for it
+  virtual ~ZORVaDoModule();  // deletes the descriptors that it owns
   ZORVaDoModule(const ZORVaDoModule&) = delete;
   ZORVaDoModule& operator=(const ZORVaDoModule&) = delete;
 
@@ -188,25 +221,25 @@ class ZOR_EXPORT ZORVaDoModule {
   const ZORString& GetName() const { return mName; }
   const std::vector<ZORVaDoModule*>& GetLoadedModules() const { return mLoadedModules; }
   const std::vector<const ZORVaDoObjectDescriptor*>& GetDescriptors() const { return mDescriptors; }
-  const ZORVaDoObjectDescriptor* FindDescriptor(const ZORString& displayName) const;  // null when there is none
+  const ZORVaDoObjectDescriptor* FindDescriptor(const ZORString& displayName) const;  // null when not registered
 
  private:
   friend class ZORVaDoObjectDescriptor;
   friend class ZORVaDoModuleManager;
 
-  static void Adopt(ZORVaDoObjectDescriptor& descriptor);  // by the module that is being taken into use, if any
+  static void Adopt(ZORVaDoObjectDescriptor& descriptor);  // by the module that is being opened, if any
   void Forget(const ZORVaDoObjectDescriptor& descriptor);
   void Bequeath(ZORVaDoModule& heir);
 
   ZORString mName;
   std::vector<ZORVaDoModule*> mLoadedModules;
   std::vector<const ZORVaDoObjectDescriptor*> mDescriptors;
-  std::vector<ZORVaDoObjectDescriptor*> mMade;  // registered or not
+  std::vector<ZORVaDoObjectDescriptor*> mMade;  // owned, whether registered or not
 };
 
-// Opens modules by name and keeps them until it dies, then unloads them in reverse order. "ZORVadNumbers" is built
-// in; any other name is the shared library lib<name>.so in the first folder of the search path that has it: the
-// program's own folder, those added, that of this library. Values of a module's types must be gone before its manager.
+// Opens modules by name, owns them, and unloads them in reverse order when it is destroyed. Values of a module's types
+// must be destroyed before its manager. "ZORVadNumbers" is built in; any other name stands for lib<name>.so in the
+// first folder of the search path that has it: the program's folder, those added, the folder of this library.
 class ZOR_EXPORT ZORVaDoModuleManager {
  public:
   ZORVaDoModuleManager();
@@ -214,16 +247,16 @@ class ZOR_EXPORT ZORVaDoModuleManager {
   ZORVaDoModuleManager(const ZORVaDoModuleManager&) = delete;
   ZORVaDoModuleManager& operator=(const ZORVaDoModuleManager&) = delete;
 
-  virtual ZORVaDoModule* OpenModule(const ZORString& name);  // the same object each time; null when it cannot
+  // OpenModule returns the same object each time, null on failure; GetFailure then has "file: reason", and is empty
+  // after a success.
+  virtual ZORVaDoModule* OpenModule(const ZORString& name);
   void AddSearchPath(const ZORString& folder);
-  const ZORString& GetFailure() const {
-    return mFailure;
-  }  // "file: reason" of the last OpenModule, empty if it went well
+  const ZORString& GetFailure() const { return mFailure; }
 
  private:
   struct Opened {
     ZORVaDoModule* module;
-    void* library;  // of dlopen; null for what is built in
+    void* library;  // from dlopen; null for a built-in module
   };
 
   ZORVaDoModule* OpenNumbers(const ZORString& name);
@@ -232,7 +265,7 @@ class ZOR_EXPORT ZORVaDoModuleManager {
   static void Unload(const Opened& opened);
   ZORVaDoModule* Fail(const std::string& file, const std::string& reason);
 
-  std::vector<Opened> mOpened;  // what a module needs stands before it
+  std::vector<Opened> mOpened;  // a module comes after those it needs
   std::vector<std::string> mSearchPath;
   ZORString mFailure;
   ZORVaDoModuleManager* mNext;

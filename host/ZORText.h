@@ -1,5 +1,5 @@
-// Texts and streams: characters, strings, the registry of streamable classes, binary streams for stored
-// networks and text streams for people. No class here throws; lengths and positions count characters from 0.
+// Characters, strings, the registry of streamable classes, binary streams for storage and text streams for people.
+// Nothing here throws. Lengths and positions are in characters, positions from 0.
 #pragma once
 
 #include <bit>
@@ -34,23 +34,23 @@ class ZOR_EXPORT ZORChar {
 
 ZOR_EXPORT bool operator==(const ZORChar& a, const ZORChar& b);
 
-// A text with value semantics. Up to kInline characters live inside the object; longer ones on the heap, but for
-// the runs of 'z' that stand for "greatest" and "unknown" all over a network: those share one block of constants.
-// The order is lexicographic by unsigned character code, a prefix before its extensions.
-// Memory that cannot be had ends the process with a message, since a lost text would be a wrong answer.
+// A string with value semantics, ordered lexicographically by unsigned character code, a prefix before its extensions.
+// Up to kInline characters are stored in the object. Longer strings are on the heap, except runs of up to 256 'z':
+// those stand for "greatest" and "unknown" in every network and share one constant block. Running out of memory ends
+// the process with a message: a lost string would be a wrong answer.
 class ZOR_EXPORT ZORString {
  public:
   ZORString() noexcept : mInside{} {}
   ZORString(const ZORString& other) { other.IsOwner() ? CopyBlock(other) : Mirror(other); }
   ZORString(ZORString&& other) noexcept { Take(other); }  // other is empty afterwards
-  ZORString(const char* text);  // NOLINT(google-explicit-constructor): zero-ended, copied; null is empty
+  ZORString(const char* text);  // NOLINT(google-explicit-constructor): zero-terminated, copied; null is empty
   ZORString(const ZORChar& c, std::size_t count);
   ZORString(const char* text, std::size_t length);
   ~ZORString() { Release(); }
   ZORString& operator=(const ZORString& other);
   ZORString& operator=(ZORString&& other) noexcept;
 
-  static void* operator new(std::size_t size);  // never answers null
+  static void* operator new(std::size_t size);  // never null
   static void* operator new(std::size_t, void* place) noexcept { return place; }
   static void operator delete(void* memory) noexcept { ::operator delete(memory); }
 
@@ -58,25 +58,25 @@ class ZOR_EXPORT ZORString {
   bool operator==(const char* text) const;
   std::strong_ordering operator<=>(const ZORString& other) const;
 
-  const ZORChar operator[](int position) const;  // the zero character outside the text
+  const ZORChar operator[](int position) const;  // zero outside the string
   int GetLengthInChar() const { return static_cast<int>(mLength); }
-  const char* CastToCharPtr() const { return mCapacity == kInside ? mInside : mOutside; }  // zero-ended, stays ours
+  const char* CastToCharPtr() const { return mCapacity == kInside ? mInside : mOutside; }  // zero-terminated
 
-  static ZORString Concatenation(const ZORString& head, const ZORString& tail);  // in one allocation at most
-  bool IsConcatenation(const ZORString& head, const ZORString& tail) const;      // builds no text
+  static ZORString Concatenation(const ZORString& head, const ZORString& tail);  // at most one allocation
+  bool IsConcatenation(const ZORString& head, const ZORString& tail) const;      // no allocation
   ZORString& Append(const ZORString& tail);                                      // tail may be *this
-  // Empty when start lies outside the text or length was negative before it was widened; cut at the end.
+  // Empty when start is outside the string or length is a converted negative number; truncated at the end.
   ZORString SubString(std::size_t start, std::size_t length) const;
-  // First position at or after start where pattern stands, -1 when nowhere; the empty pattern stands at start.
+  // First position of pattern at or after start, -1 when there is none. The empty pattern is found at start.
   int FindPosition(const ZORString& pattern, int start) const;
   void ReplaceSubString(int start, int length, const ZORString& text);
-  void ToLower();  // changes the 26 letters alone, whatever the locale
+  void ToLower();  // ASCII letters only, in any locale
   void ToUpper();
 
  private:
   static constexpr std::size_t kRoom = 32;
   static constexpr int kInline = kRoom - 1;
-  static constexpr std::uint32_t kInside = 0, kShared = UINT32_MAX;  // else mCapacity is the size of our own block
+  static constexpr std::uint32_t kInside = 0, kShared = UINT32_MAX;  // else mCapacity is the size of an owned block
 
   static void* Allocate(std::size_t size);
   [[noreturn]] static void DieOutOfMemory();
@@ -94,10 +94,10 @@ class ZOR_EXPORT ZORString {
   void Take(ZORString& other) noexcept;
   void Release() noexcept;
 
-  std::uint32_t mLength = 0;  // in front, with the start of the text in its cache line
+  std::uint32_t mLength = 0;  // first, in one cache line with the start of the text
   std::uint32_t mCapacity = kInside;
   union {
-    char mInside[kRoom];  // the rest of it is zero
+    char mInside[kRoom];  // padded with zeros
     char* mOutside;
   };
 };
@@ -127,8 +127,8 @@ inline void ZORString::Release() noexcept {
   if (IsOwner()) ::operator delete(mOutside);  // NOLINT(clang-analyzer-cplusplus.NewDelete): no other text holds it
 }
 
-// Word by word, the first character in the highest byte: what differs mostly does so in the first two words, where a
-// call of memcmp costs more than the comparison.
+// Word by word, the first character in the highest byte. Strings mostly differ in the first two words, where calling
+// memcmp costs more than comparing.
 inline int ZORString::OrderRooms(const char* a, const char* b) {
   for (std::size_t i = 0; i < kRoom; i += sizeof(std::uint64_t)) {
     std::uint64_t x, y;
@@ -144,7 +144,7 @@ inline int ZORString::OrderRooms(const char* a, const char* b) {
   return 0;
 }
 
-// Texts inside their objects compare with their padding, in one step whose cost does not hang on their lengths.
+// Strings stored inside compare with their padding: the cost does not depend on their length.
 inline bool ZORString::operator==(const ZORString& other) const {
   if (mLength != other.mLength) return false;
   if (AreInside(*this, other)) return std::memcmp(mInside, other.mInside, kRoom) == 0;
@@ -157,7 +157,7 @@ inline std::strong_ordering ZORString::operator<=>(const ZORString& other) const
   return order != 0 ? order <=> 0 : mLength <=> other.mLength;
 }
 
-// Copies of fixed size, behind one another: joined has two rooms, the first of them ends in zeros.
+// Two copies of fixed size; joined has two rooms. The zeros that pad head are overwritten by tail.
 inline void ZORString::JoinRooms(const ZORString& head, const ZORString& tail, char* joined) {
   std::memcpy(joined, head.mInside, kRoom);
   std::memcpy(joined + head.mLength, tail.mInside, kRoom);
@@ -191,27 +191,27 @@ inline bool ZORString::IsConcatenation(const ZORString& head, const ZORString& t
 class ZORipstream;
 class ZORopstream;
 
-// Tag of the constructors that make an object for Read.
+// Selects the constructor of an object that Read will fill.
 enum ZORStreamableInit { ZorStreamableInit = 0 };
 
 // An object that can be stored.
 class ZOR_EXPORT ZORStreamable {
  public:
   virtual ~ZORStreamable();
-  virtual const char* CastableID() const = 0;  // the text under which the class is registered
+  virtual const char* CastableID() const = 0;  // the name under which the class is registered
   virtual void Write(ZORopstream& out) const;
   virtual void Read(ZORipstream& in);
 };
 
-// One record for each streamable class, a static object of the library that defines the class. The registry is
-// the list of the records that are alive; of two with the same text the later one is found.
+// Registers a streamable class under a name: a static object of the library that defines the class. The registry is
+// the list of live records; of two with one name the later is found.
 class ZOR_EXPORT ZORStreamableClass {
  public:
-  using Factory = ZORStreamable* (*)(ZORStreamable* object);  // a null object asks for a new one
+  using Factory = ZORStreamable* (*)(ZORStreamable* object);  // makes a new object when given null
   using Watcher = void (*)(const ZORStreamableClass& record, bool added);
-  static constexpr int kSolverClass = 1;  // kind of the classes below ZORVaDoBase
+  static constexpr int kSolverClass = 1;  // kind of the classes derived from ZORVaDoBase
 
-  ZORStreamableClass(const char* text, Factory factory, int kind);  // text is kept, not copied
+  ZORStreamableClass(const char* text, Factory factory, int kind);  // text must outlive the record
   ~ZORStreamableClass();
   ZORStreamableClass(const ZORStreamableClass&) = delete;
   ZORStreamableClass& operator=(const ZORStreamableClass&) = delete;
@@ -221,7 +221,7 @@ class ZOR_EXPORT ZORStreamableClass {
   ZORStreamable* Build() const { return mFactory(nullptr); }
 
   static const ZORStreamableClass* Find(const char* text);  // null when no such class is loaded
-  static void Watch(Watcher watcher);                       // told of each record that comes or goes; null ends it
+  static void Watch(Watcher watcher);                       // called as records come and go; null stops that
 
  private:
   const char* mText;
@@ -230,16 +230,16 @@ class ZOR_EXPORT ZORStreamableClass {
   ZORStreamableClass* mNext;
 };
 
-// Binary output, in memory: integers in little-endian order, texts behind their length.
+// Binary output to memory: little-endian integers, strings preceded by their length.
 class ZOR_EXPORT ZORopstream {
  public:
   ZORopstream();
   ~ZORopstream();
 
   ZORopstream& operator<<(ZORLong value);
-  void WriteString(const char* text);                    // zero-ended
-  void WriteObject(const ZORStreamable* object);         // class text and content
-  void WriteObjectPointer(const ZORStreamable* object);  // null, a new object, or one that was written before
+  void WriteString(const char* text);                    // zero-terminated
+  void WriteObject(const ZORStreamable* object);         // class name and content
+  void WriteObjectPointer(const ZORStreamable* object);  // null, a new object, or a reference to one written before
   const std::string& Bytes() const { return mBytes; }
 
  private:
@@ -247,22 +247,21 @@ class ZOR_EXPORT ZORopstream {
   std::unordered_map<const ZORStreamable*, ZORLong> mObjects;
 };
 
-// Binary input from bytes that nobody vouches for. Whatever is missing or broken reads as 0 or null and is told by
-// Fail, and so is all that follows; nothing is read or allocated beyond what the bytes hold.
+// Binary input from untrusted bytes. Missing or malformed data reads as 0 or null and sets Fail(); later reads fail
+// too. Nothing is read or allocated beyond what the bytes hold.
 class ZOR_EXPORT ZORipstream {
  public:
   explicit ZORipstream(std::string bytes);
   ~ZORipstream();
 
   ZORipstream& operator>>(ZORLong& value);
-  char* ReadString();                       // the caller's, freed with delete[]
-  void ReadObject(ZORStreamable*& object);  // fills the object given; makes one where the pointer is null
-  ZORStreamable* ReadObjectPointer();       // a new object is the caller's; null for an unknown class
+  char* ReadString();                       // owned by the caller, freed with delete[]
+  void ReadObject(ZORStreamable*& object);  // fills object, or a new one when it is null
+  ZORStreamable* ReadObjectPointer();       // the caller owns a new object; null for an unknown class
   bool Fail() const { return mFail; }
-  void SetFail() { mFail = true; }  // for a Read that finds its content broken
-  std::size_t Left() const { return mBytes.size() - mPosition; }
-  // What ReadObjectPointer has made so far, with null for what it could not make: all that a reader who gives up
-  // has to delete.
+  void SetFail() { mFail = true; }                                // for a Read that rejects its content
+  std::size_t Left() const { return mBytes.size() - mPosition; }  // in bytes
+  // Every object made by ReadObjectPointer, null where that failed: what to delete when reading is abandoned.
   const std::vector<ZORStreamable*>& Objects() const { return mObjects; }
 
  private:
@@ -279,15 +278,15 @@ class ZOR_EXPORT ZORipstream {
 // The buffer of a text output stream.
 class ZOR_EXPORT ZORpstream {
  public:
-  char* Str(int);      // the buffer, as far as it was written; it is zero-ended when a zero was written last
-  void Freeze(int) {}  // the buffer always stays the stream's
+  char* Str(int);      // the buffer, owned by the stream; zero-terminated only if a zero was written last
+  void Freeze(int) {}  // does nothing: the stream keeps its buffer
   std::string_view View() const { return mBuffer; }
 
  protected:
   std::string mBuffer;
 };
 
-// Text output, a growing buffer.
+// Text output to a growing buffer.
 class ZOR_EXPORT ZORostrstream : public ZORpstream {
  public:
   ZORostrstream();
@@ -296,19 +295,19 @@ class ZOR_EXPORT ZORostrstream : public ZORpstream {
   ZORostrstream& operator<<(char c);
 };
 
-// Text input over characters that the caller keeps alive and unchanged while it reads.
+// Text input from characters that must stay alive and unchanged while it is used.
 class ZOR_EXPORT ZORistrstream {
  public:
   static constexpr int kNoCharacter = -1;
 
-  ZORistrstream(const char* text, int size);  // size characters, or up to the zero when size is 0
+  ZORistrstream(const char* text, int size);  // size characters; with size 0, up to the terminating zero
 
   ZORistrstream& operator>>(ZORistrstream& (*manipulator)(ZORistrstream&)) { return manipulator(*this); }
-  ZORistrstream& operator>>(char& c);  // the zero character at the end
-  int Peek() const;                    // the code of the next character, 0 to 255, or kNoCharacter at the end
+  ZORistrstream& operator>>(char& c);  // zero at the end
+  int Peek() const;                    // the next character as 0 to 255, or kNoCharacter at the end
   void Ignore();
-  // Stores at most limit characters and a zero behind them, so that room for limit + 1 is needed; with limit 0
-  // nothing. Stops at the delimiter and takes it, also when it comes right behind the last character stored.
+  // Stores at most limit characters and a terminating zero: line has room for limit + 1. Stores nothing for limit 0.
+  // Stops at the delimiter and consumes it, also right after the last character stored.
   void GetLine(char* line, unsigned int limit, char delimiter);
   std::size_t Left() const { return static_cast<std::size_t>(mEnd - mNext); }
 

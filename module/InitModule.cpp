@@ -9,7 +9,7 @@ int InitModule(ZORVaDoModule* module, ZORVaDoModuleManager* manager) {
   ZORVaDoModule* const numbers = manager->OpenModule(ZORString("ZORVadNumbers"));
   if (numbers == nullptr) return 0;
   module->AddLoadedModule(numbers);
-  ZORVaDoString::MakeDescriptor();  // the parent of the two concrete types, not a type to be had by itself
+  ZORVaDoString::MakeDescriptor();  // the parent of both types; abstract, so not registered
   module->AddObjectDescriptor(zor::MakeSingleDescriptor());
   module->AddObjectDescriptor(zor::MakeEnumDescriptor());
   InitStrings();

@@ -1,13 +1,12 @@
-// What every string class has alike: identity, casts, stream pointers, descriptor. Declared and defined once here.
+// Declarations that every string class has: identity, casts, stream functions, descriptor, operations.
 #pragma once
 
 #include "host/ZORSolver.h"
 
-// Members of a string class. sIdent is its identity, compared by address; CastableIdent is the same text for others.
-// DynamicCast answers null for a null pointer and for an object of another class, StaticCast tests nothing.
-// sDescriptor is null until MakeDescriptor has run, which answers null when there is no memory; a second call makes
-// a second descriptor. No descriptor is ever freed by the class. readPtr gives null, and the stream fails, for an
-// object of another class.
+// Members of a string class. Its type is identified by the address of sIdent; CastableIdent is the same name, public.
+// DynamicCast returns null for null and for an object of another class; StaticCast is unchecked.
+// sDescriptor is null until MakeDescriptor has run. MakeDescriptor returns null when out of memory; every call makes a
+// new descriptor, which the class never frees. readPtr gives null and fails the stream for an object of another class.
 #define ZOR_DECLARE_STRING_CLASS(Class)                                                                   \
  public:                                                                                                  \
   class ZOR_EXPORT Descriptor : public ZORVaDoObjectDescriptor {                                          \
@@ -42,37 +41,17 @@
  public:                                                                                                  \
   static_assert(true)
 
-// The operations that each concrete class answers on its own, as the solver calls them through the table. Their
-// contracts stand with the base classes. Both bounds come new at the end of the table.
+// The overrides of a concrete class. The contracts of operations are with the typed forms of the class and in the base
+// classes. SetLowerBound and SetUpperBound are new and end the virtual table.
 #define ZOR_DECLARE_STRING_OPERATIONS()                                                                       \
-  void Write(ZORopstream& out) const override;                                                                \
-  void Read(ZORipstream& in) override;                                                                        \
-  void PrintOn(ZORostrstream& out) const override;                                                            \
-  void InputValue(ZORistrstream& in) override;                                                                \
-  void Assign(const ZORVaDoAny& other) override;                                                              \
+  ZOR_DECLARE_VALUE_OPERATIONS();                                                                             \
   void SetNilValue() override;                                                                                \
   void SetUndefinedValue() override;                                                                          \
   int IsNil() const final { return mState == ZorStringNil; }                                                  \
   int IsUndefined() const final { return mState == ZorStringAny; }                                            \
   int CheckNil() const { return IsNil(); }                                                                    \
   int CheckAny() const { return IsUndefined(); }                                                              \
-  int IsIntersected(const ZORVaDoAny& other) const override;                                                  \
-  void Intersect(const ZORVaDoAny& other) override;                                                           \
-  void Unite(const ZORVaDoAny& other) override;                                                               \
   unsigned long GetCardinality() const override;                                                              \
-  void Bisect(ZORVaDoObject& other, ValueSelection selection) override;                                       \
-  int CalcMinValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                                        \
-  int CalcMinValue() override;                                                                                \
-  int CalcMaxValue(const ZORVaDoAny& x, const ZORVaDoAny& y) override;                                        \
-  int CalcMaxValue() override;                                                                                \
-  int CalcEqualValue(const ZORVaDoAny& other) override;                                                       \
-  int CalcInverseEqualValue(ZORVaDoAny& target) const override;                                               \
-  int CalcLessOrEqualValue(const ZORVaDoAny& other) override;                                                 \
-  int CalcInverseLessOrEqualValue(ZORVaDoAny& target) const override;                                         \
-  int CalcNotLessAndUnequalValue(const ZORVaDoAny& other) override;                                           \
-  int CalcInverseNotLessAndUnequalValue(ZORVaDoAny& target) const override;                                   \
-  int CalcFirstInverseMinValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override;                  \
-  int CalcFirstInverseMaxValue(ZORVaDoAny& target, const ZORVaDoAny& second) const override;                  \
   int CalcLessValue(const ZORVaDoScalar& other) override;                                                     \
   int CalcInverseLessValue(ZORVaDoScalar& target) const override;                                             \
   int CalcNotLessValue(const ZORVaDoScalar& other) override;                                                  \

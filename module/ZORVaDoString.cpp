@@ -31,7 +31,7 @@ bool AreAtOneExtreme(const ZORVaDoString& a, const ZORVaDoString& b) {
   return (a.IsEmpty() && b.IsEmpty()) || (a.IsFull() && b.IsFull());
 }
 
-// Whether a is less than b as far as an extreme tells, when they are not at the same one.
+// Whether a < b follows from one of them being the least or the greatest value; both are not the same extreme.
 std::optional<bool> IsLessByExtreme(const ZORVaDoString& a, const ZORVaDoString& b) {
   if (b.IsFull()) return true;
   if (a.IsEmpty()) return true;
@@ -42,7 +42,7 @@ std::optional<bool> IsLessByExtreme(const ZORVaDoString& a, const ZORVaDoString&
 
 int ToTruth(ZORVaDoBoolean& result, bool truth) { return truth ? result.CalcTrueValue() : result.CalcFalseValue(); }
 
-// Whether both values are known to be one and the same text.
+// Whether both values are known and have the same text.
 bool AreOneText(const ZORVaDoString& a, const ZORVaDoString& b) {
   const ZORString text = a.GetLowerBound();
   return text == a.GetUpperBound() && text == b.GetLowerBound() && text == b.GetUpperBound();

@@ -1,7 +1,7 @@
-// The abstract string value: what is still possible for a string variable of the solver.
+// The abstract domain of a string variable.
 //
-// The domain is every text of at most 255 characters over the alphabet from the space (32) to z (122), in the order
-// of ZORString. A text from outside it is stored and compared like any other.
+// Its elements are the texts of at most 255 characters from the space (32) to z (122), in the order of ZORString. Texts
+// are not checked: any other is stored and compared like these.
 #pragma once
 
 #include <cstdint>
@@ -11,38 +11,41 @@
 #include "host/ZORText.h"
 #include "module/ZORStringClass.h"
 
+// What ZORVadSingleString and ZORVadEnumString have in common. See there for what an operation does with either class;
+// here is what it means, and on the right what it narrows.
 class ZOR_EXPORT ZORVaDoString : public ZORVaDoScalar {
   ZOR_DECLARE_STRING_CLASS(ZORVaDoString);
 
  public:
   enum ZORStringStateTag : std::int32_t {
-    ZorStringExact,  // the value has defined content
-    ZorStringAny,    // Undefined: any text is possible
-    ZorStringNil,    // contradiction: no text is possible
-    ZorStringMax,    // the greatest text is in the value
+    ZorStringExact,  // the listed text or texts
+    ZorStringAny,    // Undefined: every text
+    ZorStringNil,    // contradiction: no text
+    ZorStringMax,    // the greatest text, and the listed ones
   };
 
-  // Texts with a meaning, empty until InitStrings.
+  // Texts with a meaning, all empty until InitStrings.
   static ZORString ZorVaDoStringMin;  // the least text, one space
   static ZORString ZorVaDoStringMax;  // the greatest, 255 times z
-  static ZORString ZorVaDoStringNil;  // of a Nil value, stays empty
-  static ZORString ZorVaDoStringAny;  // of an Undefined single value, 256 times z: longer than any text of the domain
+  static ZORString ZorVaDoStringNil;  // the text of a Nil value, always empty
+  static ZORString ZorVaDoStringAny;  // the text of an Undefined single value, 256 times z: not in the domain
 
-  ZORVaDoString() = default;                  // the concrete class gives the state
-  explicit ZORVaDoString(ZORStreamableInit);  // for Read, which gives the state
+  ZORVaDoString() = default;                  // Undefined, unless the derived class sets the state
+  explicit ZORVaDoString(ZORStreamableInit);  // for Read
   ZORVaDoString(const ZORVaDoString& other);
   ZORVaDoString& operator=(const ZORVaDoString& other);  // copies the state
   ~ZORVaDoString() override;
 
   ZORStringStateTag GetState() const { return mState; }
 
-  // Bring the value to that state. Answer 0 when it is there already.
+  // Make the value Nil, Undefined. Return 0 when it is so already, else 1.
   int Nil();
   int Any();
 
-  // The relations into a Boolean, from the states and bounds of both values; an open relation leaves it untouched.
-  // A Nil operand or one that is no string makes it Nil, an Undefined one Undefined.
-  // CalcUnequalValue removes the text of an other that has but one.
+  // Unequal: removes the text of an other that has only one; a Nil other makes *this Nil, an Undefined one changes
+  // nothing. The inverse is the same with the operands exchanged.
+  // Reified: result becomes Undefined when an operand is, else Nil when one is Nil or no string (CalcIsLess: no string
+  // comes first). It becomes true or false when the states and bounds of the operands decide, else it stays.
   // clang-format off
   int CalcUnequalValue       (const ZORVaDoAny& other) override;
   int CalcInverseUnequalValue(ZORVaDoAny& target) const override;
@@ -50,13 +53,15 @@ class ZOR_EXPORT ZORVaDoString : public ZORVaDoScalar {
   int CalcIsLessOrEqual      (const ZORVaDoAny& other, ZORVaDoBoolean& result) const override;
   int CalcIsLess             (const ZORVaDoScalar& other, ZORVaDoBoolean& result) const override;
 
-  // The extremes: IsEmpty tells the least value, IsFull the greatest; the other two make them.
+  // The least value, Min, and the greatest, Max: IsEmpty and IsFull test for them. The other two are CalcMinValue() and
+  // CalcMaxValue() by another name.
   virtual int CalcEmptyValue();
   virtual int IsEmpty() const = 0;
   virtual int CalcFullValue();
   virtual int IsFull() const = 0;
 
-  // Texts of the value, one at a time. Texts are copied.
+  // SetExactValue makes text the only one, InsertExactValue adds it, RemoveExactValue drops it and returns 1 if it was
+  // there. The bounds are the least and the greatest text, the neighbours those next to text. Texts are copied.
   virtual void      SetExactValue    (const ZORString& text) = 0;
   virtual void      InsertExactValue (const ZORString& text) = 0;
   virtual int       RemoveExactValue (const ZORString& text) = 0;
@@ -65,15 +70,15 @@ class ZOR_EXPORT ZORVaDoString : public ZORVaDoScalar {
   virtual ZORString GetNextExactValue(const ZORString& text) const = 0;
   virtual ZORString GetPrevExactValue(const ZORString& text) const = 0;
 
-  // n = length(*this), in characters.
+  // n = length of *this, in characters.
   virtual int CalcLength       (ZORVaDoInteger& n) const = 0;        // n
   virtual int CalcInverseLength(const ZORVaDoInteger& n) = 0;        // *this
 
-  // *this = text form of x.
+  // *this = the text form of x.
   virtual int CalcStringRepresentation       (const ZORVaDoAny& x) = 0;        // *this
   virtual int CalcInverseStringRepresentation(ZORVaDoAny& x) const = 0;        // x
 
-  // *this = lower or upper case of x.
+  // *this = x in lower case, in upper case.
   virtual int CalcLowerValue       (const ZORVaDoString& x) = 0;     // *this
   virtual int CalcInverseLowerValue(ZORVaDoString& x) const = 0;     // x
   virtual int CalcUpperValue       (const ZORVaDoString& x) = 0;     // *this
@@ -84,7 +89,7 @@ class ZOR_EXPORT ZORVaDoString : public ZORVaDoScalar {
   virtual int CalcFirstInverseConcatenation (ZORVaDoString& x, const ZORVaDoString& y) const = 0;  // x
   virtual int CalcSecondInverseConcatenation(const ZORVaDoString& x, ZORVaDoString& y) const = 0;  // y
 
-  // *this = x[start .. end], positions from 0, both ends in.
+  // *this = x[start .. end], positions from 0, both included.
   virtual int CalcSubString             (const ZORVaDoString& x, const ZORVaDoInteger& start, const ZORVaDoInteger& end) = 0;  // *this
   virtual int CalcFirstInverseSubString (ZORVaDoString& x, const ZORVaDoInteger& start, const ZORVaDoInteger& end) const = 0;  // x
   virtual int CalcSecondInverseSubString(const ZORVaDoString& x, ZORVaDoInteger& start, const ZORVaDoInteger& end) const = 0;  // start
@@ -92,7 +97,7 @@ class ZOR_EXPORT ZORVaDoString : public ZORVaDoScalar {
   // clang-format on
 
  protected:
-  // An operand at an extreme decides: an Undefined value takes it, one that is elsewhere becomes Nil.
+  // Settle on Min, Max: an Undefined value becomes that, a value that is it stays, any other becomes Nil.
   int MeetLeast();
   int MeetGreatest();
 

@@ -1,5 +1,5 @@
-// The ends of the alphabet. Each source file that includes this has a pair of its own, built before the rest of its
-// static objects, so that none of them depends on the order in which files come to life.
+// The least and the greatest character as static objects of the file that includes this, built before its other static
+// objects: none of them depends on the initialisation order of files.
 #pragma once
 
 #include "module/texts.h"

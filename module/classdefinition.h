@@ -1,4 +1,4 @@
-// The definitions behind ZOR_DECLARE_STRING_CLASS, one row a class, in the source file that holds its statics.
+// Definitions for ZOR_DECLARE_STRING_CLASS, used once per class in the file with its static members.
 #pragma once
 
 #include "host/ClassDefinition.h"
@@ -6,7 +6,7 @@
 
 namespace zor {
 
-// The factory that a record names; the abstract class leans on that of its base.
+// The factory in a stream record; the abstract class inherits Build from its base.
 template <class Class>
 ZORStreamable* BuildRecorded(ZORStreamable* object) {
   return Class::Build(object);
@@ -14,7 +14,7 @@ ZORStreamable* BuildRecorded(ZORStreamable* object) {
 
 }  // namespace zor
 
-// The record of the descriptor is built before that of the class; both keep the texts given here.
+// The stream record of the descriptor is registered before that of the class.
 #define ZOR_DEFINE_STRING_CLASS(Class, Base, displayName, parent, flag)                                                \
   namespace {                                                                                                          \
   constexpr char k##Class##Ident[] = #Class;                                                                           \

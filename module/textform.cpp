@@ -6,7 +6,7 @@ namespace {
 
 constexpr unsigned int kWordLength = 3;
 
-// At most limit characters up to the delimiter.
+// At most kLimit characters, up to the delimiter.
 template <unsigned int kLimit>
 ZORString InputLine(ZORistrstream& in, char delimiter) {
   char line[kLimit + 1];

@@ -1,18 +1,18 @@
-// What the text forms of both string classes share: four words, texts in double quotes and the limit of input.
+// Text forms of both string classes: the words of the states, and texts in double quotes.
 #pragma once
 
 #include "module/ZORVaDoString.h"
 
 namespace zor {
 
-// Prints the word of a value that has one: Nil, Any, Min or Max. Answers whether it had.
+// Writes Nil, Any, Max or Min if value is one of them, and returns whether it is.
 bool PrintWord(const ZORVaDoString& value, ZORostrstream& out);
 
-// Skips white space, reads a word or a text in quotes, and makes value what it says; Nil when there is neither.
+// Skips white space and sets value to the word or the quoted text that follows, to Nil when there is neither.
 void InputWordOrText(ZORVaDoString& value, ZORistrstream& in);
 
-// Reads what follows an opening quote up to the closing one, at most 254 characters; there are no escapes, and a zero
-// character ends the text too.
+// Reads the text after an opening quote, up to the closing one but at most kReadableLimit characters. There are no
+// escapes; a zero character ends the text, too.
 ZORString InputQuoted(ZORistrstream& in);
 
 }  // namespace zor

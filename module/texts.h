@@ -1,4 +1,4 @@
-// The texts of the domain: their limits and steps, views of them, and their folds.
+// The texts of the domain: limits, case folding, successors and predecessors.
 #pragma once
 
 #include <cstddef>
@@ -12,16 +12,16 @@ namespace zor {
 constexpr char kLeastCharacter = ' ', kGreatestCharacter = 'z';  // the alphabet is every code between them
 constexpr bool IsInAlphabet(char c) { return c >= kLeastCharacter && c <= kGreatestCharacter; }
 
-constexpr int kLengthLimit = 255;                                // characters of the longest text
-constexpr unsigned int kReadableLimit = 254;                     // characters of the longest text that reads back
-constexpr std::size_t kSetLimit = 256;                           // texts of a set that grows through InsertExactValue
+constexpr int kLengthLimit = 255;             // characters of the longest text
+constexpr unsigned int kReadableLimit = 254;  // characters of the longest text that can be read
+constexpr std::size_t kSetLimit = 256;        // texts of a set that grows through InsertExactValue
 
-// Orders like the text itself; valid as long as the text stays as it is.
+// The characters of text, valid until it changes. Views order like the texts.
 inline std::string_view View(const ZORString& text) {
   return {text.CastToCharPtr(), static_cast<std::size_t>(text.GetLengthInChar())};
 }
 
-// Lower case or upper case: one algorithm with the fold as its parameter.
+// ZORString::ToLower or ZORString::ToUpper.
 using Fold = void (ZORString::*)();
 
 inline ZORString Folded(ZORString text, Fold fold) {
@@ -29,13 +29,13 @@ inline ZORString Folded(ZORString text, Fold fold) {
   return text;
 }
 
-// A text with a letter in the other case is no fold.
+// Whether folding leaves text as it is.
 inline bool IsFolded(const ZORString& text, Fold fold) { return text == Folded(text, fold); }
 
-// The steps are the module's own and not exported.
-// Successor: the least text that is greater. Below the limit that is the text and a space; at the limit the trailing z
-// go and the character before them is raised. None for a text at the limit of nothing but z.
-// Predecessor: the last character of a text that has one steps down, and z fill it up to the limit.
+// Not exported. The successor is the least greater text: a shorter text gets a space appended; one of kLengthLimit
+// loses its trailing z, and the character before them is incremented. There is none when all characters are z.
+// The predecessor of a text that is not empty has its last character decremented, a space dropped, and is padded with
+// z.
 std::optional<ZORString> Successor(const ZORString& text);
 ZORString Predecessor(const ZORString& text);
 

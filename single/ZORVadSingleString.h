@@ -1,4 +1,4 @@
-// A string variable that holds at most one text.
+// The domain of a string variable that holds at most one text.
 #pragma once
 
 #include <utility>
@@ -6,28 +6,45 @@
 #include "module/ZORVaDoString.h"
 #include "module/texts.h"
 
-// The state and, beside it, a text that the value owns. Exact: the text, of any length and any characters. Max: the
-// greatest text. Undefined and Nil: the text means nothing; a copy takes such a state and leaves the text behind.
-// Min is the Exact value of one space. 255 times z may also be Exact, since Max is a state.
+// A state and a text that the value owns. Exact: the text, of any length and with any characters. Max: the greatest
+// text. Undefined, Nil: the text has no meaning, and copies do not take it. Min is the Exact value of one space. 255
+// times z can also be Exact, since Max is a state.
 //
-// An operation stands here in its typed form. Its entry in the solver's table takes the abstract types and answers 0,
-// nothing changed, when a string operand is missing or no single string; Assign, Intersect and Unite make the value
-// Nil then. Operands may be one and the same object. Above 255 characters a concatenation is Max.
+// These are the typed forms. A virtual form returns 0 and changes nothing when a string operand is missing or is no
+// single string; Assign, Intersect and Unite then make *this Nil. Integers and the operand of a text representation are
+// not checked. Operands may be the same object. Unless stated otherwise an operation returns 1 for a change, else 0.
+//
+// "Settles on t": an Undefined target becomes Exact with t, a target with the text t stays, any other becomes Nil.
 class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
   ZOR_DECLARE_STRING_CLASS(ZORVadSingleString);
 
  public:
+  // Those without a typed form:
+  //   PrintOn, InputValue    Nil, Any, Max, Min, or the text in double quotes; any other input gives Nil
+  //   Write, Read            the state, and the text of an Exact value; broken input gives Nil
+  //   GetCardinality         Nil 0, Undefined 255, else 1
+  //   IsIntersected          0 if either value is Nil, else 1 if either is Undefined, else whether the texts are equal
+  //   Bisect                 makes *this Nil
+  //   bounds, neighbours     the text, whatever the state
+  //   SetExactValue, SetLowerBound, SetUpperBound   make *this Exact with the text
+  //   InsertExactValue       a Nil value takes the text; one with another text becomes Undefined
+  //   RemoveExactValue       makes a value with that text Nil
+  //   CalcLength             n becomes Nil or Undefined with *this, else equal to the length
+  //   CalcInverseLength      Nil unless n is a single integer, and Undefined or the length; an Undefined *this stays
+  //                          unless n is negative
+  //   CalcStringRepresentation         becomes Exact with the text form of x, 1
+  //   CalcInverseStringRepresentation  x reads its text form from the text, 1
   ZOR_DECLARE_STRING_OPERATIONS();
-  static ZORVadSingleString* Build(ZORStreamable* object);  // null: a new value for Read, or null without memory
+  static ZORVadSingleString* Build(ZORStreamable* object);  // stream factory; null when out of memory
 
   ZORVadSingleString();                       // Undefined
   ZORVadSingleString(const ZORString& text);  // NOLINT(google-explicit-constructor)
-  ZORVadSingleString(const void* text);       // NOLINT(google-explicit-constructor): zero-ended
+  ZORVadSingleString(const void* text);       // NOLINT(google-explicit-constructor): zero-terminated
   ZORVadSingleString(const ZORVadSingleString& other);
   explicit ZORVadSingleString(ZORStreamableInit);  // for Read
   ~ZORVadSingleString() override;
 
-  // Copies; of an Undefined or Nil value the state alone. Copy answers whether a text was copied, Assign 1.
+  // Copy; an Undefined or Nil value gives its state alone. Copy returns whether a text was copied, Assign 1.
   // clang-format off
   ZORVadSingleString& operator=(const ZORVadSingleString& other);
   ZORVadSingleString& operator=(const char* text);
@@ -35,12 +52,16 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
   int Copy  (const ZORVadSingleString& other);
   int Copy  (const ZORString& text);
 
-  // Set operations. Min and Max replace the value that meets them. A union that one text cannot hold is Undefined.
+  // Intersect, with CalcEqualValue, settles on the text of other, but takes a Min or Max other whatever the text of
+  // *this. A Nil other makes *this Nil; a Nil *this and an Undefined other change nothing.
+  // Unite: a Nil other changes nothing, and a Nil *this takes the text of another. Texts that differ make *this
+  // Undefined, and so does a Min or Max beside anything else.
   int  Intersect     (const ZORVadSingleString& other);
   int  CalcEqualValue(const ZORVadSingleString& other);
   void Unite         (const ZORVadSingleString& other);
 
-  // Relations of *this, left, and x, right. They test known values; what fails makes the target Nil. Narrows:
+  // *this < x, <= x, >= x, > x. A relation that does not hold makes the target Nil, as does a Nil operand; an Undefined
+  // operand changes nothing. Min and Max are compared by their state.
   int CalcLessValue                    (const ZORVadSingleString& x);        // *this
   int CalcInverseLessValue             (      ZORVadSingleString& x) const;  // x
   int CalcLessOrEqualValue             (const ZORVadSingleString& x);        // *this
@@ -50,7 +71,13 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
   int CalcNotLessAndUnequalValue       (const ZORVadSingleString& x);        // *this
   int CalcInverseNotLessAndUnequalValue(      ZORVadSingleString& x) const;  // x
 
-  // *this = min(x, y), max(x, y); an Undefined operand makes a forward target Undefined. *this = successor of x.
+  // *this = min(x, y), max(x, y). Forward: a Nil operand makes *this Nil, an Undefined one Undefined; else it settles
+  // on the lesser or greater text. The minimum of Max and Max makes *this Max whatever it was.
+  // Inverse: an Undefined y changes nothing. A known x becomes Undefined with an Undefined *this, and Nil unless the
+  // lesser or greater text of x and y is that of *this. An Undefined x copies *this where y permits it, else it is Nil.
+  // *this = the successor of x. An Undefined source changes nothing, a Nil one makes the target Nil, and so does a Max
+  // x; else the target settles on the successor or predecessor. A text without a successor makes an Undefined *this
+  // Max. One without a predecessor, the empty text or Min, makes x Nil.
   int CalcMinValue            (const ZORVadSingleString& x, const ZORVadSingleString& y);        // *this
   int CalcFirstInverseMinValue(      ZORVadSingleString& x, const ZORVadSingleString& y) const;  // x
   int CalcMaxValue            (const ZORVadSingleString& x, const ZORVadSingleString& y);        // *this
@@ -58,19 +85,29 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
   int CalcNextValue           (const ZORVadSingleString& x);                                     // *this
   int CalcInverseNextValue    (      ZORVadSingleString& x) const;                               // x
 
-  // *this = x + y. An Undefined operand makes the target Undefined. An inverse cuts at the first occurrence of the
-  // other operand and does not ask whether the result would come out.
+  // *this = x + y. Forward: a Nil value among the three makes *this Nil, an Undefined operand makes it Undefined, even
+  // if it was known; a Max operand, or more than 255 characters, make it Max; else it settles on the text.
+  // Inverse: a Nil source makes the target Nil, an Undefined or Max one Undefined. Where the other operand occurs in
+  // the text of *this, x settles on what precedes its first occurrence, y on what follows as many characters as x has;
+  // elsewhere the target becomes Nil. The result need not satisfy the relation.
   int CalcConcatenation             (const ZORVadSingleString& x, const ZORVadSingleString& y);        // *this
   int CalcFirstInverseConcatenation (      ZORVadSingleString& x, const ZORVadSingleString& y) const;  // x
   int CalcSecondInverseConcatenation(const ZORVadSingleString& x,       ZORVadSingleString& y) const;  // y
 
-  // *this = x[start .. end], positions from 0, both ends in; what lies outside x is cut. Integers must be there.
+  // *this = x[start .. end], positions from 0, both included, truncated at the ends of x. An Undefined operand makes
+  // the target Undefined, a Nil one Nil; a Min x makes *this Min first. Forward: settles on the slice.
+  // Inverse: with both positions known the target becomes Nil unless the slice is the text of *this. An unknown
+  // position settles where a slice of that length matches: at the known position, or at the first occurrence when both
+  // are unknown.
   int CalcSubString             (const ZORVadSingleString& x, const ZORVaDoInteger& start, const ZORVaDoInteger& end);        // *this
   int CalcFirstInverseSubString (      ZORVadSingleString& x, const ZORVaDoInteger& start, const ZORVaDoInteger& end) const;  // x
   int CalcSecondInverseSubString(const ZORVadSingleString& x,       ZORVaDoInteger& start, const ZORVaDoInteger& end) const;  // start
   int CalcThirdInverseSubString (const ZORVadSingleString& x, const ZORVaDoInteger& start,       ZORVaDoInteger& end) const;  // end
 
-  // *this = lower or upper case of x. The inverse only tests: many texts fold to one.
+  // *this = x in lower case, in upper case. Forward: settles on the folded text, or on Min or Max of such an x; an
+  // Undefined x makes *this Nil if its text has a letter in the other case. The inverse only tests x, because many
+  // texts fold to one: Nil if x folds to another text, or an Undefined x cannot fold to the text of *this. Min and Max
+  // go with their like alone, whatever the text.
   int CalcLowerValue       (const ZORVadSingleString& x);        // *this
   int CalcInverseLowerValue(      ZORVadSingleString& x) const;  // x
   int CalcUpperValue       (const ZORVadSingleString& x);        // *this
@@ -96,8 +133,6 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
 
 ZOR_EXPORT inline int ZORVadSingleString::IsFull() const { return mState == ZorStringMax; }
 
-// The common end of the forward operations: an Undefined value takes the text, an equal text stays, any other is a
-// contradiction.
 template <class Text>
 int ZORVadSingleString::Settle(Text&& text) {
   if (IsUndefined()) {

@@ -28,7 +28,7 @@ int ZORVadSingleString::CalcSecondInverseConcatenation(const ZORVadSingleString&
   if (IsNil() || x.IsNil()) return y.Nil();
   if (IsUndefined() || x.IsUndefined()) return y.Any();
   if (x.IsFull() || IsFull()) return y.Any();
-  if (mText.FindPosition(x.mText, 0) < 0) return y.Nil();  // anywhere will do: the cut is by length
+  if (mText.FindPosition(x.mText, 0) < 0) return y.Nil();  // any occurrence will do; the cut is by length
   const int length = x.mText.GetLengthInChar();
   return y.Settle(mText.SubString(length, mText.GetLengthInChar() - length));
 }

@@ -1,4 +1,4 @@
-// Minimum, maximum and successor of single strings, and the extremes themselves.
+// Minimum, maximum and successor of single strings.
 #include "host/Guard.h"
 #include "module/texts.h"
 #include "single/ZORVadSingleString.h"
@@ -31,13 +31,13 @@ int ZORVadSingleString::CalcMinValue(const ZORVadSingleString& x, const ZORVadSi
   if (x.IsNil() || y.IsNil()) return Nil();
   if (x.IsUndefined() || y.IsUndefined()) return Any();
   if (x.IsEmpty() || y.IsEmpty()) return MeetLeast();
-  if (x.IsFull() && y.IsFull()) return CalcMaxValue();  // the target is not asked, unlike with the maximum
+  if (x.IsFull() && y.IsFull()) return CalcMaxValue();  // replaces the target, unlike the maximum
   if (x.IsFull()) return Intersect(y);
   if (y.IsFull()) return Intersect(x);
   return Settle(Earlier(x.mText, y.mText));
 }
 
-// A known x is tested: the text chosen of x and y must be that of the result.
+// Tests a known x: chosen, the lesser or greater text of x and y, must be the text of the result.
 int ZORVadSingleString::TestChoice(Single& x, const Single& y, const ZORString& chosen) const {
   if (x.IsNil()) return 0;
   if (IsNil() || y.IsNil()) return x.Nil();
@@ -63,7 +63,7 @@ int ZORVadSingleString::CalcFirstInverseMinValue(ZORVadSingleString& x, const ZO
   if (!x.IsUndefined()) return TestChoice(x, y, Earlier(x.mText, y.mText));
   if (IsNil() || y.IsNil()) return x.Nil();
   if (IsFull() || mText > y.mText) return x.Nil();
-  return x.Copy(*this);  // also when the texts are equal, unlike with the maximum
+  return x.Copy(*this);  // for equal texts too, unlike the maximum
 }
 
 int ZORVadSingleString::CalcNextValue(const ZORVadSingleString& x) {

@@ -5,7 +5,7 @@
 using zor::Folded;
 using zor::IsFolded;
 
-// The extremes go by their state: each folds to itself, whatever its text.
+// Min and Max fold to themselves, whatever their text.
 int ZORVadSingleString::CalcFoldValue(const Single& x, zor::Fold fold) {
   if (x.IsNil() || IsNil()) return Nil();
   if (IsUndefined() && x.IsUndefined()) return 0;

@@ -11,7 +11,7 @@ int ZORVadSingleString::CalcLength(ZORVaDoInteger& n) const {
 
 int ZORVadSingleString::CalcInverseLength(const ZORVaDoInteger& n) {
   const auto* const length = ZORVadSingleInteger::DynamicCast(&n);
-  if (length == nullptr || length->IsNil()) return Nil();  // an interval or a set of lengths is a contradiction here
+  if (length == nullptr || length->IsNil()) return Nil();  // other classes of integers are contradictions here
   if (length->IsUndefined()) return 0;
   if (length->GetValue() < 0) return Nil();
   if (IsNil() || IsUndefined()) return 0;

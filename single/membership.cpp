@@ -1,4 +1,4 @@
-// Texts of single strings one at a time.
+// Setting, adding and removing the text of single strings.
 #include "single/ZORVadSingleString.h"
 
 void ZORVadSingleString::SetExactValue(const ZORString& text) { Become(ZorStringExact, text); }

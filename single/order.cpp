@@ -2,7 +2,7 @@
 #include "host/Guard.h"
 #include "single/ZORVadSingleString.h"
 
-// a < b when strict, else a <= b; target is a or b. The relations differ where both are at the same extreme.
+// a < b if strict, else a <= b; target is a or b. The relations differ when both are the same extreme.
 int ZORVadSingleString::NarrowOrder(const Single& a, const Single& b, Single& target, bool strict) {
   if (a.IsNil() || b.IsNil()) return target.Nil();
   if (a.IsUndefined() || b.IsUndefined()) return 0;

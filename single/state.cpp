@@ -1,4 +1,4 @@
-// What a single string is: its statics, construction, copies and states.
+// Statics, construction, copies and states of single strings.
 #include "host/Guard.h"
 #include "module/characters.h"
 #include "module/classdefinition.h"

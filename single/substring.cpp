@@ -6,10 +6,10 @@
 
 namespace {
 
-// Positions and counts are worked out in 32 bits and wrap there.
+// Positions and counts have 32 bits and wrap around.
 ZORLong Wrapped(std::int64_t sum) { return static_cast<ZORLong>(static_cast<std::uint32_t>(sum)); }
 
-// A negative position or count arrives as a huge one and cuts nothing out.
+// A negative position or count becomes a huge one, which gives the empty text.
 ZORString Cut(const ZORString& text, ZORLong start, ZORLong count) {
   return text.SubString(static_cast<std::size_t>(start), static_cast<std::size_t>(count));
 }
@@ -28,7 +28,7 @@ int ZORVadSingleString::CalcSubString(const ZORVadSingleString& x, const ZORVaDo
                                       const ZORVaDoInteger& end) {
   if (x.IsNil()) return Nil();
   if (x.IsUndefined()) return Any();
-  if (x.IsEmpty()) return CalcMinValue();  // wherever the positions lie, and from Nil too
+  if (x.IsEmpty()) return CalcMinValue();  // whatever the positions are, and even if *this is Nil
   if (start.IsNil() || end.IsNil()) return Nil();
   if (start.IsUndefined() || end.IsUndefined()) return Any();
   return Settle(Slice(x.mText, start, end));
@@ -45,8 +45,8 @@ int ZORVadSingleString::CalcFirstInverseSubString(ZORVadSingleString& x, const Z
   return x.Nil();
 }
 
-// Both positions by one list. A slice of our length is cut where the known position puts it, or at our first
-// occurrence when neither is known; its start is the one position, its last character the other.
+// Narrows either position by the slice of x that has the length of this text: the one at the known position, or the
+// first occurrence when neither is known.
 int ZORVadSingleString::NarrowPosition(const Single& x, const ZORVaDoInteger& start, const ZORVaDoInteger& end,
                                        ZORVaDoInteger& target, bool targetIsStart) const {
   const ZORVaDoInteger& known = targetIsStart ? end : start;

@@ -8,7 +8,7 @@ void ZORVadSingleString::PrintOn(ZORostrstream& out) const {
 
 void ZORVadSingleString::InputValue(ZORistrstream& in) { zor::InputWordOrText(*this, in); }
 
-// Answers 1 also when the text is the one that was there.
+// Returns 1 even if the text is the same as before.
 int ZORVadSingleString::CalcStringRepresentation(const ZORVaDoAny& x) {
   ZORostrstream out;
   x.PrintOn(out);
@@ -29,7 +29,7 @@ void ZORVadSingleString::Write(ZORopstream& out) const {
   if (mState == ZorStringExact) out.WriteString(mText.CastToCharPtr());
 }
 
-// A state that is none, like a text that is missing, gives Nil. The text of an Undefined or Nil value stays.
+// An unknown state and a missing text give Nil. Reading Undefined or Nil keeps the text.
 void ZORVadSingleString::Read(ZORipstream& in) {
   ZORLong state = ZorStringNil;
   in >> state;

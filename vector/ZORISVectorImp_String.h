@@ -1,4 +1,4 @@
-// The ordered container behind sets of strings, and a cursor over it.
+// The ordered container behind sets of strings, and its iterator.
 #pragma once
 
 #include <compare>
@@ -6,32 +6,32 @@
 #include "host/ZORExport.h"
 #include "host/ZORText.h"
 
-// Places for ZORString pointers, counted from 0. Owns its array and no string: strings that are not deleted through
-// a flag of Flush, Detach or DetachAt are the user's, the destructor frees the array alone, copies share the strings.
-// Top() <= Limit(). Places below top count; they ascend, equal ones side by side, as long as only Add and AddUnique
-// fill them. A null place, which AddAt can leave, orders before every string. Places from top to limit are null,
-// but for those that a Flush of a part of the range leaves.
-// A vector whose array could not be had is not Good. It may still tell a limit, but has no place: nothing is found,
-// walked or stored in it, and it does not grow.
+// An array of ZORString pointers, positions from 0. It owns the array and no string: only the del flag of Flush, Detach
+// and DetachAt deletes strings, the destructor frees the array alone, and copies share the strings.
+// Top() <= Limit(). Elements are the positions below top; they ascend, equal ones adjacent, as long as only Add and
+// AddUnique insert. A null element, which AddAt can leave, orders before every string. Positions from top to limit are
+// null, except those that a Flush of a part of the range leaves.
+// A vector whose array could not be allocated is not Good: it finds, visits and stores nothing and does not grow,
+// whatever Limit() is.
 class ZOR_EXPORT ZORISVectorImp_String {
  public:
   using Action = void (*)(ZORString& s, void* arg);
   using Test = int (*)(const ZORString& s, void* arg);
 
-  // The sized ones have size + 1 places and grow by multiples of delta, or by ratio times the limit at each step;
-  // a ratio that is not above 0.0 counts as 1.0. A vector made without a size, or with delta 0, cannot grow.
+  // With a size, capacity is size + 1 and grows by multiples of delta, or by ratio times the limit at each step; a
+  // ratio that is not positive counts as 1.0. Without a size, or with delta 0, a vector cannot grow.
   ZORISVectorImp_String();
   ZORISVectorImp_String(unsigned int size, unsigned int delta);
   ZORISVectorImp_String(unsigned int size, double ratio);
 
-  // The array is copied. Assignment takes over the growth as well, and from a vector that is not Good the flag alone;
-  // when the new array cannot be had, the target is left without one, limit and top 0, and not Good.
+  // Copies the array. Assignment copies the growth too, and from a vector that is not Good that flag alone; when
+  // allocation fails, the target has no array, limit and top 0, and is not Good.
   ZORISVectorImp_String(const ZORISVectorImp_String& other);
   const ZORISVectorImp_String& operator=(const ZORISVectorImp_String& other);
 
-  void Swap(ZORISVectorImp_String& other) noexcept;  // places, growth and all
+  void Swap(ZORISVectorImp_String& other) noexcept;  // exchanges everything
 
-  ZORString*& operator[](unsigned int pos);  // below Limit(), untested
+  ZORString*& operator[](unsigned int pos);  // pos < Limit(), unchecked
   ZORString*& operator[](unsigned int pos) const;
 
   // clang-format off
@@ -39,24 +39,24 @@ class ZOR_EXPORT ZORISVectorImp_String {
   virtual int          Good() const;
   virtual int          Good();
 
-  // 1: s is stored and belongs to whoever flushes the vector. 0: no place to be had, the vector is as before and s
-  // stays the caller's. AddUnique answers 1 for a string that is there too, and s stays the caller's then as well.
-  virtual int          Add      (ZORString* s);                    // behind its equals
-  virtual int          AddAt    (ZORString* s, unsigned int pos);  // whatever the order; above top, all up to pos count
+  // 1: s is stored, and deleted by whoever flushes the vector. 0: allocation failed, the vector is unchanged and the
+  // caller keeps s. AddUnique also returns 1 for a string that is present; the caller then keeps s, too.
+  virtual int          Add      (ZORString* s);                    // after its equals
+  virtual int          AddAt    (ZORString* s, unsigned int pos);  // ignores the order; pos > top extends the elements to pos
   virtual int          AddUnique(ZORString* s);
 
-  // 1 removed, 0 no such string or place. del != 0 deletes the strings. DetachAt removes up to top at most, whatever
-  // the count; from a place behind top it answers 1 and empties places only.
+  // 1 removed, 0 no such string or position. del != 0 deletes the strings. DetachAt stops at top, whatever the count;
+  // at or after top it returns 1 and only sets positions to null.
   virtual int          Detach   (const ZORString* s, int del);
   virtual int          DetachAt (unsigned int pos, unsigned int count, int del);
   virtual int          IsEmpty  () const;
 
-  // Empties the places from start up to stop, not including it; afterwards none counts, whatever the range was.
+  // Sets [start, stop) to null, deleting the strings for del != 0; afterwards top is 0, whatever the range.
   virtual void         Flush    (int del, unsigned int stop, unsigned int start);
   virtual void         Flush    (int del);
 
-  // Positions; above Count(), namely Limit() + 1, when there is none. *s is read only and need not be in the vector.
-  // Of equal strings any may be met; ClusteredFind and cluster != 0 answer the first of them.
+  // Binary searches. They return a position, or Limit() + 1 when there is none, which is greater than Count(). *s need
+  // not be in the vector. Of equal strings any may be found; ClusteredFind and cluster != 0 return the first.
   virtual unsigned int Find          (const ZORString* s) const;
   virtual unsigned int ClusteredFind (const ZORString* s) const;
   virtual unsigned int FindLowerBound(const ZORString* s, int cluster) const;  // the last string <= *s
@@ -66,14 +66,14 @@ class ZOR_EXPORT ZORISVectorImp_String {
   virtual unsigned int Top  () const;
   virtual unsigned int Count() const;  // the same as Top
 
-  // Growth. NextDelta: how many places come to it so that needed more fit, UINT_MAX when that is beyond counting.
-  // Resize: 1 grown, in one allocation; 0 wanted is there already or cannot be had, nothing changed.
+  // Growth. NextDelta: by how much capacity grows to fit needed more, UINT_MAX on overflow. Resize: 1 grown, in one
+  // allocation; 0 nothing changed, because the capacity suffices or allocation failed.
   virtual unsigned int GetDelta () const;
   virtual unsigned int NextDelta(unsigned int needed);
   virtual int          Resize   (unsigned int wanted);
 
-  // Walk the places from first up to last, not including it, and skip null ones; without a range those that count.
-  // LastThat tests all of them. FirstThat and LastThat answer null when f answers 0 throughout.
+  // Visit [first, last), or all elements, except null ones. FirstThat and LastThat return the first and the last string
+  // for which f is not 0, or null; LastThat calls f on all of them.
   virtual void         ForEach  (Action f, void* arg, unsigned int first, unsigned int last);
   virtual void         ForEach  (Action f, void* arg);
   virtual ZORString*   FirstThat(Test f, void* arg, unsigned int first, unsigned int last) const;
@@ -82,12 +82,12 @@ class ZOR_EXPORT ZORISVectorImp_String {
   virtual ZORString*   LastThat (Test f, void* arg) const;
 
  protected:
-  virtual void         Zero     (unsigned int start, unsigned int stop);  // empties places, capped at the limit
+  virtual void         Zero     (unsigned int start, unsigned int stop);  // sets [start, stop) to null, up to the limit
   // clang-format on
 
  private:
-  // Where a bisection ended, how the string there compares with the one sought, and the nearest strings that it met
-  // on either side. Each is the not-found answer when there is none.
+  // Where a binary search ended, how the string there compares with s, and the nearest strings compared on either
+  // side. Each position is Nowhere() when there is none.
   struct Meeting {
     unsigned int at, below, above;
     std::strong_ordering order;
@@ -112,7 +112,7 @@ class ZOR_EXPORT ZORISVectorImp_String {
   int mGood;
 };
 
-// Inline, and exported to programs that do not inline them.
+// Inline, and exported for programs that do not inline them.
 ZOR_EXPORT inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) { return mItems[pos]; }
 ZOR_EXPORT inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) const { return mItems[pos]; }
 ZOR_EXPORT inline int ZORISVectorImp_String::Good() const { return mGood; }
@@ -123,23 +123,23 @@ ZOR_EXPORT inline unsigned int ZORISVectorImp_String::Top() const { return mTop;
 ZOR_EXPORT inline unsigned int ZORISVectorImp_String::Count() const { return mTop; }
 ZOR_EXPORT inline unsigned int ZORISVectorImp_String::GetDelta() const { return mDelta; }
 
-// A cursor over a vector, which it does not own. The end of the walk is fixed when it is made or restarted: strings
-// added behind it meanwhile stay outside. It must lie within the vector's limit.
+// An iterator over a vector that must outlive it. The range is fixed when it is constructed or restarted, must be
+// within the vector's limit, and does not grow with the vector.
 //   for (ZORISVectorIteratorImp_String i(v); i; ++i) Use(*i.Current());
 class ZOR_EXPORT ZORISVectorIteratorImp_String {
  public:
-  explicit ZORISVectorIteratorImp_String(const ZORISVectorImp_String& v);  // the places that count now
-  ZORISVectorIteratorImp_String(const ZORISVectorImp_String& v, unsigned int from, unsigned int to);  // to not included
+  explicit ZORISVectorIteratorImp_String(const ZORISVectorImp_String& v);                             // all elements
+  ZORISVectorIteratorImp_String(const ZORISVectorImp_String& v, unsigned int from, unsigned int to);  // [from, to)
   ZORISVectorIteratorImp_String(const ZORISVectorIteratorImp_String& other);
   ZORISVectorIteratorImp_String& operator=(const ZORISVectorIteratorImp_String& other);
 
-  operator int() const;        // NOLINT(google-explicit-constructor): 1 while there is a place to walk, else 0
-  ZORString* operator++();     // steps, then answers Current()
-  ZORString* operator++(int);  // answers Current() as it was, and steps also at the end
+  operator int() const;        // NOLINT(google-explicit-constructor): 1 until the end, then 0
+  ZORString* operator++();     // advances, returns Current()
+  ZORString* operator++(int);  // returns Current(), then advances, even past the end
 
-  virtual ZORString* Current() const;  // null at the end, over a vector that is not Good, and for a null place
+  virtual ZORString* Current() const;  // null at the end, for a vector that is not Good, and for a null element
   virtual void Restart(unsigned int from, unsigned int to);
-  virtual void Restart();  // the range as it was given
+  virtual void Restart();  // with the same range
 
  private:
   const ZORISVectorImp_String* mVector;

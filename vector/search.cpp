@@ -1,4 +1,4 @@
-// The vector's read side: searches by bisection, walks, and the iterator.
+// Binary searches and visits of the vector, and its iterator.
 #include <algorithm>
 
 #include "vector/ZORISVectorImp_String.h"
@@ -8,7 +8,7 @@ std::strong_ordering ZORISVectorImp_String::Order(const ZORString* a, const ZORS
   return *a <=> *b;
 }
 
-// Where equal strings stand, which of them is met depends on these very steps.
+// Callers rely on which of several equal strings is found, so the steps must not change.
 ZORISVectorImp_String::Meeting ZORISVectorImp_String::Bisect(const ZORString* s) const {
   Meeting met{Nowhere(), Nowhere(), Nowhere(), std::strong_ordering::equal};
   if (mTop == 0 || mItems == nullptr) return met;

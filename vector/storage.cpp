@@ -1,4 +1,4 @@
-// Places of the vector: construction, growth, adding, removing, copying.
+// Construction, copying, growth, insertion and removal.
 #include <algorithm>
 #include <climits>
 #include <cstdint>
@@ -9,14 +9,14 @@
 
 namespace {
 
-// One number is left over for limit + 1, the answer of a search that finds nothing.
+// Leaves Limit() + 1 free, the result of a search that finds nothing.
 constexpr unsigned int kMostPlaces = UINT_MAX - 1;
 
 unsigned int Saturated(std::uint64_t count) {
   return static_cast<unsigned int>(std::min<std::uint64_t>(count, UINT_MAX));
 }
 
-// The library shows the places also to programs that do not inline them.
+// Emits the inline operators for programs that do not inline them.
 using Places = ZORString*& (ZORISVectorImp_String::*)(unsigned int);
 using ConstPlaces = ZORString*& (ZORISVectorImp_String::*)(unsigned int) const;
 [[gnu::used]] constexpr Places kPlaces = &ZORISVectorImp_String::operator[];
@@ -98,7 +98,7 @@ int ZORISVectorImp_String::Resize(unsigned int wanted) {
   return 1;
 }
 
-// Behind the last string that is not above s. Strings mostly arrive in ascending order, so the end is tried first.
+// After the last string <= *s. Strings mostly arrive in ascending order, so the end is tried first.
 unsigned int ZORISVectorImp_String::PlaceFor(const ZORString* s) const {
   const auto below = [](const ZORString* a, const ZORString* b) { return Order(a, b) < 0; };
   if (mTop == 0 || !below(s, mItems[mTop - 1])) return mTop;
@@ -130,12 +130,12 @@ int ZORISVectorImp_String::AddUnique(ZORString* s) {
   const unsigned int i = FindLowerBound(s, 0);
   if (i >= Count()) return Add(s);
   if (Order(mItems[i], s) == 0) return 1;
-  return AddAt(s, i + 1);  // the bound of a string that is not there is the last of its run
+  return AddAt(s, i + 1);  // i is the last string < *s
 }
 
 int ZORISVectorImp_String::Detach(const ZORString* s, int del) { return DetachAt(Find(s), 1, del); }
 
-// Deleted places are emptied at once: those behind top, which a partial flush left, are not reached later.
+// Deleted positions become null at once: those after top, which a partial Flush leaves, are not reached below.
 int ZORISVectorImp_String::DetachAt(unsigned int pos, unsigned int count, int del) {
   if (mItems == nullptr || pos >= mLimit) return 0;
   const unsigned int end = pos + std::min(count, mLimit - pos);

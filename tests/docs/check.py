@@ -80,11 +80,18 @@ def check_references(text):
 
 
 def check_table(text):
-    """A row for every operation of the virtual table, in its order."""
+    """A row for every operation of the virtual table, in its order, with what it narrows."""
     table = (root / 'tests/module/table_test.cpp').read_text()
-    slots, rows = re.findall(r'\b(?:S|S_OF)\((?!name)(\w+)|\{"(Set\w+)"', table), re.findall(r'^\| `(\w+)', text, re.M)
-    if list(dict.fromkeys(a or b for a, b in slots)) != list(dict.fromkeys(rows)):
+    slots = re.findall(r'\b(?:S|S_OF)\((?!name)(\w+)|\{"(Set\w+)"', table)
+    rows = re.findall(r'^\| `(\w+)\((.*?)\)` \| ([\w-]+)', text, re.M)
+    if list(dict.fromkeys(a or b for a, b in slots)) != list(dict.fromkeys(name for name, *_ in rows)):
         failures.append('The rows differ from the virtual table or its order')
+    operations = re.findall(r'^  X\(\w+, +(\w+), +(.*)\) *\\?$', (root / 'module/operations.h').read_text(), re.M)
+    for name, operands in ((name, operands.split(', ')) for name, operands in operations):
+        targets = [at for at, operand in enumerate(operands) if not operand.startswith('const ')]
+        for arguments, narrows in ((['z', *filter(None, a.split(', '))], n) for row, a, n in rows if row == name):
+            if len(arguments) == len(operands) and narrows != (arguments[targets[0]] if targets else '-'):
+                failures.append(f'{name} narrows something else than {narrows}')
 
 
 def check_picture():

@@ -28,36 +28,37 @@ struct SingleOperation {  // on a set and a single string
 };
 
 // clang-format off
-#define PAIR(Name, target, ofEntry) ZOR_BESIDE(Name, 2, target, (*v[1]), (v[0], v[1]), ofEntry)
-#define ALIKE(Name, target)    PAIR(Name, target, (model::Name(v[0], v[1])))
-#define WORDLESS(Name)         PAIR(Name, 0, (model::Name(v[0], v[1]), 0))
-#define FORWARD(Name)          PAIR(Name, 0, (model::Entry(v[0], [&] { return model::Name(v[0], v[1]); }, v[1])))
-#define INVERSE(Name)          PAIR(Name, 1, (model::Entry(v[1], [&] { return model::Name(v[0], v[1]); }, v[0])))
-#define TRIPLE(Name, target, ...) \
-  ZOR_BESIDE(Name, 3, target, (*v[1], *v[2]), (v[0], v[1], v[2]), \
-      (model::Entry(v[target], [&] { return model::Name(v[0], v[1], v[2]); }, __VA_ARGS__)))
-#define RELATION(Name) \
-  {#Name, 2, 0, [](ZORVadEnumString* const* v) { return TellOf([&](auto& b) { v[0]->Name(*v[1], b); }); }, \
-   [](ZORVaDoString* const* v) { return TellOf([&](auto& b) { v[0]->Name(*v[1], b); }); }, \
-   [](Set* v) { return model::Name(v[0], v[1]); }, [](Set* v) { return model::Name(v[0], v[1]); }}
+// Behind the tests of states that the entries of sets share. The sources of an inverse are the value it is called on.
+template <std::size_t kTarget, class Body>
+int EntryOf(Set* v, int operands, Body body) {
+  if (kTarget != 0) return model::Entry(v[kTarget], body, v[0]);
+  return operands == 2 ? model::Entry(v[0], body, v[1]) : model::Entry(v[0], body, v[1], v[2]);
+}
 
+#define PAIR(Name, target, ofEntry) ZOR_BESIDE(Name, 2, target, (*v[1]), (v[0], v[1]), ofEntry),
 #define TYPED_ALONE(Name) \
   {#Name, 2, 0, [](ZORVadEnumString* const* v) { return v[0]->Name(*v[1]); }, nullptr, \
    [](Set* v) { return model::Name(v[0], v[1]); }, nullptr}
+#define ZOR_Algebra(Name, ...)  PAIR(Name, 0, (model::Name(v[0], v[1]), 0))
+#define ZOR_Test(Name, ...)     PAIR(Name, 0, (model::Name(v[0], v[1])))
+#define ZOR_Equality(Name, ...) PAIR(Name, (zor::TargetOf<__VA_ARGS__>()), (model::Name(v[0], v[1])))
+#define ZOR_Pair(Name, ...) \
+  PAIR(Name, (zor::TargetOf<__VA_ARGS__>()), (EntryOf<zor::TargetOf<__VA_ARGS__>()>(v, 2, [&] { return model::Name(v[0], v[1]); })))
+#define ZOR_Triple(Name, ...) \
+  ZOR_BESIDE(Name, 3, (zor::TargetOf<__VA_ARGS__>()), (*v[1], *v[2]), (v[0], v[1], v[2]), \
+      (EntryOf<zor::TargetOf<__VA_ARGS__>()>(v, 3, [&] { return model::Name(v[0], v[1], v[2]); }))),
+#define ZOR_Truth(Name, ...) \
+  {#Name, 2, 0, [](ZORVadEnumString* const* v) { return TellOf([&](auto& b) { v[0]->Name(*v[1], b); }); }, \
+   [](ZORVaDoString* const* v) { return TellOf([&](auto& b) { v[0]->Name(*v[1], b); }); }, \
+   [](Set* v) { return model::Name(v[0], v[1]); }, [](Set* v) { return model::Name(v[0], v[1]); }},
+#define ZOR_Alone(...)
+#define ZOR_Length(...)
+#define ZOR_Form(...)
+#define ZOR_Slice(...)
+#define ROW(Shape, ...) ZOR_##Shape(__VA_ARGS__)
 
-const Operation<Set> kOperations[] = {
-  WORDLESS(Assign), WORDLESS(Intersect), WORDLESS(Unite), ALIKE(IsIntersected, 0),
-  ALIKE(CalcEqualValue, 0), ALIKE(CalcInverseEqualValue, 1), ALIKE(CalcUnequalValue, 0), ALIKE(CalcInverseUnequalValue, 1),
-  RELATION(CalcIsEqual), RELATION(CalcIsLessOrEqual), RELATION(CalcIsLess),
-  FORWARD(CalcLessValue), FORWARD(CalcLessOrEqualValue), FORWARD(CalcNotLessValue), FORWARD(CalcNotLessAndUnequalValue),
-  INVERSE(CalcInverseLessValue), INVERSE(CalcInverseLessOrEqualValue), INVERSE(CalcInverseNotLessValue),
-  INVERSE(CalcInverseNotLessAndUnequalValue), FORWARD(CalcNextValue), INVERSE(CalcInverseNextValue),
-  FORWARD(CalcLowerValue), INVERSE(CalcInverseLowerValue), FORWARD(CalcUpperValue), INVERSE(CalcInverseUpperValue),
-  TRIPLE(CalcMinValue, 0, v[1], v[2]), TRIPLE(CalcMaxValue, 0, v[1], v[2]), TRIPLE(CalcConcatenation, 0, v[1], v[2]),
-  TRIPLE(CalcFirstInverseMinValue, 1, v[0]), TRIPLE(CalcFirstInverseMaxValue, 1, v[0]),
-  TRIPLE(CalcFirstInverseConcatenation, 1, v[0]), TRIPLE(CalcSecondInverseConcatenation, 2, v[0]),
-  TYPED_ALONE(Copy), TYPED_ALONE(Append),
-};
+const Beside<Set> kBeside[] = {ZOR_STRING_OPERATIONS(ROW) TYPED_ALONE(Copy), TYPED_ALONE(Append)};
+
 #define SINGLE(Name, ofEntry) \
   {#Name, [](ZORVadEnumString& z, ZORVadSingleString& x) { return AnswerOf([&] { return z.Name(x); }); }, \
    [](ZORVaDoString& z, ZORVaDoString& x) { return AnswerOf([&] { return z.Name(x); }); }, \
@@ -101,7 +102,7 @@ const Str kSingles[] = {kNil, {kNilTag, "a"}, kAny, {kAnyTag, "b"}, kMax, kMin, 
 // clang-format on
 
 TEST(EnumModel, EveryCombination) {
-  for (const auto& operation : kOperations) ASSERT_NO_FATAL_FAILURE(CompareAll(operation, kSets, kTripled));
+  for (const auto& operation : kBeside) ASSERT_NO_FATAL_FAILURE(CompareAll(operation, kSets, kTripled));
 }
 
 template <class Form, class Model>
@@ -132,7 +133,7 @@ TEST(EnumModel, SingleOperands) {
 TEST(EnumModel, WrongOperands) {
   HeldSingle single(Text("b"));
   for (const Set& z : {Set("{a,b}"), Set("Nil"), Set("Any"), Set("Min"), Set("{b,Max}")}) {
-    for (const auto& operation : kOperations) {
+    for (const auto& operation : kBeside) {
       if (operation.entry == nullptr || operation.Is("CalcIsEqual", "CalcIsLessOrEqual", "CalcIsLess")) continue;
       CheckWrongOperands(operation, z, Set("{b}"), nullptr);
       if (operation.operands == 3) CheckWrongOperands(operation, z, Set("{b}"), &single.value);

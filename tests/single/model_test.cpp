@@ -10,22 +10,21 @@
 using namespace zor::test;
 
 // clang-format off
-#define TWO(Name, target)   ZOR_BESIDE(Name, 2, target, (*v[1]), (v[0], v[1]), (model::Name(v[0], v[1])))
-#define THREE(Name, target) ZOR_BESIDE(Name, 3, target, (*v[1], *v[2]), (v[0], v[1], v[2]), (model::Name(v[0], v[1], v[2])))
-#define WORDLESS(Name)      ZOR_BESIDE(Name, 2, 0, (*v[1]), (v[0], v[1]), (model::Name(v[0], v[1]), 0))
+#define PAIR(Name, target, ofEntry) ZOR_BESIDE(Name, 2, target, (*v[1]), (v[0], v[1]), ofEntry),
+#define ZOR_Algebra(Name, ...)  PAIR(Name, 0, (model::Name(v[0], v[1]), 0))
+#define ZOR_Test(Name, ...)     PAIR(Name, 0, (model::Name(v[0], v[1])))
+#define ZOR_Pair(Name, ...)     PAIR(Name, (zor::TargetOf<__VA_ARGS__>()), (model::Name(v[0], v[1])))
+#define ZOR_Equality ZOR_Pair
+#define ZOR_Form ZOR_Pair
+#define ZOR_Triple(Name, ...) \
+  ZOR_BESIDE(Name, 3, (zor::TargetOf<__VA_ARGS__>()), (*v[1], *v[2]), (v[0], v[1], v[2]), (model::Name(v[0], v[1], v[2]))),
+#define ZOR_Alone(...)
+#define ZOR_Truth(...)
+#define ZOR_Length(...)
+#define ZOR_Slice(...)  // below, with positions
+#define ROW(Shape, ...) ZOR_##Shape(__VA_ARGS__)
 
-static const Operation<Str> kOperations[] = {
-  THREE(CalcConcatenation, 0), THREE(CalcFirstInverseConcatenation, 1), THREE(CalcSecondInverseConcatenation, 2),
-  THREE(CalcMinValue, 0), THREE(CalcFirstInverseMinValue, 1), THREE(CalcMaxValue, 0), THREE(CalcFirstInverseMaxValue, 1),
-  TWO(CalcNextValue, 0), TWO(CalcInverseNextValue, 1), TWO(CalcEqualValue, 0), TWO(CalcInverseEqualValue, 1),
-  TWO(CalcLessValue, 0), TWO(CalcInverseLessValue, 1), TWO(CalcLessOrEqualValue, 0), TWO(CalcInverseLessOrEqualValue, 1),
-  TWO(CalcNotLessValue, 0), TWO(CalcInverseNotLessValue, 1),
-  TWO(CalcNotLessAndUnequalValue, 0), TWO(CalcInverseNotLessAndUnequalValue, 1),
-  TWO(CalcLowerValue, 0), TWO(CalcInverseLowerValue, 1), TWO(CalcUpperValue, 0), TWO(CalcInverseUpperValue, 1),
-  TWO(CalcUnequalValue, 0), TWO(CalcInverseUnequalValue, 1), TWO(IsIntersected, 0),
-  TWO(CalcStringRepresentation, 0), TWO(CalcInverseStringRepresentation, 1),
-  WORDLESS(Assign), WORDLESS(Intersect), WORDLESS(Unite),
-};
+static const Beside<Str> kBeside[] = {ZOR_STRING_OPERATIONS(ROW)};
 
 // The last ones are for operations on two strings alone.
 static const Str kValues[] = {
@@ -42,13 +41,13 @@ static const Int kPositions[] = {kNoNumber, kAnyNumber, Number(INT_MIN), Number(
                           Number(INT_MAX)};
 // clang-format on
 TEST(SingleModel, EveryCombination) {
-  for (const auto& operation : kOperations) ASSERT_NO_FATAL_FAILURE(CompareAll(operation, kValues, kOfThree));
+  for (const auto& operation : kBeside) ASSERT_NO_FATAL_FAILURE(CompareAll(operation, kValues, kOfThree));
 }
 
 TEST(SingleModel, WrongOperands) {
   ZORVadEnumString set(ZORString("b"));
   for (const Str& z : {Text("ab"), kAny, kMax}) {
-    for (const auto& operation : kOperations) {
+    for (const auto& operation : kBeside) {
       if (operation.Is("CalcStringRepresentation", "CalcInverseStringRepresentation")) continue;
       CheckWrongOperands(operation, z, Text("b"), nullptr);
       CheckWrongOperands(operation, z, Text("b"), &set);

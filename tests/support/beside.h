@@ -6,6 +6,7 @@
 #include <type_traits>
 #include <vector>
 
+#include "module/operations.h"
 #include "tests/support/values.h"
 
 namespace zor::test {
@@ -22,7 +23,7 @@ int AnswerOf(Call call) {
 }
 
 template <class Value>
-struct Operation {  // pairs leave the third operand alone
+struct Beside {  // pairs leave the third operand alone
   using Class = std::remove_reference_t<decltype(std::declval<typename Value::Held>().Typed())>;
   const char* name;
   int operands, target;
@@ -54,7 +55,7 @@ bool Shares(const Held (&held)[3]) {
 
 // Two calls in one form; pattern says which operands are one object. An unchanged target keeps its very texts.
 template <class Class, class Value, class Form, class Model>
-void Compare(const Operation<Value>& operation, const Value* v, const int* pattern, Form form, Model slow) {
+void Compare(const Beside<Value>& operation, const Value* v, const int* pattern, Form form, Model slow) {
   typename Value::Held held[] = {typename Value::Held(v[0]), typename Value::Held(v[1]), typename Value::Held(v[2])};
   const auto& target = held[pattern[operation.target]];
   Class* operands[3];
@@ -78,7 +79,7 @@ void Compare(const Operation<Value>& operation, const Value* v, const int* patte
 
 // nothing: what an operand that is not looked at has to be, so that it goes through once.
 template <class Value>
-void CompareForms(const Operation<Value>& operation, const Value* v, const Value& nothing) {
+void CompareForms(const Beside<Value>& operation, const Value* v, const Value& nothing) {
   for (const auto& pattern : kPatterns) {
     if (operation.operands == 2 && pattern[2] != 2) continue;
     // To itself a value is assigned without going through a list.
@@ -86,10 +87,10 @@ void CompareForms(const Operation<Value>& operation, const Value* v, const Value
     bool repeats = false;
     for (int i = 1; i < 3; ++i) repeats |= pattern[i] != i && !(v[i] == nothing);
     if (repeats) continue;
-    using Class = typename Operation<Value>::Class;
-    Compare<Class>(operation, v, pattern, &Operation<Value>::typed, &Operation<Value>::model);
+    using Class = typename Beside<Value>::Class;
+    Compare<Class>(operation, v, pattern, &Beside<Value>::typed, &Beside<Value>::model);
     if (operation.entry)
-      Compare<ZORVaDoString>(operation, v, pattern, &Operation<Value>::entry, &Operation<Value>::modelOfEntry);
+      Compare<ZORVaDoString>(operation, v, pattern, &Beside<Value>::entry, &Beside<Value>::modelOfEntry);
     ASSERT_FALSE(testing::Test::HasFatalFailure()) << v[0] << '.' << operation.name << ' ' << v[1] << ' ' << v[2]
                                                    << ", objects " << pattern[0] << pattern[1] << pattern[2];
   }
@@ -97,7 +98,7 @@ void CompareForms(const Operation<Value>& operation, const Value* v, const Value
 
 // Triples take the first values alone.
 template <class Value, std::size_t kCount>
-void CompareAll(const Operation<Value>& operation, const Value (&values)[kCount], std::size_t tripled) {
+void CompareAll(const Beside<Value>& operation, const Value (&values)[kCount], std::size_t tripled) {
   const bool pair = operation.operands == 2;
   const std::size_t n = pair ? kCount : tripled;
   for (std::size_t i = 0; i < (pair ? n * n : n * n * n); ++i) {
@@ -110,7 +111,7 @@ void CompareAll(const Operation<Value>& operation, const Value (&values)[kCount]
 // An operand that is missing, or of another class, makes Nil of the target of these three and tells the others
 // nothing; other are the operands beside it.
 template <class Value>
-void CheckWrongOperands(const Operation<Value>& operation, const Value& z, const Value& other, ZORVaDoString* wrong) {
+void CheckWrongOperands(const Beside<Value>& operation, const Value& z, const Value& other, ZORVaDoString* wrong) {
   for (int at = 1; at < operation.operands; ++at) {
     typename Value::Held held(z), second(other), third(other);
     ZORVaDoString* operands[] = {&held.value, &second.value, &third.value};
@@ -122,24 +123,20 @@ void CheckWrongOperands(const Operation<Value>& operation, const Value& z, const
   }
 }
 
-// An integer likewise.
+// An integer likewise, where the operation can be given one.
 template <class Value>
 void CheckIntegers(const Value& z) {
-  HeldInteger n(Number(7));
-  typename Value::Held held(z);
-  ZORVaDoString& v = held.Abstract();
-  ZORVaDoInteger& x = n.Abstract();
-  EXPECT_EQ(v.IsIntersected(x), z.tag == kAnyTag) << z;
-  for (const int answer : {v.CalcEqualValue(x), v.CalcInverseEqualValue(x), v.CalcUnequalValue(x), v.CalcLessValue(x),
-                           v.CalcInverseLessValue(x), v.CalcLessOrEqualValue(x), v.CalcInverseLessOrEqualValue(x),
-                           v.CalcNotLessValue(x), v.CalcInverseNotLessValue(x), v.CalcNotLessAndUnequalValue(x),
-                           v.CalcInverseNotLessAndUnequalValue(x), v.CalcNextValue(x), v.CalcInverseNextValue(x)})
-    EXPECT_EQ(answer, 0) << z;
-  EXPECT_TRUE(held.Now() == z && n.Now() == Number(7)) << z;
-  for (const auto clear : {&ZORVaDoAny::Assign, &ZORVaDoAny::Intersect, &ZORVaDoAny::Unite}) {
-    typename Value::Held cleared(z);
-    (cleared.Abstract().*clear)(x);
-    EXPECT_EQ(cleared.Now(), Value::Parse("Nil")) << z;
+  for (const Operation& operation : kOperations) {
+    const bool takesInteger =
+        operation.kinds[1] == Operation::Kind::Any || operation.kinds[1] == Operation::Kind::Scalar;
+    if (operation.operands != 2 || !takesInteger || operation.shape == Operation::Shape::Form) continue;
+    HeldInteger n(Number(7));
+    typename Value::Held held(z);
+    ZORVaDoAny* const operands[] = {&held.value, &n.Abstract()};
+    EXPECT_EQ(operation.call(operands), operation.shape == Operation::Shape::Test && z.tag == kAnyTag)
+        << operation.name;
+    const Value after = operation.shape == Operation::Shape::Algebra ? Value::Parse("Nil") : z;
+    EXPECT_TRUE(held.Now() == after && n.Now() == Number(7)) << operation.name << z;
   }
 }
 

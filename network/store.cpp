@@ -118,18 +118,6 @@ void Store::Fail(int variable) {
   Meet(variable, nil);
 }
 
-std::uint64_t Store::Changes() const {
-  std::uint64_t sum = 0;
-  for (const OperationCounts& counts : mCounts) sum += counts.changes;
-  return sum;
-}
-
-std::uint64_t Store::Calls() const {
-  std::uint64_t sum = 0;
-  for (const OperationCounts& counts : mCounts) sum += counts.calls;
-  return sum;
-}
-
 void Store::Undo() {
   const std::size_t mark = mMarks.back();
   mMarks.pop_back();

@@ -66,8 +66,6 @@ class Store {
   std::vector<int>& Touched() { return mTouched; }  // changed since the reader emptied it
 
   const std::array<OperationCounts, kOperations>& Counts() const { return mCounts; }
-  std::uint64_t Changes() const;
-  std::uint64_t Calls() const;
   void Watch(Watcher* watcher) { mWatcher = watcher; }
 
   // The value itself, for whoever wants the module's bare operations on it.

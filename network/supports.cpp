@@ -31,6 +31,31 @@ std::size_t Find(const Listing& listing, const Answer& answer) {
 
 }  // namespace
 
+bool Supports::Column::HasAll() const {
+  return IsRange() ? lowest == 0 && behindHighest == listing->count : dropped == 0;
+}
+
+bool Supports::Column::HasNone() const { return IsRange() ? behindHighest == 0 : dropped == kept.size(); }
+
+void Supports::Column::Start() {
+  kept.assign(IsListed() && !IsRange() ? listing->count : 0, 0);
+  dropped = kept.size();
+  lowest = IsListed() ? listing->count : 0;
+  behindHighest = 0;
+  found.clear();
+  open = met = false;
+}
+
+void Supports::Column::Keep(std::size_t place) {
+  if (IsRange()) {
+    lowest = std::min(lowest, place);
+    behindHighest = std::max(behindHighest, place + 1);
+  } else if (kept[place] == 0) {
+    kept[place] = 1;
+    --dropped;
+  }
+}
+
 bool Supports::Narrow(const Constraint& constraint) {
   Prepare(constraint);
   mTargets.clear();
@@ -44,8 +69,10 @@ bool Supports::Narrow(const Constraint& constraint) {
   }
   std::sort(mTargets.begin(), mTargets.end(),
             [](const auto& a, const auto& b) { return a.first != b.first ? a.first < b.first : a.second > b.second; });
+  const double driven = DrivenCost(constraint);
+  const bool isCheapest = mTargets.empty() || driven < mTargets.front().first;
   const auto reached = [&](const auto& target) { return Try(constraint, target.second); };
-  if (std::none_of(mTargets.begin(), mTargets.end(), reached)) return false;
+  if (!(isCheapest && Drive(constraint)) && std::none_of(mTargets.begin(), mTargets.end(), reached)) return false;
   Apply(constraint);
   return true;
 }
@@ -119,19 +146,17 @@ bool Supports::IsTried(const Column& column) const {
 // False when a listed target has more partners than can be listed.
 bool Supports::Try(const Constraint& constraint, int target) {
   const bool none = Combinations(constraint, target) == 0;
-  for (std::size_t i = 0; i < mCount; ++i) {
-    Column& column = mColumns[i];
-    column.kept.assign(column.IsListed() ? column.listing->count : 0, 0);
-    column.dropped = column.kept.size();
-    column.found.clear();
-    column.open = false;
-  }
+  Start();
   if (none) return true;
   for (Column* column : mTried) Choose(*column, 0);
   do {
     if (!TryOne(constraint, target)) return false;
-  } while (!AllKept() && Advance());
+  } while (!HasAll() && Advance());
   return true;
+}
+
+void Supports::Start() {
+  for (std::size_t i = 0; i < mCount; ++i) mColumns[i].Start();
 }
 
 bool Supports::TryOne(const Constraint& constraint, int target) {
@@ -148,7 +173,7 @@ bool Supports::TryOne(const Constraint& constraint, int target) {
     }
   }
   if (!accepted) return true;
-  for (Column* column : mTried) Keep(*column, column->index);
+  for (Column* column : mTried) column->Keep(column->index);
   return true;
 }
 
@@ -187,19 +212,13 @@ bool Supports::Accept(int target, Answer answer) {
   const std::size_t index = Find(*column.listing, answer);
   if (index == column.listing->count) return false;
   if (IsTried(column)) return index == column.index;
-  Keep(column, index);
+  column.Keep(index);
   return true;
 }
 
-void Supports::Keep(Column& column, std::size_t index) {
-  if (column.kept[index] != 0) return;
-  column.kept[index] = 1;
-  --column.dropped;
-}
-
-bool Supports::AllKept() const {
+bool Supports::HasAll() const {
   return std::all_of(mColumns.begin(), mColumns.begin() + static_cast<std::ptrdiff_t>(mCount),
-                     [](const Column& column) { return column.IsListed() && column.dropped == 0; });
+                     [](const Column& column) { return column.IsListed() && column.HasAll(); });
 }
 
 // A contradiction is to show in a variable rather than in a constant, and in the result rather than in an input.
@@ -209,7 +228,9 @@ void Supports::Apply(const Constraint& constraint) {
     for (int position = constraint.kind->Inputs(); position >= 0; --position) {
       Column& column = At(position);
       if (mStore.HasFailed()) return;
-      if (mStore.Declared(column.variable).constant == constants) Meet(column);
+      if (column.met || mStore.Declared(column.variable).constant != constants) continue;
+      column.met = true;  // where it stands at another position too
+      Meet(column);
     }
   }
 }
@@ -217,14 +238,11 @@ void Supports::Apply(const Constraint& constraint) {
 void Supports::Meet(Column& column) {
   if (!column.IsListed()) {
     MeetFound(column);
-  } else if (column.dropped == column.kept.size()) {
+  } else if (column.HasNone()) {
     mStore.Fail(column.variable);
-  } else if (IsText(column.listing->sort)) {
-    if (column.dropped != 0) MeetTexts(column);
-  } else if (column.dropped != 0 || column.listing == &column.clamped) {
-    MeetNumbers(column);
+  } else if (!column.HasAll() || column.listing == &column.clamped) {
+    IsText(column.listing->sort) ? MeetTexts(column) : MeetNumbers(column);
   }
-  column.dropped = 0;  // where the variable stands at another position too
 }
 
 void Supports::MeetTexts(Column& column) {
@@ -239,13 +257,14 @@ void Supports::MeetTexts(Column& column) {
 
 void Supports::MeetNumbers(Column& column) {
   std::vector<ZORLong> numbers;
+  if (column.IsRange())
+    numbers = {column.listing->NumberAt(column.lowest), column.listing->NumberAt(column.behindHighest - 1)};
   for (std::size_t i = 0; i < column.kept.size(); ++i) {
     if (column.kept[i] != 0) numbers.push_back(column.listing->NumberAt(i));
   }
   const Value& held = mStore[column.variable];
-  if (column.openAbove && column.kept.back() != 0) {
-    numbers.push_back(held.IsKnown() ? held.HighestNumber() : std::numeric_limits<ZORLong>::max());
-  }
+  if (column.openAbove && column.behindHighest == column.listing->count)
+    numbers.back() = held.IsKnown() ? held.HighestNumber() : std::numeric_limits<ZORLong>::max();
   Value& outcome = mStore.FreshLike(column.variable);
   outcome.SetNumbers(numbers);
   mStore.Meet(column.variable, outcome);

@@ -1,5 +1,8 @@
-// Narrowing of a function by trying combinations of what its arguments can be. A listed value without a partner among
-// the others is dropped; what an unknown argument can be is collected. One pass finds all that can be found this way.
+// Narrowing of a function by the combinations of what its arguments can be. A listed value without a partner among the
+// others is dropped; what an unknown argument can be is collected. One pass finds all that can be found this way.
+//
+// Combinations are tried one by one, or driven from the listed results: a result of a concatenation or slice is looked
+// for among the texts it begins with, so that what is tried is close to what is found.
 #pragma once
 
 #include <array>
@@ -19,19 +22,27 @@ class Supports {
   bool Narrow(const Constraint& constraint);
 
  private:
-  // One variable of the constraint: what it can be, and what of it has found a partner.
+  // One variable of the constraint: what it can be, and what of it has found a partner. Of numbers that are all from
+  // one to another the least and the greatest partner count alone, as no more of them can go.
   struct Column {
     int variable = kNone;
     const Listing* listing = nullptr;
     Listing clamped;         // in place of positions that are unknown or too many
     bool openAbove = false;  // the last of these stands for all positions above it too
     std::vector<char> kept;
-    std::size_t dropped = 0;    // not kept so far
-    std::size_t index = 0;      // what is tried
-    std::vector<Answer> found;  // what a variable can be that is not listed
-    bool open = false;          // it can be more than what was found
+    std::size_t dropped = 0;                    // of kept
+    std::size_t lowest = 0, behindHighest = 0;  // of a range
+    std::size_t index = 0;                      // what is tried
+    std::vector<Answer> found;                  // what a variable can be that is not listed
+    bool open = false;                          // it can be more than what was found
+    bool met = false;                           // its variable has been narrowed
 
     bool IsListed() const { return listing->known; }
+    bool IsRange() const { return !IsText(listing->sort) && listing->sort != Sort::IntegerSet; }
+    bool HasAll() const;
+    bool HasNone() const;
+    void Start();
+    void Keep(std::size_t place);
   };
 
   void Prepare(const Constraint& constraint);
@@ -39,12 +50,23 @@ class Supports {
   void ClampPosition(Column& column, std::int64_t last, bool openAbove);
   double Combinations(const Constraint& constraint, int target);
   bool Try(const Constraint& constraint, int target);
+  void Start();
   bool TryOne(const Constraint& constraint, int target);
   bool Advance();
   void Choose(Column& column, std::size_t index);
   bool Accept(int target, Answer answer);
-  void Keep(Column& column, std::size_t index);
-  bool AllKept() const;
+  bool HasAll() const;
+
+  double DrivenCost(const Constraint& constraint);
+  bool Drive(const Constraint& constraint);
+  bool Spend();
+  bool DriveConcatenation();
+  bool Split(std::size_t result);
+  bool KeepDoubled(std::size_t result);
+  void KeepOverflow(std::size_t greatest);
+  bool DriveSlice();
+  bool Slice(std::size_t text, std::size_t from);
+  void KeepSlice(std::size_t text, std::size_t from, std::size_t result, std::size_t first, std::size_t last);
 
   void Apply(const Constraint& constraint);
   void Meet(Column& column);
@@ -62,6 +84,7 @@ class Supports {
   std::array<std::size_t, kMostArguments> mColumnOf{};  // by position
   std::array<Exact, kMostArguments> mExact{};           // what is tried, by position
   int mArity = 0;
+  std::size_t mTries = 0;                        // left of the budget of a driven pass
   std::vector<Column*> mTried;                   // the columns whose combinations are tried
   std::vector<std::pair<double, int>> mTargets;  // by what it costs to reach them; the result ahead of its equals
 };

@@ -7,10 +7,10 @@ namespace zornet {
 
 namespace {
 
-// The count wraps like every sum of the solver's integers.
-ZORString Slice(const ZORString& text, ZORLong from, ZORLong to) {
-  const auto count = static_cast<ZORLong>(static_cast<std::uint32_t>(to) + 1 - static_cast<std::uint32_t>(from));
-  return text.SubString(static_cast<std::size_t>(from), static_cast<std::size_t>(count));
+ZORString Slice(const ZORString& text, std::int64_t from, std::int64_t to) {
+  const std::int64_t last = std::min<std::int64_t>(to, text.GetLengthInChar() - 1);
+  if (from < 0 || from > last) return {};
+  return text.SubString(static_cast<std::size_t>(from), static_cast<std::size_t>(last - from + 1));
 }
 
 bool EndsWithSpace(const ZORString& text) { return ToView(text).ends_with(' '); }
@@ -18,18 +18,17 @@ bool EndsWithSpace(const ZORString& text) { return ToView(text).ends_with(' '); 
 }  // namespace
 
 Truth::Truth(const Types& types)
-    : mX(types, Sort::Text),
-      mY(types, Sort::Text),
-      mZ(types, Sort::Text),
-      mFrom(types, Sort::Integer),
-      mTo(types, Sort::Integer) {
+    : mX(types, Sort::Text), mY(types, Sort::Text), mZ(types, Sort::Text), mLength(types, Sort::Integer) {
   for (int i = 0; i < kSorts; ++i) mForms.emplace_back(types, static_cast<Sort>(i));
 }
 
 // Operands are Exact throughout, the greatest text too: as a Max it would be folded by state.
 bool Truth::Compute(const Kind& kind, const Exact* inputs, Answer& result) {
   if (kind.meaning == Meaning::TextForm) return ComputeTextForm(inputs[0], result);
-  if (kind.meaning == Meaning::Slice) return ComputeSlice(inputs, result);
+  if (kind.meaning == Meaning::Slice) {
+    result.text = Slice(*inputs[0].text, inputs[1].number, inputs[2].number);
+    return true;
+  }
   mX.Text().SetExactValue(*inputs[0].text);
   if (kind.Inputs() == 2) mY.Text().SetExactValue(*inputs[1].text);
   mZ.Reset();
@@ -57,30 +56,15 @@ bool Truth::Compute(const Kind& kind, const Exact* inputs, Answer& result) {
       }
       break;
     case Meaning::Length:
-      mFrom.Reset();
-      mX.Text().CalcLength(mFrom.Integer());
-      result.number = mFrom.Integer().GetExactValue();
+      mLength.Reset();
+      mX.Text().CalcLength(mLength.Integer());
+      result.number = mLength.Integer().GetExactValue();
       return true;
     default:
       return false;
   }
   result.text = mZ.Text().GetLowerBound();
   return !mZ.IsNil();
-}
-
-bool Truth::ComputeSlice(const Exact* inputs, Answer& result) {
-  const ZORString& source = *inputs[0].text;
-  if (IsLeastSomewhere(source)) {
-    result.text = Slice(source, inputs[1].number, inputs[2].number);
-    return true;
-  }
-  mX.Text().SetExactValue(source);
-  mFrom.Integer().SetExactValue(inputs[1].number);
-  mTo.Integer().SetExactValue(inputs[2].number);
-  mZ.Reset();
-  mZ.Text().CalcSubString(mX.Text(), mFrom.Integer(), mTo.Integer());
-  result.text = mZ.Text().GetLowerBound();
-  return true;
 }
 
 bool Truth::ComputeTextForm(const Exact& value, Answer& result) {

@@ -1,11 +1,13 @@
 // The meaning of the constraints on exact values: the one place that says what a solution is. What the propagation
 // keeps or drops is judged by it.
 //
-// A function is computed by the module's forward operation on fresh single values; only where the module answers by
-// state instead of by text, on one space, the texts themselves decide. Equality and order are those of the texts.
+// A function is computed by the module's forward operation on fresh single values. The texts themselves decide where
+// the module answers by state instead of by text, on one space, and where its sums wrap, on slices. Equality and order
+// are those of the texts.
 //
 //   concatenation  of more than 255 characters: the greatest text
-//   slice          positions from 0, both ends in; what lies outside the text is left out
+//   slice          positions from 0, both ends in; an end behind the text is the last character; empty when it begins
+//                  below 0, behind the text, or behind its own end
 //   successor      of the greatest text: itself
 //   text form      of more than 255 characters: none
 #pragma once
@@ -51,7 +53,6 @@ class Truth {
   bool Holds(const Kind& kind, const Exact* values);
 
  private:
-  bool ComputeSlice(const Exact* inputs, Answer& result);
   bool ComputeTextForm(const Exact& value, Answer& result);
   Value& FormOf(Sort sort);
   bool Gives(const Kind& kind, int position, const Answer& input, const Exact* values);
@@ -60,7 +61,7 @@ class Truth {
   void Take(std::vector<Answer>& proposals, const Value& target);
 
   Value mX, mY, mZ;           // single texts
-  Value mFrom, mTo;           // single integers
+  Value mLength;              // a single integer
   std::vector<Value> mForms;  // one of each sort, for text forms
 };
 

@@ -1,6 +1,7 @@
 #include "network/functions.h"
 
 #include <algorithm>
+#include <limits>
 
 namespace zornet {
 
@@ -27,6 +28,12 @@ Operation ForwardOf(Meaning meaning) {
     default:
       return Operation::TextForm;
   }
+}
+
+std::size_t ShortestOf(const Listing& listing) {
+  std::size_t shortest = kTextLimit;
+  for (const ZORString& text : listing.texts) shortest = std::min(shortest, ToView(text).size());
+  return shortest;
 }
 
 std::size_t LongestOf(const Listing& listing) {
@@ -61,6 +68,8 @@ Progress Functions::Narrow(const Constraint& constraint) {
   }
   if (mStore[constraint.Result()].IsUndefined() && ComputeSets(constraint)) return Progress::Waits;
   if (mSupports.Narrow(constraint)) return Progress::Waits;
+  if (constraint.kind->meaning == Meaning::Slice && BoundSlice(constraint)) return Progress::Done;
+  if (mStore.HasFailed()) return Progress::Waits;
   ComputeSets(constraint);
   return Progress::Again;  // where the result is an input too
 }
@@ -178,17 +187,71 @@ void Functions::MeetSet(int variable, const Value& set) {
 
 // Of a text of which nothing is known the length is known all the same to be possible.
 void Functions::BoundLength(int number) {
-  const Value& held = mStore[number];
-  if (!held.IsKnown()) return;
-  Value& outcome = mStore.FreshLike(number);
-  if (held.Sort() == Sort::Interval) {
-    outcome.SetNumbers({0, static_cast<ZORLong>(kTextLimit)});
-  } else {
-    std::vector<ZORLong> possible = held.Numbers();
-    std::erase_if(possible, [](ZORLong n) { return n < 0 || n > static_cast<ZORLong>(kTextLimit); });
-    outcome.SetNumbers(possible);
-  }
   mStore.StartOperation(Operation::Length);
+  Bound(number, 0, kTextLimit);
+}
+
+// What the positions and the slice tell of each other, whatever the text is. True when the slice is empty for sure.
+bool Functions::BoundSlice(const Constraint& constraint) {
+  const auto [text, from, to, slice] = constraint.arguments;
+  const Value &begin = mStore[from], &end = mStore[to], &part = mStore[slice];
+  const std::int64_t last = static_cast<std::int64_t>(kTextLimit) - 1;
+  const std::int64_t lastBegin = begin.IsKnown() ? begin.HighestNumber() : last,
+                     lastEnd = end.IsKnown() ? end.HighestNumber() : last;
+  const std::int64_t firstBegin = begin.IsKnown() ? begin.LowestNumber() : 0;
+  mStore.StartOperation(Operation::Slice);
+  if (lastBegin < 0 || firstBegin > last || lastEnd < firstBegin) {
+    MeetResult(constraint, {});
+    return true;
+  }
+  if (!part.IsKnown()) return false;
+  const std::size_t shortest = ShortestOf(mStore.List(slice));
+  if (shortest > 0) BoundPositions(from, to, shortest);
+  if (!mStore.HasFailed()) DropLongTexts(slice, lastEnd - std::max<std::int64_t>(firstBegin, 0) + 1);
+  return false;
+}
+
+// A slice of so many characters begins inside the longest text, and ends no earlier than they do.
+void Functions::BoundPositions(int from, int to, std::size_t shortest) {
+  const auto length = static_cast<std::int64_t>(shortest);
+  const Value& end = mStore[to];
+  const std::int64_t lastEnd = end.IsKnown() ? end.HighestNumber() : kTextLimit;
+  Bound(from, 0, std::min<std::int64_t>(lastEnd, kTextLimit - 1) - length + 1);
+  if (mStore.HasFailed()) return;
+  const Value& begin = mStore[from];
+  const std::int64_t firstBegin = begin.IsKnown() ? begin.LowestNumber() : 0;
+  Bound(to, firstBegin + length - 1, std::numeric_limits<ZORLong>::max());
+}
+
+void Functions::DropLongTexts(int variable, std::int64_t longest) {
+  const Listing& listing = mStore.List(variable);
+  std::vector<ZORString> kept;
+  for (const ZORString& text : listing.texts) {
+    if (text.GetLengthInChar() <= longest) kept.push_back(text);
+  }
+  if (kept.size() == listing.count) return;
+  if (kept.empty()) return mStore.Fail(variable);
+  Value& outcome = mStore.FreshLike(variable);
+  outcome.SetTexts(kept);
+  mStore.Meet(variable, outcome);
+}
+
+// Keeps the numbers from lowest to highest. Of a single number that is unknown nothing is known afterwards either,
+// unless one is left.
+void Functions::Bound(int number, std::int64_t lowest, std::int64_t highest) {
+  const Value& held = mStore[number];
+  if (held.IsKnown() && held.LowestNumber() >= lowest && held.HighestNumber() <= highest) return;
+  if (lowest > highest) return mStore.Fail(number);
+  Value& outcome = mStore.FreshLike(number);
+  if (held.Sort() == Sort::IntegerSet && held.IsKnown()) {
+    std::vector<ZORLong> possible = held.Numbers();
+    std::erase_if(possible, [&](ZORLong n) { return n < lowest || n > highest; });
+    outcome.SetNumbers(possible);
+  } else if (held.Sort() == Sort::Integer && held.IsKnown()) {
+    return mStore.Fail(number);
+  } else {
+    outcome.SetNumbers({static_cast<ZORLong>(lowest), static_cast<ZORLong>(highest)});
+  }
   mStore.Meet(number, outcome);
 }
 

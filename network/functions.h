@@ -25,6 +25,10 @@ class Functions {
   const Value& AsSet(int variable, Value& set);
   void MeetSet(int variable, const Value& set);
   void BoundLength(int number);
+  bool BoundSlice(const Constraint& constraint);
+  void BoundPositions(int from, int to, std::size_t shortest);
+  void DropLongTexts(int variable, std::int64_t longest);
+  void Bound(int number, std::int64_t lowest, std::int64_t highest);
 
   Store& mStore;
   Truth mTruth;

@@ -1,5 +1,7 @@
 #include "network/propagation.h"
 
+#include "network/order_cycles.h"
+
 namespace zornet {
 
 namespace {
@@ -34,6 +36,7 @@ void Propagation::Connect() {
 }
 
 Outcome Propagation::Run() {
+  if (mSteps == 0) FailOrderCycle();
   if (mStore.HasFailed()) return Outcome::Contradiction;
   WakeReaders(kNone);
   while (mWaiting != 0) {
@@ -46,6 +49,16 @@ Outcome Propagation::Run() {
     WakeReaders(progress == Progress::Again ? kNone : constraint);
   }
   return Outcome::Settled;
+}
+
+// Once, before the first pass.
+void Propagation::FailOrderCycle() {
+  const int constraint = FindOrderCycle(mModel);
+  if (constraint == kNone) return;
+  const Constraint& order = mModel.Constraints()[static_cast<std::size_t>(constraint)];
+  mStore.StartConstraint(constraint);
+  mStore.StartOperation(Operation::LessOrEqual);
+  mStore.Fail(order.arguments[order.kind->mirrored ? 1 : 0]);
 }
 
 Progress Propagation::Narrow(int constraint) {

@@ -32,6 +32,7 @@ class Propagation {
   void Connect();
   void Wake(int constraint);
   void WakeReaders(int except);
+  void FailOrderCycle();
   Progress Narrow(int constraint);
   int Next();
 

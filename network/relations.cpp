@@ -115,7 +115,7 @@ void Relations::Remove(int target, const ZORString& text) {
 // above and unequal, since on sets the module compares the upper bounds alone.
 Progress Relations::Ordered(int x, int y, bool strict) {
   if (!mStore[x].IsKnown() || !mStore[y].IsKnown()) {
-    if (strict) FailBeyondEnds(x, y);
+    if (strict) NarrowBeyondEnds(x, y);
     return Progress::Waits;
   }
   const ZORString lowest = mStore[x].LowestText(), highest = mStore[y].HighestText();
@@ -126,14 +126,17 @@ Progress Relations::Ordered(int x, int y, bool strict) {
   return Progress::Waits;
 }
 
-// Below the least text there is none, nor above the greatest.
-void Relations::FailBeyondEnds(int x, int y) {
+// No text is less than the least one, and none greater than the greatest.
+void Relations::NarrowBeyondEnds(int x, int y) {
   if (mStore[y].IsKnown() && mStore[y].HighestText().GetLengthInChar() == 0) {
     mStore.StartOperation(Operation::LessOrEqual);
     mStore.Fail(x);
   } else if (mStore[x].IsKnown() && mStore[x].LowestText() == GreatestText()) {
     mStore.StartOperation(Operation::NotLess);
     mStore.Fail(y);
+  } else {
+    if (mStore[y].IsKnown() && mStore[y].LowestText().GetLengthInChar() == 0) Remove(y, ZORString());
+    if (mStore[x].IsKnown() && mStore[x].HighestText() == GreatestText()) Remove(x, GreatestText());
   }
 }
 

@@ -29,7 +29,7 @@ class Relations {
 
   void Equate(int target, int other);
   void Remove(int target, const ZORString& text);
-  void FailBeyondEnds(int x, int y);
+  void NarrowBeyondEnds(int x, int y);
   void CutAbove(int target, const ZORString& bound, bool strict);
   void CutBelow(int target, const ZORString& bound, bool strict);
   void LowerTo(const ZORString& bound, const ZORString& highest, Value& outcome);

@@ -18,7 +18,29 @@ struct Row {
 const Row kNetworks[] = {
   {"a known result is not overwritten where an operand is unknown",
    "var string: x; var string: z = \"ab\"; constraint str_concat(x, \"b\", z);", "\"a\", \"ab\""},
-  {"what two unknown halves are stays open", "var string: x; constraint str_concat(x, x, \"abab\");", "Any"},
+  {"a text twice is half of the result", "var string: x; constraint str_concat(x, x, \"abab\");", "\"ab\""},
+  {"what is no text twice goes",
+   "var set string: x; var {\"aa\", \"ab\", \"bcbc\"}: z; constraint str_concat(x, x, z);",
+   "{ \"a\", \"bc\" }, { \"aa\", \"bcbc\" }"},
+  {"a slice whose end is far below its beginning is empty",
+   "var {-2147483647, 3}: to; constraint str_substr(\"zzzzzz\", 5, to, \"\");", "{ -2147483647, 3 }"},
+  {"for one text too", "var string: z; constraint str_substr(\"abcdefgh\", 5, -2147483648, z);", "\"\""},
+  {"backwards too", "var {\"zaZa\", \"a\"}: x; constraint str_substr(x, 3, -2147483647, \"\");", "{ \"a\", \"zaZa\" }"},
+  {"an end far behind the text", "var string: z; constraint str_substr(\"abc\", 0, 2147483647, z);", "\"abc\""},
+  {"positions behind every text", "var string: x; var set string: z; constraint str_substr(x, 255, 300, z);", "Any, Min"},
+  {"a slice that is not empty lies inside the longest text",
+   "var string: x; var -9..900: from; var 0..800: to; var {\"abc\", \"ab\"}: z; constraint str_substr(x, from, to, z);",
+   "Any, 0..253, 1..800, { \"ab\", \"abc\" }"},
+  {"nor is it longer than its positions allow",
+   "var string: x; var {\"abcd\", \"ab\"}: z; constraint str_substr(x, 2, 4, z);", "Any, \"ab\""},
+  {"more numbers than memory has room for",
+   "var 0..2000000000: v; var {\"1\", \"2\"}: x; constraint str_text(v, x);", "1..2, { \"1\", \"2\" }"},
+  {"the length of a text of which nothing is known",
+   "var string: x; var {254, 255, 256}: n; constraint str_length(x, n);", "Any, { 254, 255 }"},
+  {"orders in a circle",
+   "var string: a; var string: b; var string: c; constraint str_lt(a, b); constraint str_eq(b, c); constraint str_ge(a, c);",
+   "Nil, Any, Any"},
+  {"above an unknown text", "var string: x; var {\"\", \"a\"}: y; constraint str_lt(x, y);", "Any, \"a\""},
   {"nor does an unknown minimum", "var string: x; var string: z = \"b\"; constraint str_min(x, \"c\", z);", "\"b\", \"b\""},
   {"the least text does not replace what it is compared with",
    "var string: x = \"a\"; var string: y = \" \"; constraint str_eq(x, y);", "Nil, Min"},
@@ -129,12 +151,32 @@ TEST(Propagation, MorePairsThanASetLists) {
 TEST(Propagation, Budget) {
   const std::string model =
       "var {\"a\", \"b\"}: x; var {\"c\", \"d\"}: y; var {\"ac\", \"bx\", \"q\"}: z; constraint str_concat(x, y, z);";
-  Solved within(model), beyond(model, {1, 1000});
+  Solved within(model), beyond(model, {0, 1000});
   within.Narrow();
   beyond.Narrow();
   EXPECT_EQ(within.Print("x"), "\"a\"");
   EXPECT_EQ(beyond.Print("x"), "{ \"a\", \"b\" }");
   EXPECT_EQ(beyond.Print("z"), "\"ac\"");
+}
+
+// Many combinations with few results: one result in 300 pairs.
+TEST(Propagation, IsDrivenFromTheResults) {
+  std::string x, y, z, slices;
+  for (int i = 0; i < 300; ++i) {
+    const std::string first = i % 2 == 0 ? ", \"" : ", \"x";
+    x += fmt::format("{}{}-\"", first, i);
+    y += fmt::format("{}{}\"", first, i);
+    z += fmt::format(", \"{}-{}\"", i, i);
+    slices += fmt::format(", \"-{}\"", i);
+  }
+  const auto set = [](const std::string& list) { return "var {" + list.substr(2) + "}: "; };
+  Solved joined(set(x) + "x; " + set(y) + "y; " + set(z) + "z; constraint str_concat(x, y, z);");
+  joined.Narrow();
+  for (const char* name : {"x", "y", "z"}) EXPECT_EQ(joined[name].Texts().size(), 150u) << name;
+  Solved cut(set(z) + "x; var 0..9: from; var 1..12: to; " + set(slices) + "z; constraint str_substr(x, from, to, z);");
+  cut.Narrow();
+  EXPECT_EQ(cut.Print("from") + ' ' + cut.Print("to"), "1..3 2..12");
+  EXPECT_EQ(cut["z"].Texts().size(), 300u);
 }
 
 TEST(Propagation, StepLimit) {

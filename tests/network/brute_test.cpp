@@ -133,7 +133,7 @@ TEST_P(BruteForce, LosesNoSolution) {
     Texts universe;
     const naive::Network network = naive::Random(random, universe);
     // The lower budgets leave large sets to the module's own operations, without the supports.
-    for (const std::size_t budget : {65536, 6, 1}) {
+    for (const std::size_t budget : {65536, 6, 2, 0}) {
       ASSERT_NO_FATAL_FAILURE(Check(network, universe, budget).Run()) << "network " << i << ", budget " << budget;
     }
   }

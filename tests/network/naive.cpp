@@ -1,6 +1,7 @@
 #include "tests/network/naive.h"
 
 #include <algorithm>
+#include <limits>
 #include <set>
 
 namespace naive {
@@ -239,7 +240,10 @@ class Maker {
   }
 
   void AddNumber() {
-    const auto from = static_cast<std::int64_t>(Draw(5)) - 2;
+    const std::int64_t least = std::numeric_limits<std::int32_t>::min(),
+                       greatest = std::numeric_limits<std::int32_t>::max();
+    const std::size_t end = Draw(8);  // now and then near an end of all numbers
+    const std::int64_t from = end == 0 ? least : end == 1 ? greatest - 5 : static_cast<std::int64_t>(Draw(5)) - 2;
     Variable variable{Type::Integer, {}};
     const std::size_t kind = Draw(4);
     if (kind == 1) variable.domain = {{"", from}};
@@ -251,6 +255,7 @@ class Maker {
     if (kind == 3) {
       variable.type = Type::IntegerSet;
       variable.domain = {{"", from}, {"", from + 2}, {"", from + 3 + static_cast<std::int64_t>(Draw(3))}};
+      if (Draw(4) == 0) variable.domain = {{"", least}, {"", static_cast<std::int64_t>(Draw(4))}, {"", greatest}};
     }
     mNetwork.variables.push_back(std::move(variable));
   }

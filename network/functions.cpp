@@ -52,8 +52,8 @@ Functions::Functions(Store& store, std::size_t budget)
       mY(store.Types(), Sort::TextSet),
       mZ(store.Types(), Sort::TextSet) {}
 
-// Exact inputs give the result by one forward operation. A result of which nothing is known takes what the module
-// makes of the sets of inputs; everything else is a matter of supports, or of the sets again when these are too many.
+// Inputs with one value each give the result by one forward operation. An Undefined result takes what the module makes
+// of the sets of inputs. Everything else needs supports, or the module's sets again where these exceed the budget.
 Progress Functions::Narrow(const Constraint& constraint) {
   if (HasExactInputs(constraint)) {
     ComputeExact(constraint);
@@ -63,7 +63,7 @@ Progress Functions::Narrow(const Constraint& constraint) {
   if (mStore.HasFailed()) return Progress::Waits;
   if (constraint.kind->meaning == Meaning::Successor && constraint.arguments[0] == constraint.Result()) {
     mStore.StartOperation(Operation::Successor);
-    MeetResult(constraint, {GreatestText(), 0});  // the one text that is its own
+    MeetResult(constraint, {GreatestText(), 0});  // the greatest text is its own successor
     return Progress::Done;
   }
   if (mStore[constraint.Result()].IsUndefined() && ComputeSets(constraint)) return Progress::Waits;
@@ -71,7 +71,7 @@ Progress Functions::Narrow(const Constraint& constraint) {
   if (constraint.kind->meaning == Meaning::Slice && BoundSlice(constraint)) return Progress::Done;
   if (mStore.HasFailed()) return Progress::Waits;
   ComputeSets(constraint);
-  return Progress::Again;  // where the result is an input too
+  return Progress::Again;  // the result may be an input too
 }
 
 bool Functions::HasExactInputs(const Constraint& constraint) const {
@@ -111,12 +111,12 @@ void Functions::MeetResult(const Constraint& constraint, const Answer& answer) {
   mStore.Meet(constraint.Result(), outcome);
 }
 
-// False when the module has no such operation on sets, or when it would not tell all.
+// False when the module has no such operation on sets, or when it would lose results.
 bool Functions::ComputeSets(const Constraint& constraint) {
   const Kind& kind = *constraint.kind;
   if (kind.meaning == Meaning::Slice || kind.meaning == Meaning::TextForm) return false;
   const int first = constraint.arguments[0], second = constraint.arguments[1];
-  if (kind.Inputs() == 2 && first == second) return false;  // pairs of equal texts are fewer than all pairs
+  if (kind.Inputs() == 2 && first == second) return false;  // the module would pair different texts too
   if (!mStore[first].IsKnown() || (kind.Inputs() == 2 && !mStore[second].IsKnown())) return false;
   const Value& x = AsSet(first, mX);
   if (kind.meaning == Meaning::Length) {
@@ -137,7 +137,7 @@ bool Functions::ComputeSets(const Constraint& constraint) {
 bool Functions::CallSets(const Constraint& constraint, const Value& x, const Value& y, Value& result) {
   const Meaning meaning = constraint.kind->meaning;
   if (meaning == Meaning::Concatenation && MayOverflow(constraint)) return false;
-  // Of a set with "" alone the module takes one space for the lower bound, and would put it into the result.
+  // The module takes one space for the lower bound of a set that lists "" alone, and would put it into the result.
   const bool leastBound = x.LowestText().GetLengthInChar() == 0 && y.LowestText().GetLengthInChar() == 0;
   if (meaning == Meaning::Maximum && leastBound) return false;
   mStore.StartOperation(ForwardOf(meaning));
@@ -165,7 +165,7 @@ bool Functions::CallSets(const Constraint& constraint, const Value& x, const Val
   return true;
 }
 
-// Sets list a concatenation of any length, where it should become the greatest text.
+// The module lists concatenations of any length in sets; here those above the limit are the greatest text.
 bool Functions::MayOverflow(const Constraint& constraint) {
   const std::size_t longest = LongestOf(mStore.List(constraint.arguments[0]));
   return longest + LongestOf(mStore.List(constraint.arguments[1])) > kTextLimit;
@@ -185,13 +185,13 @@ void Functions::MeetSet(int variable, const Value& set) {
   mStore.Meet(variable, outcome);
 }
 
-// Of a text of which nothing is known the length is known all the same to be possible.
+// Even the length of an unknown text lies within the limit.
 void Functions::BoundLength(int number) {
   mStore.StartOperation(Operation::Length);
   Bound(number, 0, kTextLimit);
 }
 
-// What the positions and the slice tell of each other, whatever the text is. True when the slice is empty for sure.
+// Narrows positions and slice by each other, whatever the text is. True when the slice must be empty.
 bool Functions::BoundSlice(const Constraint& constraint) {
   const auto [text, from, to, slice] = constraint.arguments;
   const Value &begin = mStore[from], &end = mStore[to], &part = mStore[slice];
@@ -236,8 +236,7 @@ void Functions::DropLongTexts(int variable, std::int64_t longest) {
   mStore.Meet(variable, outcome);
 }
 
-// Keeps the numbers from lowest to highest. Of a single number that is unknown nothing is known afterwards either,
-// unless one is left.
+// Keeps the numbers from lowest to highest. An unknown single number stays unknown unless one number is left.
 void Functions::Bound(int number, std::int64_t lowest, std::int64_t highest) {
   const Value& held = mStore[number];
   if (held.IsKnown() && held.LowestNumber() >= lowest && held.HighestNumber() <= highest) return;

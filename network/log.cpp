@@ -20,7 +20,7 @@ void Log::Narrowed(const Narrowing& narrowing) {
   mEntries.push_back(std::move(entry));
 }
 
-// Causes come before what they cause, so that one walk backwards meets everything that is needed.
+// Causes come before their effects, so one walk backwards meets all of them.
 Explanation Log::Explain(int variable) const {
   Explanation explanation;
   std::vector<char> needed(mEntries.size(), 0), used(mModel.Variables().size(), 0);

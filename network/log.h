@@ -1,4 +1,4 @@
-// Remembers every narrowing with what it followed from, and tells why a variable is what it is.
+// Records every narrowing with its causes, to explain the value of a variable.
 #pragma once
 
 #include <vector>
@@ -13,7 +13,7 @@ class Log : public Watcher {
 
   void Narrowed(const Narrowing& narrowing) override;
 
-  // What brought variable to what it is; of declared the variables alone.
+  // The narrowings that led to the value; of `declared` only the variables.
   Explanation Explain(int variable) const;
 
  private:

@@ -1,4 +1,4 @@
-// Names of what a propagation calls, for its statistics and traces.
+// What a propagation calls, by name, for statistics and traces.
 #pragma once
 
 #include <array>
@@ -30,7 +30,7 @@ enum class Operation {
 };
 inline constexpr std::size_t kOperations = static_cast<std::size_t>(Operation::Choice) + 1;
 
-// The operation of the module; in lower case what the runner does by itself.
+// The module's operation; in lower case what the propagation does by itself.
 constexpr std::string_view NameOf(Operation operation) {
   constexpr std::array<std::string_view, kOperations> kNames = {"CalcEqualValue",
                                                                 "CalcInverseEqualValue",

@@ -111,8 +111,8 @@ void Relations::Remove(int target, const ZORString& text) {
   mStore.Meet(target, outcome);
 }
 
-// x <= y or x < y: what x has above all of y goes, and what y has below all of x. A strict order is posted as not
-// above and unequal, since on sets the module compares the upper bounds alone.
+// x <= y or x < y: x loses what is greater than all of y, and y what is less than all of x. A strict order is posted as
+// less-or-equal and unequal, since the module compares only the upper bounds of sets.
 Progress Relations::Ordered(int x, int y, bool strict) {
   if (!mStore[x].IsKnown() || !mStore[y].IsKnown()) {
     if (strict) NarrowBeyondEnds(x, y);
@@ -166,7 +166,7 @@ void Relations::CutBelow(int target, const ZORString& bound, bool strict) {
   mStore.Meet(target, outcome);
 }
 
-// The module's bound of a set of "" alone is one space.
+// The module answers one space for the bounds of a set that lists "" alone.
 void Relations::RaiseTo(const ZORString& bound, const ZORString& lowest, Value& outcome) {
   const bool single = outcome.Sort() == Sort::Text;
   if (single ? IsLeastSomewhere(bound) || IsLeastSomewhere(lowest) : outcome.Text().IsEmpty() != 0) {
@@ -182,8 +182,8 @@ void Relations::RemoveFrom(Value& outcome, const ZORString& text) {
   outcome.Text().CalcUnequalValue(mSingle.Any());
 }
 
-// An upper bound as an operand: a value that is not at the least of its class, which the module takes for the least
-// of all.
+// An upper bound as an operand. One space goes into a set: as a single value it is the least of its class, which the
+// module takes for the least of all.
 Value& Relations::Bound(const ZORString& text) {
   Value& bound = text == " " ? mSet : mSingle;
   bound.Text().SetExactValue(text);
@@ -202,7 +202,7 @@ Progress Relations::Decide(Meaning meaning, int x, int y, int truth) {
   return Progress::Done;
 }
 
-// False while the relation is open. Where the least texts are concerned, it is asked of the texts and not the module.
+// False while the relation is open. Where the module would judge least texts by their state, their texts decide.
 bool Relations::Ask(Meaning meaning, int x, int y, Value& answer) {
   const Value& left = OperandFor(x, mSingle);
   const Value& right = OperandFor(y, mOther);
@@ -238,7 +238,7 @@ void Relations::AskOrder(Meaning meaning, const Value& left, const Value& right,
   }
 }
 
-// The variable's value, or its text as an Exact value where it is the greatest: the module judges Max by its state.
+// The variable's value; the greatest text as an Exact value, since the module judges Max by its state.
 const Value& Relations::OperandFor(int variable, Value& plain) {
   const Value& value = mStore[variable];
   if (value.Sort() == Sort::TextSet || value.Text().IsFull() == 0) return value;

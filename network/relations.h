@@ -1,4 +1,4 @@
-// Equality and order between two strings, posted or told by a truth value.
+// Equality and order between two strings, posted or reified.
 #pragma once
 
 #include "network/store.h"
@@ -42,7 +42,7 @@ class Relations {
   Value& Bound(const ZORString& text);
 
   Store& mStore;
-  Value mSingle, mOther;  // single texts that are Exact also where they are the greatest
+  Value mSingle, mOther;  // single texts that are Exact even when they are the greatest
   Value mSet;
   Value mTruth;
 };

@@ -1,4 +1,4 @@
-// The modules that a run needs, opened the way the solver does: by name, through the module manager.
+// The modules of the value types, opened by name through the module manager, as a solver does.
 #pragma once
 
 #include <memory>
@@ -10,7 +10,7 @@
 
 namespace zornet {
 
-// Values must be gone before the session in which they were made.
+// Values must die before the session in which they were made.
 class Session {
  public:
   // Looks for the modules in the program's own folder, in the folders given and in that of the host library. Throws

@@ -103,8 +103,7 @@ void Store::Meet(int variable, const Value& outcome) {
     mWatcher->Narrowed({mConstraint, NameOf(mOperation), {variable}, shown, held.Show(), held.IsNil()});
 }
 
-// Two values without a common text are told apart first: to intersect with the least or greatest single value would
-// replace any other.
+// Intersecting a single value with the least or the greatest one would replace it, so disjoint values are found first.
 void Store::Narrow(int variable, const Value& outcome) {
   Value& held = mValues[static_cast<std::size_t>(variable)];
   if (held.Any().IsIntersected(outcome.Any()) == 0) return held.Any().SetNilValue();

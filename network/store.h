@@ -1,5 +1,5 @@
-// The values of a network while it is narrowed. Whatever a narrowing operation answers, it reaches a variable only
-// through Meet: as an outcome of its own that is intersected with what the variable holds.
+// The values of a network while it is narrowed. An operation of the module never touches a variable: it works on a
+// value of its own, which Meet intersects with the variable. So no answer of the module can add a value.
 #pragma once
 
 #include <array>
@@ -25,9 +25,9 @@ struct OperationCounts {
   std::uint64_t contradictions = 0;
 };
 
-// The possible values of a variable, each with a number from 0, in ascending order.
+// The domain of a variable as a list in ascending order; positions count from 0.
 struct Listing {
-  bool known = false;  // else nothing is listed
+  bool known = false;  // else nothing else counts
   std::vector<ZORString> texts;
   std::vector<ZORLong> numbers;  // of a set of integers
   ZORLong first = 0;             // of any other numbers, which are all from here on
@@ -54,7 +54,7 @@ class Store {
   Value& FreshLike(int variable) { return Fresh((*this)[variable].Sort()); }
   Value& CopyOf(int variable);
 
-  // Changes are put down to the constraint and operation named last.
+  // Changes are recorded under the constraint and operation named last.
   void StartConstraint(int constraint) { mConstraint = constraint; }
   void StartOperation(Operation operation);
   void Meet(int variable, const Value& outcome);
@@ -68,10 +68,10 @@ class Store {
   const std::array<OperationCounts, kOperations>& Counts() const { return mCounts; }
   void Watch(Watcher* watcher) { mWatcher = watcher; }
 
-  // The value itself, for whoever wants the module's bare operations on it.
+  // The value itself, for the module's bare operations.
   Value& Bare(int variable) { return mValues[static_cast<std::size_t>(variable)]; }
 
-  // Changes from Mark on are undone by Undo, the latest mark first.
+  // Undo takes back the changes since the latest Mark.
   void Mark() { mMarks.push_back(mTrail.size()); }
   void Undo();
 
@@ -94,7 +94,7 @@ class Store {
   std::vector<Value> mValues;
   std::vector<Value> mFresh;
   std::vector<Listing> mListings;
-  std::vector<char> mListed;  // whether the listing is that of the value
+  std::vector<char> mListed;  // whether the listing is up to date
   std::vector<int> mTouched;
   std::vector<Saved> mTrail;
   std::vector<std::size_t> mMarks;

@@ -8,7 +8,7 @@ namespace zornet {
 
 namespace {
 
-// Finding the inputs of a result costs about as much as computing a few results.
+// Inverting a function costs about as much as computing it so many times.
 constexpr double kInversionCost = 4;
 
 bool IsBelow(const Answer& a, const Answer& b) { return a.number != b.number ? a.number < b.number : a.text < b.text; }
@@ -97,8 +97,8 @@ void Supports::Prepare(const Constraint& constraint) {
   if (constraint.kind->meaning == Meaning::Slice) ClampPositions(constraint);
 }
 
-// A slice that is not empty begins inside the text, and where its end lies behind the text does not matter. So
-// positions can be listed that are unknown.
+// A slice that is not empty begins inside the text, and all ends behind the text are alike. So even unknown positions
+// have few candidates.
 void Supports::ClampPositions(const Constraint& constraint) {
   const Listing& texts = *At(0).listing;
   const Listing& slices = *At(3).listing;
@@ -125,7 +125,7 @@ void Supports::ClampPosition(Column& column, std::int64_t last, bool openAbove) 
   column.listing = &column.clamped;
 }
 
-// How many have to be tried to reach the target from all others; infinity when one of them is not listed.
+// How many combinations of the other arguments there are; infinity when one of them is not listed.
 double Supports::Combinations(const Constraint& constraint, int target) {
   mTried.clear();
   double combinations = 1;
@@ -143,7 +143,7 @@ bool Supports::IsTried(const Column& column) const {
   return std::find(mTried.begin(), mTried.end(), &column) != mTried.end();
 }
 
-// False when a listed target has more partners than can be listed.
+// False when a listed target has more supports than can be listed.
 bool Supports::Try(const Constraint& constraint, int target) {
   const bool none = Combinations(constraint, target) == 0;
   Start();
@@ -202,7 +202,7 @@ void Supports::Choose(Column& column, std::size_t index) {
   }
 }
 
-// Whether the target can be answer, in this combination where it has a value already.
+// Whether the target can take answer; where this combination gave it a value, it must be that one.
 bool Supports::Accept(int target, Answer answer) {
   Column& column = At(target);
   if (!column.IsListed()) {
@@ -221,7 +221,7 @@ bool Supports::HasAll() const {
                      [](const Column& column) { return column.IsListed() && column.HasAll(); });
 }
 
-// A contradiction is to show in a variable rather than in a constant, and in the result rather than in an input.
+// A contradiction shows in a variable rather than a constant, and in the result rather than an input.
 void Supports::Apply(const Constraint& constraint) {
   mStore.StartOperation(Operation::Supports);
   for (const bool constants : {false, true}) {

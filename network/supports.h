@@ -1,4 +1,4 @@
-// Narrowing of a function by the combinations of what its arguments can be. A listed value without a partner among the
+// Narrowing of a function by the combinations of what its arguments can be. A listed value without a support among the
 // others is dropped; what an unknown argument can be is collected. One pass finds all that can be found this way.
 //
 // Combinations are tried one by one, or driven from the listed results: a result of a concatenation or slice is looked
@@ -22,19 +22,19 @@ class Supports {
   bool Narrow(const Constraint& constraint);
 
  private:
-  // One variable of the constraint: what it can be, and what of it has found a partner. Of numbers that are all from
-  // one to another the least and the greatest partner count alone, as no more of them can go.
+  // One variable of the constraint: its domain, and the values with a support so far. Of a range of numbers only the
+  // least and the greatest supported one matter, since a range has no holes.
   struct Column {
     int variable = kNone;
     const Listing* listing = nullptr;
-    Listing clamped;         // in place of positions that are unknown or too many
-    bool openAbove = false;  // the last of these stands for all positions above it too
+    Listing clamped;         // replaces positions that are unknown or too many
+    bool openAbove = false;  // the last one stands for all greater positions too
     std::vector<char> kept;
-    std::size_t dropped = 0;                    // of kept
-    std::size_t lowest = 0, behindHighest = 0;  // of a range
-    std::size_t index = 0;                      // what is tried
-    std::vector<Answer> found;                  // what a variable can be that is not listed
-    bool open = false;                          // it can be more than what was found
+    std::size_t dropped = 0;                    // values not kept so far
+    std::size_t lowest = 0, behindHighest = 0;  // supported numbers of a range
+    std::size_t index = 0;                      // the value that is tried
+    std::vector<Answer> found;                  // values of a variable that is not listed
+    bool open = false;                          // found does not hold all of them
     bool met = false;                           // its variable has been narrowed
 
     bool IsListed() const { return listing->known; }
@@ -86,7 +86,7 @@ class Supports {
   int mArity = 0;
   std::size_t mTries = 0;                        // left of the budget of a driven pass
   std::vector<Column*> mTried;                   // the columns whose combinations are tried
-  std::vector<std::pair<double, int>> mTargets;  // by what it costs to reach them; the result ahead of its equals
+  std::vector<std::pair<double, int>> mTargets;  // by their cost; the result before inputs of equal cost
 };
 
 }  // namespace zornet

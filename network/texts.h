@@ -1,5 +1,5 @@
-// The texts that a model can speak of: at most 255 characters from the space to z, ordered by character code with a
-// prefix before its extensions. The empty text is the least of them and 255 times z the greatest.
+// The texts of the domain: at most 255 characters from the space to z, ordered by character code with a prefix before
+// its extensions. The empty text is the least of them and 255 times z the greatest.
 #pragma once
 
 #include <cstddef>
@@ -17,8 +17,8 @@ inline std::string_view ToView(const ZORString& text) { return zor::View(text); 
 
 const ZORString& GreatestText();
 
-// One space is the least value of a single string and the empty text that of an enumerated one. The module knows
-// these values by their state, ahead of their text, so that its answers on them are not always about the text.
+// One space is the least value of a single string, the empty text that of a set. The module recognises these values by
+// their state before it looks at their text, so its answers on them are not always about the text.
 inline bool IsLeastSomewhere(const ZORString& text) {
   return text.GetLengthInChar() == 0 || (text.GetLengthInChar() == 1 && *text.CastToCharPtr() == ' ');
 }

@@ -22,7 +22,7 @@ Truth::Truth(const Types& types)
   for (int i = 0; i < kSorts; ++i) mForms.emplace_back(types, static_cast<Sort>(i));
 }
 
-// Operands are Exact throughout, the greatest text too: as a Max it would be folded by state.
+// Operands are Exact, the greatest text too: the module would fold a Max by its state.
 bool Truth::Compute(const Kind& kind, const Exact* inputs, Answer& result) {
   if (kind.meaning == Meaning::TextForm) return ComputeTextForm(inputs[0], result);
   if (kind.meaning == Meaning::Slice) {
@@ -81,7 +81,7 @@ bool Truth::ComputeTextForm(const Exact& value, Answer& result) {
   return ToView(result.text).size() <= kTextLimit;
 }
 
-// A number is written alike whatever type it comes from, while a set of one number would be written in braces.
+// A number has one text form, whatever its sort; the module would put a set of one number in braces.
 Value& Truth::FormOf(Sort sort) { return mForms[static_cast<std::size_t>(IsInteger(sort) ? Sort::Integer : sort)]; }
 
 bool Truth::CanInvert(const Kind& kind, int position) {
@@ -95,14 +95,14 @@ std::optional<std::vector<Answer>> Truth::Invert(const Kind& kind, int position,
   proposals.reserve(2);
   switch (kind.meaning) {
     case Meaning::Concatenation:
-      if (*result.text == GreatestText()) return std::nullopt;  // whatever is too long gives it
+      if (*result.text == GreatestText()) return std::nullopt;  // every text that is too long gives it
       break;
     case Meaning::Minimum:
     case Meaning::Maximum:
-      if (*result.text == *other.text) return std::nullopt;  // so does all beyond it
+      if (*result.text == *other.text) return std::nullopt;  // so does everything beyond it
       break;
     case Meaning::Lower:
-    case Meaning::Upper:  // a fold is its own fold, and others may give it too
+    case Meaning::Upper:  // a folded text is its own fold, and others may fold to it
       if (Gives(kind, position, {*result.text, 0}, values)) return std::nullopt;
       return proposals;
     case Meaning::Length:
@@ -121,7 +121,7 @@ std::optional<std::vector<Answer>> Truth::Invert(const Kind& kind, int position,
   return found;
 }
 
-// Whether an input gives the result together with the others.
+// Whether this input gives the result with the others.
 bool Truth::Gives(const Kind& kind, int position, const Answer& input, const Exact* values) {
   std::array<Exact, kMostArguments> exact{};
   std::copy_n(values, kind.arity, exact.begin());
@@ -130,12 +130,12 @@ bool Truth::Gives(const Kind& kind, int position, const Answer& input, const Exa
   return Holds(kind, exact.data());
 }
 
-// What the module's inverse guesses, and what else can be meant.
+// The module's inverse, and the inputs that it misses.
 void Truth::Propose(const Kind& kind, int position, const Exact* values, std::vector<Answer>& proposals) {
   const Exact& result = values[kind.Inputs()];
   const Exact& other = values[kind.Inputs() == 2 ? 1 - position : 0];
   if (kind.meaning == Meaning::TextForm) return ProposeByTextForm(values[0], *result.text, proposals);
-  if (kind.meaning == Meaning::Length) return proposals.push_back({});  // the one text without a character
+  if (kind.meaning == Meaning::Length) return proposals.push_back({});  // the one text without characters
   const ZORString& z = *result.text;
   mZ.Text().SetExactValue(z);
   mX.Reset();
@@ -144,7 +144,7 @@ void Truth::Propose(const Kind& kind, int position, const Exact* values, std::ve
       mY.Text().SetExactValue(*other.text);
       if (position == 0) {
         mZ.Text().CalcFirstInverseConcatenation(mX.Text(), mY.Text());
-        Take(proposals, mX);  // looks for the first place of the second text, while its place is the end
+        Take(proposals, mX);  // the module takes the first place of the second text, which may not be the end
         if (z.GetLengthInChar() >= other.text->GetLengthInChar()) {
           proposals.push_back({Slice(z, 0, z.GetLengthInChar() - other.text->GetLengthInChar() - 1), 0});
         }
@@ -157,7 +157,7 @@ void Truth::Propose(const Kind& kind, int position, const Exact* values, std::ve
       mY.Text().SetExactValue(*other.text);
       mZ.Text().CalcFirstInverseMinValue(mX.Text(), mY.Text());
       Take(proposals, mX);
-      proposals.push_back({z, 0});  // refused by the module at one space
+      proposals.push_back({z, 0});  // the module refuses it at one space
       break;
     case Meaning::Maximum:
       mY.Text().SetExactValue(*other.text);
@@ -167,7 +167,7 @@ void Truth::Propose(const Kind& kind, int position, const Exact* values, std::ve
       break;
     case Meaning::Successor:
       mZ.Text().CalcInverseNextValue(mX.Text());
-      Take(proposals, mX);  // of 255 characters always, while a space may have been put behind a shorter one
+      Take(proposals, mX);  // of 255 characters; a shorter text with a space behind it is possible too
       if (EndsWithSpace(z)) proposals.push_back({Slice(z, 0, z.GetLengthInChar() - 2), 0});
       if (z == GreatestText()) proposals.push_back({z, 0});
       break;
@@ -176,7 +176,7 @@ void Truth::Propose(const Kind& kind, int position, const Exact* values, std::ve
   }
 }
 
-// The module reads a text up to its second quote, while its form ends at the last.
+// The module reads a text up to its second quote; the form ends at the last.
 void Truth::ProposeByTextForm(const Exact& value, const ZORString& form, std::vector<Answer>& proposals) {
   Value& read = FormOf(value.sort);
   mZ.Text().SetExactValue(form);

@@ -1,5 +1,5 @@
-// The meaning of the constraints on exact values: the one place that says what a solution is. What the propagation
-// keeps or drops is judged by it.
+// What the constraints mean on exact values: the one place that defines a solution. Narrowing is sound and complete
+// with respect to it.
 //
 // A function is computed by the module's forward operation on fresh single values. The texts themselves decide where
 // the module answers by state instead of by text, on one space, and where its sums wrap, on slices. Equality and order
@@ -24,7 +24,7 @@ namespace zornet {
 struct Exact {
   const ZORString* text = nullptr;
   ZORLong number = 0;
-  Sort sort = Sort::Text;  // of the variable that has it: text forms differ by it
+  Sort sort = Sort::Text;  // of its variable, which decides the text form
 };
 
 // The same with a text of its own.
@@ -42,8 +42,8 @@ class Truth {
   // The value of a function; false when it has none.
   bool Compute(const Kind& kind, const Exact* inputs, Answer& result);
 
-  // All values of one input that give the result with the other inputs; nothing when they cannot be listed.
-  // values[position] is not looked at.
+  // All values of one input that give the result with the other inputs; nothing when they cannot be listed. Ignores
+  // values[position].
   std::optional<std::vector<Answer>> Invert(const Kind& kind, int position, const Exact* values);
 
   // Whether Invert ever lists something at this position.

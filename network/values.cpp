@@ -63,7 +63,7 @@ void Value::SetText(const ZORString& text) {
   }
 }
 
-// A value that is filled text by text becomes Any at one more than zor::kSetLimit: larger sets are united from parts.
+// Filled text by text, a set becomes Any beyond zor::kSetLimit texts: larger sets are united from parts.
 void Value::SetTexts(std::span<const ZORString> texts) {
   const auto fill = [](ZORVaDoString& value, std::span<const ZORString> part) {
     value.SetExactValue(part.front());
@@ -102,7 +102,7 @@ void Value::SetNumbers(const std::vector<ZORLong>& numbers) {
   Any().Assign(listed);
 }
 
-// The bounds of a set of "" alone are told as one space, as if it were a single value.
+// The module answers one space for the bounds of a set that lists "" alone.
 ZORString Value::LowestText() const {
   return mSort == Sort::TextSet && Text().IsEmpty() ? ZORString() : Text().GetLowerBound();
 }
@@ -111,8 +111,8 @@ ZORString Value::HighestText() const {
   return mSort == Sort::TextSet && Text().IsEmpty() ? ZORString() : Text().GetUpperBound();
 }
 
-// Each text leads to the next one: a text with a character behind it that is less than the alphabet lies between them.
-// Asked for its last text, a set answers with what it was asked for instead, so that comes from its bound.
+// A text followed by a character less than the alphabet lies between that text and the next listed one, so asking from
+// there gives the next. The last text comes from the upper bound: a set never answers it as the next one.
 std::vector<ZORString> Value::Texts() const {
   std::vector<ZORString> texts{LowestText()};
   const std::size_t count = mSort == Sort::Text ? 1 : mValue->GetCardinality();
@@ -151,7 +151,7 @@ std::string Value::Print() const {
   return std::string(out.View());
 }
 
-// A set that lists the greatest text shows it as Max: it is printed as the union of the greatest value and the rest.
+// Prints the greatest text of a set as Max: the union of the greatest value and the rest.
 std::string Value::Show() const {
   if (mSort != Sort::TextSet || !IsKnown() || HighestText() != GreatestText()) return Print();
   Value shown(*this), rest(*this);

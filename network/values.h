@@ -1,7 +1,7 @@
 // Values of the solver, made through the descriptors of its modules and reached through their virtual operations.
 //
-// Inside a set the greatest text stands like any other and the mark Max is never used, since the module's set
-// operations forget that mark beside other texts. A single value that is the greatest text always bears it.
+// A set lists the greatest text like any other and never takes the state Max, which the module's set operations lose
+// beside other texts. A single value that is the greatest text always has that state.
 #pragma once
 
 #include <array>
@@ -53,18 +53,18 @@ class Value {
   bool IsKnown() const { return !IsNil() && !IsUndefined(); }
   bool IsOne() const;  // exactly one text, number or truth value is possible
 
-  // Give a value to what is Undefined or known; the sort has to fit.
+  // Replace what is held; the sort has to fit.
   void Reset() { mValue->SetUndefinedValue(); }
   void SetText(const ZORString& text);
   void SetTexts(std::span<const ZORString> texts);       // of a set; in ascending order, at least one
-  void SetNumber(ZORLong number);                        // of a truth value 0 or 1
+  void SetNumber(ZORLong number);                        // of a Boolean 0 or 1
   void SetNumbers(const std::vector<ZORLong>& numbers);  // ascending; an interval takes the ends, a single one or all
 
   // What a known value holds.
   ZORString LowestText() const;
   ZORString HighestText() const;
   std::vector<ZORString> Texts() const;  // in ascending order
-  ZORLong LowestNumber() const;          // of a truth value 0 for false
+  ZORLong LowestNumber() const;          // of a Boolean 0 or 1
   ZORLong HighestNumber() const;
   std::vector<ZORLong> Numbers() const;
 

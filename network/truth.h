@@ -1,9 +1,8 @@
 // What the constraints mean on exact values: the one place that defines a solution. Narrowing is sound and complete
 // with respect to it.
 //
-// A function is computed by the module's forward operation on fresh single values. The texts themselves decide where
-// the module answers by state instead of by text, on one space, and where its sums wrap, on slices. Equality and order
-// are those of the texts.
+// The module's forward operation on fresh single values computes a function. Where the module answers by state instead of
+// by text (one space) or in sums that wrap (slices), the texts decide. Equality and order are those of the texts.
 //
 //   concatenation  of more than 255 characters: the greatest text
 //   slice          positions from 0, both ends in; an end behind the text is the last character; empty when it begins

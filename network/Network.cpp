@@ -81,10 +81,11 @@ SearchResult Network::Search(std::uint64_t most, const std::function<bool()>& fo
   zornet::Search search(mInside->store, mInside->propagation);
   result.outcome = search.Run(most, found);
   result.solutions = search.Found();
-  result.complete = search.IsComplete();
   result.open = search.Open();
   result.openVariable = {search.OpenVariable()};
-  if (result.complete && result.solutions == 0 && result.open == 0) result.outcome = Outcome::Contradiction;
+  result.complete = search.IsExhausted() && result.open == 0;
+  if (search.IsExhausted() && result.open != 0) result.outcome = Outcome::Open;
+  if (result.complete && result.solutions == 0) result.outcome = Outcome::Contradiction;
   return result;
 }
 

@@ -41,6 +41,7 @@ enum class Outcome {
   Settled,        // no constraint narrows anything further
   Contradiction,  // there is no solution
   StepLimit,
+  Open,  // of a search that tried all: there may be more solutions, as a variable stays unknown in some branch
 };
 
 // What is still possible for a variable: a view, good until its network changes. Texts and numbers ascend.
@@ -94,7 +95,7 @@ struct SearchResult {
   Outcome outcome = Outcome::Settled;  // Contradiction: it is sure that there is no solution
   std::uint64_t solutions = 0;
   bool complete = false;   // there are no more
-  std::uint64_t open = 0;  // assignments left out because a variable stays unknown in them
+  std::uint64_t open = 0;  // branches left because a variable stays unknown in them
   Var openVariable;        // one such variable
 };
 
@@ -110,8 +111,9 @@ class ZOR_EXPORT Network {
   // Narrows until nothing changes, until a contradiction, or until the limit of steps.
   Outcome Narrow();
 
-  // Narrows, then looks for solutions, in which every wanted variable has one value, and stops at `most` of them. found
-  // is called at each, while the domains show it; it answers whether to go on. Afterwards the domains are as narrowed.
+  // Narrows, then looks for solutions, in which every wanted variable has one value, and stops at `most` of them. Each
+  // comes once; unless constraints need them, variables that are not wanted stay as they are. found is called at each,
+  // while the domains show it; it answers whether to go on. Afterwards the domains are as narrowed.
   SearchResult Search(std::uint64_t most, const std::function<bool()>& found);
 
   const Model& GetModel() const;

@@ -1,5 +1,7 @@
 #include "network/propagation.h"
 
+#include <algorithm>
+
 #include "network/order_cycles.h"
 
 namespace zornet {
@@ -40,9 +42,7 @@ Outcome Propagation::Run() {
   if (mStore.HasFailed()) return Outcome::Contradiction;
   WakeReaders(kNone);
   while (mWaiting != 0) {
-    if (mSteps >= mLimits.steps) return Outcome::StepLimit;
-    ++mSteps;
-    if (mTeller && mSteps % kProgressSteps == 0) mTeller(mSteps, mWaiting);
+    if (!CountStep()) return Outcome::StepLimit;
     const int constraint = Next();
     const auto progress = Narrow(constraint);
     if (mStore.HasFailed()) return Outcome::Contradiction;
@@ -61,6 +61,13 @@ void Propagation::FailOrderCycle() {
   mStore.Fail(order.arguments[order.kind->mirrored ? 1 : 0]);
 }
 
+bool Propagation::CountStep() {
+  if (mSteps >= mLimits.steps) return false;
+  ++mSteps;
+  if (mTeller && mSteps % kProgressSteps == 0) mTeller(mSteps, mWaiting);
+  return true;
+}
+
 Progress Propagation::Narrow(int constraint) {
   const Constraint& what = mModel.Constraints()[static_cast<std::size_t>(constraint)];
   mStore.StartConstraint(constraint);
@@ -75,12 +82,21 @@ Progress Propagation::Narrow(int constraint) {
 // A constraint that finds in one pass all that it can find is not woken by its own changes.
 void Propagation::WakeReaders(int except) {
   for (const int variable : mStore.Touched()) {
-    const auto at = static_cast<std::size_t>(variable);
-    for (std::size_t i = mFirstReader[at]; i < mFirstReader[at + 1]; ++i) {
-      if (mReaders[i] != except) Wake(mReaders[i]);
+    for (const int reader : ReadersOf(variable)) {
+      if (reader != except) Wake(reader);
     }
   }
   mStore.Touched().clear();
+}
+
+std::span<const int> Propagation::ReadersOf(int variable) const {
+  const auto at = static_cast<std::size_t>(variable);
+  return std::span(mReaders).subspan(mFirstReader[at], mFirstReader[at + 1] - mFirstReader[at]);
+}
+
+bool Propagation::Waits(int variable) const {
+  const auto readers = ReadersOf(variable);
+  return std::any_of(readers.begin(), readers.end(), [this](int reader) { return !IsFinished(reader); });
 }
 
 void Propagation::Wake(int constraint) {

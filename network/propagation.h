@@ -4,6 +4,7 @@
 
 #include <cstdint>
 #include <functional>
+#include <span>
 #include <vector>
 
 #include "network/functions.h"
@@ -23,6 +24,12 @@ class Propagation {
   void OnProgress(Teller teller) { mTeller = std::move(teller); }
 
   std::uint64_t Steps() const { return mSteps; }
+  bool CountStep();  // false at the limit: there is none left
+  const Limits& Bounds() const { return mLimits; }
+
+  std::span<const int> ReadersOf(int variable) const;  // the constraints, as often as they name it
+  bool IsFinished(int constraint) const { return mStates[static_cast<std::size_t>(constraint)] == Finished; }
+  bool Waits(int variable) const;  // whether a constraint that reads it is not finished
 
   // As in Store, for what is settled and what waits.
   void Mark() { mMarks.push_back(mFinished.size()); }

@@ -1,12 +1,29 @@
 #include "network/search.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace zornet {
 
+Search::Search(Store& store, Propagation& propagation)
+    : mStore(store), mPropagation(propagation), mTruth(store.Types()), mStamps(store.Model().Variables().size(), 0) {
+  std::vector<char> taken(mStamps.size(), 0);
+  const auto take = [&](int variable) {
+    if (std::exchange(taken[static_cast<std::size_t>(variable)], 1) == 0) mOrder.push_back(variable);
+  };
+  for (const int variable : store.Model().Wanted()) take(variable);
+  mWanted = mOrder.size();
+  for (const Constraint& constraint : store.Model().Constraints()) {
+    for (int i = 0; i < constraint.kind->arity; ++i) take(constraint.arguments[static_cast<std::size_t>(i)]);
+  }
+  for (std::size_t place = 0; place < mOrder.size(); ++place) {
+    if (!mStore.List(mOrder[place]).known) mUnlisted.push_back(place);
+  }
+}
+
 Outcome Search::Run(std::uint64_t limit, const Solution& solution) {
   const Outcome outcome = Look(limit, solution);
-  mComplete = mFrames.empty();
+  mExhausted = outcome == Outcome::Settled && mFrames.empty();
   for (; !mFrames.empty(); mFrames.pop_back()) {
     if (mFrames.size() > 1) Retract();
   }
@@ -14,51 +31,87 @@ Outcome Search::Run(std::uint64_t limit, const Solution& solution) {
 }
 
 Outcome Search::Look(std::uint64_t limit, const Solution& solution) {
-  if (!Descend()) Leaf(solution);
-  while (!mFrames.empty() && mFound < limit && mWanted) {
-    Frame& frame = mFrames.back();
-    if (frame.next == frame.listing.count) {
-      mFrames.pop_back();
-      if (!mFrames.empty()) Retract();
+  Visit(solution);
+  while (!mFrames.empty() && mFound < limit && mGoOn) {
+    if (mFrames.back().IsExhausted()) {
+      Pop();
       continue;
     }
+    if (!mPropagation.CountStep()) return Outcome::StepLimit;
     Mark();
-    Choose(frame.variable, frame.listing, frame.next++);
+    Choose(mFrames.back());
     const Outcome outcome = mPropagation.Run();
-    if (outcome == Outcome::Settled && Descend()) continue;
-    if (outcome == Outcome::Settled) Leaf(solution);
+    if (outcome == Outcome::Settled && Visit(solution)) continue;
     Retract();
     if (outcome == Outcome::StepLimit) return outcome;
   }
   return Outcome::Settled;
 }
 
-// Goes on with the variable that has the fewest values, if one still has several.
-bool Search::Descend() {
-  int chosen = kNone;
-  std::size_t fewest = 0;
-  for (int v = 0; v < static_cast<int>(mStore.Model().Variables().size()); ++v) {
-    if (mStore[v].IsOne()) continue;
-    const Listing& listing = mStore.List(v);
-    if (!listing.known || (chosen != kNone && listing.count >= fewest)) continue;
-    chosen = v;
-    fewest = listing.count;
+// Whether there is something to branch on below what is settled now.
+bool Search::Visit(const Solution& solution) {
+  if (const int variable = Stuck(); variable != kNone) {
+    LeaveOpen(variable);
+    return false;
   }
-  if (chosen == kNone) return false;
-  mFrames.push_back({chosen, mStore.List(chosen)});
+  std::size_t first = mFrames.empty() ? 0 : mFrames.back().first;
+  while (first < mOrder.size() && !Needs(first)) ++first;
+  if (first >= mWanted && IsLoose() && mShown.contains(Shown())) return false;
+  if (first == mOrder.size()) {
+    Leaf(solution);
+    return false;
+  }
+  Push(first, Pick(first));
   return true;
 }
 
-void Search::Choose(int variable, const Listing& listing, std::size_t index) {
-  Value& value = mStore.FreshLike(variable);
+// The place of the variable with the fewest values, a wanted one if there is one. Where nothing is stuck, one is
+// listed.
+std::size_t Search::Pick(std::size_t first) {
+  std::size_t chosen = mOrder.size(), fewest = 0;
+  for (std::size_t place = first; place < mOrder.size(); ++place) {
+    const bool found = chosen != mOrder.size();
+    if (found && (fewest == 2 || place == mWanted)) break;
+    if (!Needs(place)) continue;
+    const Listing& listing = mStore.List(mOrder[place]);
+    if (!listing.known || (found && listing.count >= fewest)) continue;
+    chosen = place;
+    fewest = listing.count;
+  }
+  return chosen;
+}
+
+void Search::Push(std::size_t first, std::size_t place) {
+  const bool decided = first >= mWanted;
+  const Listing& listing = mStore.List(mOrder[place]);
+  const bool halved = listing.sort == Sort::Interval && listing.count > mPropagation.Bounds().budget;
+  mFrames.push_back({mOrder[place], listing, halved, first, decided, IsLoose() || (!decided && place >= mWanted)});
+}
+
+void Search::Pop() {
+  const bool decided = IsDecided(), loose = IsLoose();
+  mFrames.pop_back();
+  if (!mFrames.empty()) Retract();
+  if (loose && !IsLoose()) mShown.clear();
+  if (decided && !IsDecided() && mWitnessOpen != kNone) CountOpen(std::exchange(mWitnessOpen, kNone));
+}
+
+void Search::Choose(Frame& frame) {
+  const Listing& listing = frame.listing;
+  const std::size_t choice = frame.next++, middle = (listing.count - 1) / 2;
+  Value& value = mStore.FreshLike(frame.variable);
   if (IsText(listing.sort)) {
-    value.SetText(listing.texts[index]);
+    value.SetText(listing.texts[choice]);
+  } else if (!frame.halved) {
+    value.SetNumber(listing.NumberAt(choice));
+  } else if (choice == 0) {
+    value.SetNumbers({listing.NumberAt(0), listing.NumberAt(middle)});
   } else {
-    value.SetNumber(listing.NumberAt(index));
+    value.SetNumbers({listing.NumberAt(middle + 1), listing.NumberAt(listing.count - 1)});
   }
   mStore.StartConstraint(kNone);
   mStore.StartOperation(Operation::Choice);
-  mStore.Meet(variable, value);
+  mStore.Meet(frame.variable, value);
 }
 
 void Search::Mark() {
@@ -71,30 +124,90 @@ void Search::Retract() {
   mPropagation.Undo();
 }
 
-void Search::Leaf(const Solution& solution) {
-  for (int v = 0; v < static_cast<int>(mStore.Model().Variables().size()); ++v) {
-    if (mStore[v].IsOne()) continue;
-    ++mOpen;
-    mOpenVariable = v;
-    return;
-  }
-  if (!Confirm()) return;
-  ++mFound;
-  mWanted = solution();
+// Whether the variable still has to get one value. Beside the wanted ones, finished constraints need none.
+bool Search::Needs(std::size_t place) const {
+  const int variable = mOrder[place];
+  return !mStore[variable].IsOne() && (place < mWanted || mPropagation.Waits(variable));
 }
 
+// A variable that is needed and cannot become known any more, or kNone.
+int Search::Stuck() {
+  const std::uint64_t before = mStamp;
+  for (const std::size_t place : mUnlisted) {
+    const int variable = mOrder[place];
+    if (Needs(place) && !mStore.List(variable).known && !CanBecomeKnown(variable, before)) return variable;
+  }
+  return kNone;
+}
+
+// Whether unfinished constraints connect it to a variable that there are choices for. What has a stamp above before
+// and not the latest was reached from another that can become known.
+bool Search::CanBecomeKnown(int variable, std::uint64_t before) {
+  const auto stamp = [this](int other) -> std::uint64_t& { return mStamps[static_cast<std::size_t>(other)]; };
+  if (stamp(variable) > before) return true;
+  stamp(variable) = ++mStamp;
+  std::vector<int> reached{variable};
+  for (std::size_t i = 0; i < reached.size(); ++i) {
+    for (const int number : mPropagation.ReadersOf(reached[i])) {
+      if (mPropagation.IsFinished(number)) continue;
+      const Constraint& constraint = mStore.Model().Constraints()[static_cast<std::size_t>(number)];
+      for (int a = 0; a < constraint.kind->arity; ++a) {
+        const int other = constraint.arguments[static_cast<std::size_t>(a)];
+        if (mStore[other].IsOne() || stamp(other) == mStamp) continue;
+        if (mStore.List(other).known || stamp(other) > before) return true;
+        stamp(other) = mStamp;
+        reached.push_back(other);
+      }
+    }
+  }
+  return false;
+}
+
+// One open branch is enough to leave a whole assignment of the wanted variables open, unless a witness is found.
+void Search::LeaveOpen(int variable) {
+  if (IsDecided()) {
+    mWitnessOpen = variable;
+  } else {
+    CountOpen(variable);
+  }
+}
+
+void Search::CountOpen(int variable) {
+  ++mOpen;
+  mOpenVariable = variable;
+}
+
+void Search::Leaf(const Solution& solution) {
+  if (!Confirm()) return;
+  if (IsLoose()) mShown.insert(Shown());
+  mWitnessOpen = kNone;
+  for (auto frame = mFrames.rbegin(); frame != mFrames.rend() && frame->decided; ++frame)
+    frame->next = frame->halved ? 2 : frame->listing.count;
+  ++mFound;
+  mGoOn = solution();
+}
+
+// Each constraint by itself. One that an argument without a value is left to is finished: it holds for any.
 bool Search::Confirm() {
   return std::all_of(mStore.Model().Constraints().begin(), mStore.Model().Constraints().end(),
                      [&](const Constraint& c) {
                        std::array<Exact, kMostArguments> exact{};
                        for (int i = 0; i < c.kind->arity; ++i) {
                          const auto at = static_cast<std::size_t>(i);
+                         if (!mStore[c.arguments[at]].IsOne()) return true;
                          const Listing& listing = mStore.List(c.arguments[at]);
                          exact[at] = {IsText(listing.sort) ? &listing.texts.front() : nullptr,
                                       IsText(listing.sort) ? 0 : listing.NumberAt(0), listing.sort};
                        }
                        return mTruth.Holds(*c.kind, exact.data());
                      });
+}
+
+// The wanted values as they are printed.
+std::string Search::Shown() const {
+  std::string shown;
+  for (std::size_t place = 0; place < mWanted; ++place) shown += mStore[mOrder[place]].Show() + '\n';
+  return shown;
 }
 
 }  // namespace zornet

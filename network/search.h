@@ -1,9 +1,14 @@
-// Full assignments: every listed variable is given each of its values in turn, the rest is narrowed, and what is left
-// at the end is confirmed constraint by constraint.
+// Solutions: assignments of the variables that are wanted, each with one confirmed witness for the variables that
+// constraints still need beside them. A variable that is neither wanted nor needed is left as it is.
+//
+// Wanted variables are branched on first. A variable whose values cannot be listed may become known by the choices for
+// others; a branch in which it cannot any more is left at once and counted as open.
 #pragma once
 
 #include <cstdint>
 #include <functional>
+#include <set>
+#include <string>
 #include <vector>
 
 #include "network/propagation.h"
@@ -16,41 +21,65 @@ class Search {
  public:
   using Solution = std::function<bool()>;  // the store holds it; false when no other is wanted
 
-  Search(Store& store, Propagation& propagation) : mStore(store), mPropagation(propagation), mTruth(store.Types()) {}
+  Search(Store& store, Propagation& propagation);
 
   // Goes on from a network that was settled, and leaves it so. Settled: stopped at the limit, because no other is
-  // wanted or because there are no more.
+  // wanted or because all is tried.
   Outcome Run(std::uint64_t limit, const Solution& solution);
 
   std::uint64_t Found() const { return mFound; }
-  std::uint64_t Open() const { return mOpen; }        // assignments that leave a variable unknown
+  std::uint64_t Open() const { return mOpen; }        // branches left because a variable stays unknown in them
   int OpenVariable() const { return mOpenVariable; }  // one such variable
-  bool IsComplete() const { return mComplete; }       // there are no more
+  bool IsExhausted() const { return mExhausted; }     // nothing is left to try
 
  private:
   struct Frame {
     int variable;
     Listing listing;
+    bool halved;        // its two choices are the halves of an interval
+    std::size_t first;  // no variable before this place in mOrder is needed
+    bool decided;       // every wanted variable has one value: this looks for a witness
+    bool loose;         // a branch on an unwanted variable came first: solutions below may repeat
     std::size_t next = 0;
+
+    bool IsExhausted() const { return next == (halved ? 2 : listing.count); }
   };
 
   Outcome Look(std::uint64_t limit, const Solution& solution);
-  bool Descend();
-  void Choose(int variable, const Listing& listing, std::size_t index);
+  bool Visit(const Solution& solution);
+  std::size_t Pick(std::size_t first);
+  void Push(std::size_t first, std::size_t place);
+  void Pop();
+  void Choose(Frame& frame);
   void Mark();
   void Retract();
+  bool Needs(std::size_t place) const;
+  int Stuck();
+  bool CanBecomeKnown(int variable, std::uint64_t before);
+  void LeaveOpen(int variable);
+  void CountOpen(int variable);
   void Leaf(const Solution& solution);
   bool Confirm();
+  bool IsDecided() const { return !mFrames.empty() && mFrames.back().decided; }
+  bool IsLoose() const { return !mFrames.empty() && mFrames.back().loose; }
+  std::string Shown() const;
 
   Store& mStore;
   Propagation& mPropagation;
   Truth mTruth;
+  std::vector<int> mOrder;             // variables that matter, the wanted ones first
+  std::size_t mWanted = 0;             // so many of them are wanted
+  std::vector<std::size_t> mUnlisted;  // places in mOrder whose values could not be listed at first
+  std::vector<std::uint64_t> mStamps;  // when CanBecomeKnown reached each variable last
+  std::uint64_t mStamp = 0;
   std::vector<Frame> mFrames;
+  std::set<std::string> mShown;  // solutions below the first loose frame
+  int mWitnessOpen = kNone;      // a variable that stayed open while a witness was looked for
   std::uint64_t mFound = 0;
   std::uint64_t mOpen = 0;
   int mOpenVariable = kNone;
-  bool mWanted = true;
-  bool mComplete = false;
+  bool mGoOn = true;
+  bool mExhausted = false;
 };
 
 }  // namespace zornet

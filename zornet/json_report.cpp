@@ -17,6 +17,8 @@ std::string_view Describe(Outcome outcome) {
       return "contradiction";
     case Outcome::StepLimit:
       return "step limit";
+    case Outcome::Open:
+      return "open";
   }
   return "";
 }
@@ -117,6 +119,7 @@ class JsonReport : public Report {
               {"milliseconds", summary.milliseconds}};
     if (const auto& search = summary.search)
       json.update({{"solutions", search->solutions}, {"complete", search->complete}, {"open", search->open}});
+    if (summary.search && summary.search->open != 0) json["variable"] = mNames.OfVariable(summary.search->openVariable);
     if (const int failed = network.FailedConstraint(); failed != kNone) {
       json["variable"] = mNames.OfVariable(network.FailedVariable());
       json["constraint"] = mNames.OfConstraint(failed);

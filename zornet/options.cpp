@@ -15,7 +15,8 @@ constexpr char kAbout[] =
 
 constexpr char kFooter[] =
     "Exit codes: 0 settled, 1 contradiction, 2 usage or file, 3 error in the model, 4 module not loadable,\n"
-    "5 step limit. The language of models and all else: man zornet.";
+    "5 step limit, 6 searched to the end but a variable stays open, 7 out of memory.\n"
+    "The language of models and all else: man zornet.";
 
 // Digits alone: to the library a minus sign is part of an unsigned number, which then wraps.
 CLI::Validator WholeFrom(std::uint64_t least) {
@@ -37,9 +38,8 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   app.footer(kFooter);
   app.set_version_flag("--version", "zornet " ZORNET_VERSION);
   app.add_option("FILE", options.file, "The model (*.szn); - for standard input")->required();
-  auto* solutions = app.add_option("--solutions", options.solutions, "Print up to N full assignments")
-                        ->type_name("N")
-                        ->check(WholeFrom(1));
+  auto* solutions =
+      app.add_option("--solutions", options.solutions, "Print up to N solutions")->type_name("N")->check(WholeFrom(1));
   app.add_flag("--trace", options.trace, "Print each narrowing as it happens");
   app.add_option("--explain", options.explain, "Print what brought a variable to its value")
       ->type_name("NAME")
@@ -56,7 +56,8 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   app.add_option("--budget", options.limits.budget, "Combinations that one constraint may try for supports (65536)")
       ->type_name("N")
       ->check(WholeFrom(0));
-  app.add_option("--step-limit", options.limits.steps, "Passes over a constraint before giving up (100000000)")
+  app.add_option("--step-limit", options.limits.steps,
+                 "Passes over a constraint, and choices, before giving up (100000000)")
       ->type_name("N")
       ->check(WholeFrom(0));
   app.add_option("--module-path", options.modulePaths, "Look for modules in this folder too; may be repeated")

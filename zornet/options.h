@@ -26,7 +26,16 @@ struct Options {
   std::vector<std::string> modulePaths;
 };
 
-enum ExitCode { kSettled = 0, kContradiction = 1, kUsage = 2, kModelError = 3, kModuleError = 4, kStepLimit = 5 };
+enum ExitCode {
+  kSettled = 0,
+  kContradiction = 1,
+  kUsage = 2,
+  kModelError = 3,
+  kModuleError = 4,
+  kStepLimit = 5,
+  kOpen = 6,  // all is tried, and there may be more solutions
+  kNoMemory = 7,
+};
 
 // Nothing when the program is to end with exitCode: help or version was asked for, or the command line is wrong.
 std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode);

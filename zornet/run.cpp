@@ -122,8 +122,17 @@ void OneRun::WritePictures() const {
 }
 
 int OneRun::ExitCode() const {
-  if (mSummary.outcome == Outcome::StepLimit) return kStepLimit;
-  return mSummary.outcome == Outcome::Contradiction ? kContradiction : kSettled;
+  switch (mSummary.outcome) {
+    case Outcome::Settled:
+      return kSettled;
+    case Outcome::Contradiction:
+      return kContradiction;
+    case Outcome::StepLimit:
+      return kStepLimit;
+    case Outcome::Open:
+      return kOpen;
+  }
+  return kSettled;
 }
 
 }  // namespace

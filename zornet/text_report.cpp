@@ -128,8 +128,7 @@ std::string TextReport::Result(const Network& network, const Summary& summary) c
   }
   if (summary.outcome == Outcome::Contradiction) return "contradiction: no solution";
   if (!search) return "settled";
-  if (!search->complete) return solutions + ", there may be more";
-  if (search->solutions == 0) return solutions;
+  if (!search->complete) return solutions + " found, there may be more";
   return search->solutions == 1 ? "the only solution" : "all " + solutions;
 }
 
@@ -137,12 +136,10 @@ void TextReport::Finish(const Network& network, const Summary& summary) {
   const auto& search = summary.search;
   if (search && search->complete) mResults << "==========\n";
   mResults.flush();
+  if (summary.outcome == Outcome::Open)
+    mRemarks << fmt::format("unknown: {} stays open\n", mNames.OfVariable(search->openVariable));
   if (mStyle.quiet) return;
   const Paint paint(mStyle.remarkColour);
-  if (search && search->open != 0) {
-    mRemarks << fmt::format("{} left out: {} stays unknown in {}\n", Counted(search->open, "assignment"),
-                            mNames.OfVariable(search->openVariable), search->open == 1 ? "it" : "them");
-  }
   const OperationCount total = Total(network.Counts());
   const bool good = summary.outcome == Outcome::Settled;
   mRemarks << fmt::format("{}; {}, {}, {} in {:.1f} ms\n",

@@ -46,32 +46,32 @@ std::size_t LongestOf(const Listing& listing) {
 
 Functions::Functions(Store& store, std::size_t budget)
     : mStore(store),
-      mTruth(store.Types()),
-      mSupports(store, mTruth, budget),
+      mSemantics(store.Types()),
+      mSupports(store, mSemantics, budget),
       mX(store.Types(), Sort::TextSet),
       mY(store.Types(), Sort::TextSet),
       mZ(store.Types(), Sort::TextSet) {}
 
 // Inputs with one value each give the result by one forward operation. An Undefined result takes what the module makes
 // of the sets of inputs. Everything else needs supports, or the module's sets again where these exceed the budget.
-Progress Functions::Narrow(const Constraint& constraint) {
+Status Functions::Narrow(const Constraint& constraint) {
   if (HasExactInputs(constraint)) {
     ComputeExact(constraint);
-    return Progress::Done;
+    return Status::Subsumed;
   }
   if (constraint.kind->meaning == Meaning::Length) BoundLength(constraint.Result());
-  if (mStore.HasFailed()) return Progress::Waits;
+  if (mStore.HasFailed()) return Status::Fixpoint;
   if (constraint.kind->meaning == Meaning::Successor && constraint.arguments[0] == constraint.Result()) {
     mStore.StartOperation(Operation::Successor);
     MeetResult(constraint, {GreatestText(), 0});  // the greatest text is its own successor
-    return Progress::Done;
+    return Status::Subsumed;
   }
-  if (mStore[constraint.Result()].IsUndefined() && ComputeSets(constraint)) return Progress::Waits;
-  if (mSupports.Narrow(constraint)) return Progress::Waits;
-  if (constraint.kind->meaning == Meaning::Slice && BoundSlice(constraint)) return Progress::Done;
-  if (mStore.HasFailed()) return Progress::Waits;
+  if (mStore[constraint.Result()].IsUndefined() && ComputeSets(constraint)) return Status::Fixpoint;
+  if (mSupports.Narrow(constraint)) return Status::Fixpoint;
+  if (constraint.kind->meaning == Meaning::Slice && BoundSlice(constraint)) return Status::Subsumed;
+  if (mStore.HasFailed()) return Status::Fixpoint;
   ComputeSets(constraint);
-  return Progress::Again;  // the result may be an input too
+  return Status::Again;  // the result may be an input too
 }
 
 bool Functions::HasExactInputs(const Constraint& constraint) const {
@@ -97,7 +97,7 @@ void Functions::ComputeExact(const Constraint& constraint) {
   }
   mStore.StartOperation(ForwardOf(constraint.kind->meaning));
   Answer answer;
-  if (!mTruth.Compute(*constraint.kind, inputs.data(), answer)) return mStore.Fail(constraint.Result());
+  if (!mSemantics.Compute(*constraint.kind, inputs.data(), answer)) return mStore.Fail(constraint.Result());
   MeetResult(constraint, answer);
 }
 

@@ -2,9 +2,9 @@
 #pragma once
 
 #include "network/relations.h"
+#include "network/semantics.h"
 #include "network/store.h"
 #include "network/supports.h"
-#include "network/truth.h"
 
 namespace zornet {
 
@@ -12,7 +12,7 @@ class Functions {
  public:
   Functions(Store& store, std::size_t budget);
 
-  Progress Narrow(const Constraint& constraint);
+  Status Narrow(const Constraint& constraint);
 
  private:
   bool HasExactInputs(const Constraint& constraint) const;
@@ -31,7 +31,7 @@ class Functions {
   void Bound(int number, std::int64_t lowest, std::int64_t highest);
 
   Store& mStore;
-  Truth mTruth;
+  Semantics mSemantics;
   Supports mSupports;
   Value mX, mY, mZ;  // sets
 };

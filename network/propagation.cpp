@@ -44,9 +44,9 @@ Outcome Propagation::Run() {
   while (mWaiting != 0) {
     if (!CountStep()) return Outcome::StepLimit;
     const int constraint = Next();
-    const auto progress = Narrow(constraint);
+    const Status status = Narrow(constraint);
     if (mStore.HasFailed()) return Outcome::Contradiction;
-    WakeReaders(progress == Progress::Again ? kNone : constraint);
+    WakeReaders(status == Status::Again ? kNone : constraint);
   }
   return Outcome::Settled;
 }
@@ -68,15 +68,15 @@ bool Propagation::CountStep() {
   return true;
 }
 
-Progress Propagation::Narrow(int constraint) {
+Status Propagation::Narrow(int constraint) {
   const Constraint& what = mModel.Constraints()[static_cast<std::size_t>(constraint)];
   mStore.StartConstraint(constraint);
-  const auto progress = what.kind->IsRelation() ? mRelations.Narrow(what) : mFunctions.Narrow(what);
-  if (progress == Progress::Done) {
+  const Status status = what.kind->IsRelation() ? mRelations.Narrow(what) : mFunctions.Narrow(what);
+  if (status == Status::Subsumed) {
     mStates[static_cast<std::size_t>(constraint)] = Finished;
     mFinished.push_back(constraint);
   }
-  return progress;
+  return status;
 }
 
 // A constraint that finds in one pass all that it can find is not woken by its own changes.

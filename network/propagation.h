@@ -1,5 +1,5 @@
 // Narrows a network until nothing changes any more: constraints wait in a queue and are woken by the variables that
-// they read. It ends, since every change leaves less in a variable, and it loses no solution (see Store and Truth).
+// they read. It ends, since every change leaves less in a variable, and it loses no solution (see Store and Semantics).
 #pragma once
 
 #include <cstdint>
@@ -40,7 +40,7 @@ class Propagation {
   void Wake(int constraint);
   void WakeReaders(int except);
   void FailOrderCycle();
-  Progress Narrow(int constraint);
+  Status Narrow(int constraint);
   int Next();
 
   Store& mStore;

@@ -40,9 +40,9 @@ Relations::Relations(Store& store)
       mSingle(store.Types(), Sort::Text),
       mOther(store.Types(), Sort::Text),
       mSet(store.Types(), Sort::TextSet),
-      mTruth(store.Types(), Sort::Boolean) {}
+      mReified(store.Types(), Sort::Boolean) {}
 
-Progress Relations::Narrow(const Constraint& constraint) {
+Status Relations::Narrow(const Constraint& constraint) {
   const Meaning meaning = constraint.kind->meaning;
   const int x = constraint.arguments[constraint.kind->mirrored ? 1 : 0];
   const int y = constraint.arguments[constraint.kind->mirrored ? 0 : 1];
@@ -53,7 +53,7 @@ Progress Relations::Narrow(const Constraint& constraint) {
   return IsOrder(meaning) ? Post(Opposite(meaning), y, x) : Post(Opposite(meaning), x, y);
 }
 
-Progress Relations::Post(Meaning meaning, int x, int y) {
+Status Relations::Post(Meaning meaning, int x, int y) {
   if (x == y) return Reflexive(meaning, x);
   switch (meaning) {
     case Meaning::Equal:
@@ -65,16 +65,16 @@ Progress Relations::Post(Meaning meaning, int x, int y) {
   }
 }
 
-Progress Relations::Reflexive(Meaning meaning, int x) {
+Status Relations::Reflexive(Meaning meaning, int x) {
   mStore.StartOperation(meaning == Meaning::Unequal ? Operation::Unequal : Operation::LessOrEqual);
-  if (!Truth::Relates(meaning, ZORString(), ZORString())) mStore.Fail(x);
-  return Progress::Done;
+  if (!Semantics::Relates(meaning, ZORString(), ZORString())) mStore.Fail(x);
+  return Status::Subsumed;
 }
 
-Progress Relations::Equal(int x, int y) {
+Status Relations::Equal(int x, int y) {
   Equate(x, y);
   if (!mStore.HasFailed()) Equate(y, x);
-  return mStore[x].IsOne() && mStore[y].IsOne() ? Progress::Done : Progress::Waits;
+  return mStore[x].IsOne() && mStore[y].IsOne() ? Status::Subsumed : Status::Fixpoint;
 }
 
 void Relations::Equate(int target, int other) {
@@ -96,11 +96,11 @@ void Relations::Equate(int target, int other) {
   }
 }
 
-Progress Relations::Unequal(int x, int y) {
+Status Relations::Unequal(int x, int y) {
   if (mStore[y].IsOne()) Remove(x, mStore[y].LowestText());
-  if (mStore.HasFailed()) return Progress::Done;
+  if (mStore.HasFailed()) return Status::Subsumed;
   if (mStore[x].IsOne()) Remove(y, mStore[x].LowestText());
-  return mStore[x].IsOne() && mStore[y].IsOne() ? Progress::Done : Progress::Waits;
+  return mStore[x].IsOne() && mStore[y].IsOne() ? Status::Subsumed : Status::Fixpoint;
 }
 
 void Relations::Remove(int target, const ZORString& text) {
@@ -113,17 +113,17 @@ void Relations::Remove(int target, const ZORString& text) {
 
 // x <= y or x < y: x loses what is greater than all of y, and y what is less than all of x. A strict order is posted as
 // less-or-equal and unequal, since the module compares only the upper bounds of sets.
-Progress Relations::Ordered(int x, int y, bool strict) {
+Status Relations::Ordered(int x, int y, bool strict) {
   if (!mStore[x].IsKnown() || !mStore[y].IsKnown()) {
     if (strict) NarrowBeyondEnds(x, y);
-    return Progress::Waits;
+    return Status::Fixpoint;
   }
   const ZORString lowest = mStore[x].LowestText(), highest = mStore[y].HighestText();
   const ZORString from = mStore[x].HighestText(), to = mStore[y].LowestText();
-  if (strict ? from < to : from <= to) return Progress::Done;
+  if (strict ? from < to : from <= to) return Status::Subsumed;
   CutAbove(x, highest, strict);
   if (!mStore.HasFailed()) CutBelow(y, lowest, strict);
-  return Progress::Waits;
+  return Status::Fixpoint;
 }
 
 // No text is less than the least one, and none greater than the greatest.
@@ -190,16 +190,16 @@ Value& Relations::Bound(const ZORString& text) {
   return bound;
 }
 
-Progress Relations::Decide(Meaning meaning, int x, int y, int truth) {
-  mTruth.Reset();
+Status Relations::Decide(Meaning meaning, int x, int y, int truth) {
+  mReified.Reset();
   if (x == y) {
     mStore.StartOperation(RelationOf(meaning));
-    mTruth.SetNumber(Truth::Relates(meaning, ZORString(), ZORString()) ? 1 : 0);
-  } else if (!mStore[x].IsKnown() || !mStore[y].IsKnown() || !Ask(meaning, x, y, mTruth)) {
-    return Progress::Waits;
+    mReified.SetNumber(Semantics::Relates(meaning, ZORString(), ZORString()) ? 1 : 0);
+  } else if (!mStore[x].IsKnown() || !mStore[y].IsKnown() || !Ask(meaning, x, y, mReified)) {
+    return Status::Fixpoint;
   }
-  mStore.Meet(truth, mTruth);
-  return Progress::Done;
+  mStore.Meet(truth, mReified);
+  return Status::Subsumed;
 }
 
 // False while the relation is open. Where the module would judge least texts by their state, their texts decide.
@@ -231,9 +231,9 @@ void Relations::AskOrder(Meaning meaning, const Value& left, const Value& right,
   if (!TouchesLeast(left) && !TouchesLeast(right)) {
     meaning == Meaning::Less ? left.Text().CalcIsLess(right.Text(), answer.Boolean())
                              : left.Text().CalcIsLessOrEqual(right.Any(), answer.Boolean());
-  } else if (Truth::Relates(meaning, left.HighestText(), right.LowestText())) {
+  } else if (Semantics::Relates(meaning, left.HighestText(), right.LowestText())) {
     answer.SetNumber(1);
-  } else if (!Truth::Relates(meaning, left.LowestText(), right.HighestText())) {
+  } else if (!Semantics::Relates(meaning, left.LowestText(), right.HighestText())) {
     answer.SetNumber(0);
   }
 }

@@ -1,31 +1,31 @@
 // Equality and order between two strings, posted or reified.
 #pragma once
 
+#include "network/semantics.h"
 #include "network/store.h"
-#include "network/truth.h"
 
 namespace zornet {
 
 // What a pass over a constraint leaves to do.
-enum class Progress {
-  Done,   // it holds whatever the values left; it need not be looked at again
-  Waits,  // until one of its variables is changed by another constraint
-  Again,  // until one of its variables is changed, also by itself
+enum class Status {
+  Subsumed,  // nothing: it holds whatever values are left
+  Fixpoint,  // nothing until another constraint changes one of its variables
+  Again,     // another pass after every change of its variables, its own changes included
 };
 
 class Relations {
  public:
   explicit Relations(Store& store);
 
-  Progress Narrow(const Constraint& constraint);
+  Status Narrow(const Constraint& constraint);
 
  private:
-  Progress Post(Meaning meaning, int x, int y);
-  Progress Equal(int x, int y);
-  Progress Unequal(int x, int y);
-  Progress Ordered(int x, int y, bool strict);
-  Progress Reflexive(Meaning meaning, int x);
-  Progress Decide(Meaning meaning, int x, int y, int truth);
+  Status Post(Meaning meaning, int x, int y);
+  Status Equal(int x, int y);
+  Status Unequal(int x, int y);
+  Status Ordered(int x, int y, bool strict);
+  Status Reflexive(Meaning meaning, int x);
+  Status Decide(Meaning meaning, int x, int y, int truth);
 
   void Equate(int target, int other);
   void Remove(int target, const ZORString& text);
@@ -44,7 +44,7 @@ class Relations {
   Store& mStore;
   Value mSingle, mOther;  // single texts that are Exact even when they are the greatest
   Value mSet;
-  Value mTruth;
+  Value mReified;
 };
 
 }  // namespace zornet

@@ -6,7 +6,10 @@
 namespace zornet {
 
 Search::Search(Store& store, Propagation& propagation)
-    : mStore(store), mPropagation(propagation), mTruth(store.Types()), mStamps(store.Model().Variables().size(), 0) {
+    : mStore(store),
+      mPropagation(propagation),
+      mSemantics(store.Types()),
+      mStamps(store.Model().Variables().size(), 0) {
   std::vector<char> taken(mStamps.size(), 0);
   const auto take = [&](int variable) {
     if (std::exchange(taken[static_cast<std::size_t>(variable)], 1) == 0) mOrder.push_back(variable);
@@ -199,7 +202,7 @@ bool Search::Confirm() {
                          exact[at] = {IsText(listing.sort) ? &listing.texts.front() : nullptr,
                                       IsText(listing.sort) ? 0 : listing.NumberAt(0), listing.sort};
                        }
-                       return mTruth.Holds(*c.kind, exact.data());
+                       return mSemantics.Holds(*c.kind, exact.data());
                      });
 }
 

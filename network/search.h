@@ -12,8 +12,8 @@
 #include <vector>
 
 #include "network/propagation.h"
+#include "network/semantics.h"
 #include "network/store.h"
-#include "network/truth.h"
 
 namespace zornet {
 
@@ -66,7 +66,7 @@ class Search {
 
   Store& mStore;
   Propagation& mPropagation;
-  Truth mTruth;
+  Semantics mSemantics;
   std::vector<int> mOrder;             // variables that matter, the wanted ones first
   std::size_t mWanted = 0;             // so many of them are wanted
   std::vector<std::size_t> mUnlisted;  // places in mOrder whose values could not be listed at first

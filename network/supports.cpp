@@ -61,7 +61,7 @@ bool Supports::Narrow(const Constraint& constraint) {
   mTargets.clear();
   for (int position = constraint.kind->Inputs(); position >= 0; --position) {
     const bool result = position == constraint.kind->Inputs();
-    if (!result && !Truth::CanInvert(*constraint.kind, position)) continue;
+    if (!result && !Semantics::CanInvert(*constraint.kind, position)) continue;
     const double combinations = Combinations(constraint, position);
     if (combinations <= static_cast<double>(mBudget)) {
       mTargets.emplace_back(combinations * (result ? 1 : kInversionCost), position);
@@ -163,9 +163,9 @@ bool Supports::TryOne(const Constraint& constraint, int target) {
   bool accepted = false;
   if (target == constraint.kind->Inputs()) {
     Answer answer;
-    accepted = mTruth.Compute(*constraint.kind, mExact.data(), answer) && Accept(target, std::move(answer));
+    accepted = mSemantics.Compute(*constraint.kind, mExact.data(), answer) && Accept(target, std::move(answer));
   } else {
-    auto answers = mTruth.Invert(*constraint.kind, target, mExact.data());
+    auto answers = mSemantics.Invert(*constraint.kind, target, mExact.data());
     if (!answers && At(target).IsListed()) return false;
     if (!answers) accepted = At(target).open = true;
     if (answers) {

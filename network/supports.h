@@ -9,14 +9,15 @@
 #include <utility>
 #include <vector>
 
+#include "network/semantics.h"
 #include "network/store.h"
-#include "network/truth.h"
 
 namespace zornet {
 
 class Supports {
  public:
-  Supports(Store& store, Truth& truth, std::size_t budget) : mStore(store), mTruth(truth), mBudget(budget) {}
+  Supports(Store& store, Semantics& semantics, std::size_t budget)
+      : mStore(store), mSemantics(semantics), mBudget(budget) {}
 
   // False when the combinations are more than the budget or cannot be listed; then nothing has changed.
   bool Narrow(const Constraint& constraint);
@@ -77,7 +78,7 @@ class Supports {
   bool IsTried(const Column& column) const;
 
   Store& mStore;
-  Truth& mTruth;
+  Semantics& mSemantics;
   std::size_t mBudget;
   std::size_t mCount = 0;                               // of the columns in use
   std::array<Column, kMostArguments> mColumns;          // one for each different variable

@@ -1,8 +1,8 @@
 // What the constraints mean on exact values: the one place that defines a solution. Narrowing is sound and complete
 // with respect to it.
 //
-// The module's forward operation on fresh single values computes a function. Where the module answers by state instead of
-// by text (one space) or in sums that wrap (slices), the texts decide. Equality and order are those of the texts.
+// The module's forward operation on fresh single values computes a function. Where the module answers by state instead
+// of by text (one space) or in sums that wrap (slices), the texts decide. Equality and order are those of the texts.
 //
 //   concatenation  of more than 255 characters: the greatest text
 //   slice          positions from 0, both ends in; an end behind the text is the last character; empty when it begins
@@ -34,9 +34,9 @@ struct Answer {
   bool operator==(const Answer& other) const { return number == other.number && text == other.text; }
 };
 
-class Truth {
+class Semantics {
  public:
-  explicit Truth(const Types& types);
+  explicit Semantics(const Types& types);
 
   // The value of a function; false when it has none.
   bool Compute(const Kind& kind, const Exact* inputs, Answer& result);

@@ -1,4 +1,4 @@
-#include "network/truth.h"
+#include "network/semantics.h"
 
 #include <algorithm>
 #include <array>
@@ -17,13 +17,13 @@ bool EndsWithSpace(const ZORString& text) { return ToView(text).ends_with(' '); 
 
 }  // namespace
 
-Truth::Truth(const Types& types)
+Semantics::Semantics(const Types& types)
     : mX(types, Sort::Text), mY(types, Sort::Text), mZ(types, Sort::Text), mLength(types, Sort::Integer) {
   for (int i = 0; i < kSorts; ++i) mForms.emplace_back(types, static_cast<Sort>(i));
 }
 
 // Operands are Exact, the greatest text too: the module would fold a Max by its state.
-bool Truth::Compute(const Kind& kind, const Exact* inputs, Answer& result) {
+bool Semantics::Compute(const Kind& kind, const Exact* inputs, Answer& result) {
   if (kind.meaning == Meaning::TextForm) return ComputeTextForm(inputs[0], result);
   if (kind.meaning == Meaning::Slice) {
     result.text = Slice(*inputs[0].text, inputs[1].number, inputs[2].number);
@@ -67,7 +67,7 @@ bool Truth::Compute(const Kind& kind, const Exact* inputs, Answer& result) {
   return !mZ.IsNil();
 }
 
-bool Truth::ComputeTextForm(const Exact& value, Answer& result) {
+bool Semantics::ComputeTextForm(const Exact& value, Answer& result) {
   Value& form = FormOf(value.sort);
   if (!IsText(value.sort)) {
     form.SetNumber(value.number);
@@ -82,13 +82,13 @@ bool Truth::ComputeTextForm(const Exact& value, Answer& result) {
 }
 
 // A number has one text form, whatever its sort; the module would put a set of one number in braces.
-Value& Truth::FormOf(Sort sort) { return mForms[static_cast<std::size_t>(IsInteger(sort) ? Sort::Integer : sort)]; }
+Value& Semantics::FormOf(Sort sort) { return mForms[static_cast<std::size_t>(IsInteger(sort) ? Sort::Integer : sort)]; }
 
-bool Truth::CanInvert(const Kind& kind, int position) {
+bool Semantics::CanInvert(const Kind& kind, int position) {
   return position < kind.Inputs() && kind.meaning != Meaning::Slice;
 }
 
-std::optional<std::vector<Answer>> Truth::Invert(const Kind& kind, int position, const Exact* values) {
+std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, int position, const Exact* values) {
   const Exact& result = values[kind.Inputs()];
   const Exact& other = values[kind.Inputs() == 2 ? 1 - position : 0];
   std::vector<Answer> proposals;
@@ -122,7 +122,7 @@ std::optional<std::vector<Answer>> Truth::Invert(const Kind& kind, int position,
 }
 
 // Whether this input gives the result with the others.
-bool Truth::Gives(const Kind& kind, int position, const Answer& input, const Exact* values) {
+bool Semantics::Gives(const Kind& kind, int position, const Answer& input, const Exact* values) {
   std::array<Exact, kMostArguments> exact{};
   std::copy_n(values, kind.arity, exact.begin());
   exact[static_cast<std::size_t>(position)].text = &input.text;
@@ -131,7 +131,7 @@ bool Truth::Gives(const Kind& kind, int position, const Answer& input, const Exa
 }
 
 // The module's inverse, and the inputs that it misses.
-void Truth::Propose(const Kind& kind, int position, const Exact* values, std::vector<Answer>& proposals) {
+void Semantics::Propose(const Kind& kind, int position, const Exact* values, std::vector<Answer>& proposals) {
   const Exact& result = values[kind.Inputs()];
   const Exact& other = values[kind.Inputs() == 2 ? 1 - position : 0];
   if (kind.meaning == Meaning::TextForm) return ProposeByTextForm(values[0], *result.text, proposals);
@@ -177,7 +177,7 @@ void Truth::Propose(const Kind& kind, int position, const Exact* values, std::ve
 }
 
 // The module reads a text up to its second quote; the form ends at the last.
-void Truth::ProposeByTextForm(const Exact& value, const ZORString& form, std::vector<Answer>& proposals) {
+void Semantics::ProposeByTextForm(const Exact& value, const ZORString& form, std::vector<Answer>& proposals) {
   Value& read = FormOf(value.sort);
   mZ.Text().SetExactValue(form);
   mZ.Text().CalcInverseStringRepresentation(read.Any());
@@ -186,14 +186,14 @@ void Truth::ProposeByTextForm(const Exact& value, const ZORString& form, std::ve
   if (IsText(value.sort) && length >= 2) proposals.push_back({Slice(form, 1, length - 2), 0});
 }
 
-void Truth::Take(std::vector<Answer>& proposals, const Value& target) {
+void Semantics::Take(std::vector<Answer>& proposals, const Value& target) {
   if (IsText(target.Sort()) && target.Text().IsFull()) return proposals.push_back({GreatestText(), 0});
   if (!target.IsOne()) return;
   const bool text = IsText(target.Sort());
   proposals.push_back(text ? Answer{target.LowestText(), 0} : Answer{ZORString(), target.LowestNumber()});
 }
 
-bool Truth::Relates(Meaning meaning, const ZORString& x, const ZORString& y) {
+bool Semantics::Relates(Meaning meaning, const ZORString& x, const ZORString& y) {
   switch (meaning) {
     case Meaning::Equal:
       return x == y;
@@ -208,7 +208,7 @@ bool Truth::Relates(Meaning meaning, const ZORString& x, const ZORString& y) {
   }
 }
 
-bool Truth::Holds(const Kind& kind, const Exact* values) {
+bool Semantics::Holds(const Kind& kind, const Exact* values) {
   if (kind.IsRelation()) {
     const Exact& x = values[kind.mirrored ? 1 : 0];
     const Exact& y = values[kind.mirrored ? 0 : 1];

@@ -207,7 +207,8 @@ bool Functions::BoundSlice(const Constraint& constraint) {
   if (!part.IsKnown()) return false;
   const std::size_t shortest = ShortestOf(mStore.List(slice));
   if (shortest > 0) BoundPositions(from, to, shortest);
-  if (!mStore.HasFailed()) DropLongTexts(slice, lastEnd - std::max<std::int64_t>(firstBegin, 0) + 1);
+  const std::int64_t longest = lastEnd - std::max<std::int64_t>(firstBegin, 0) + 1;
+  if (!mStore.HasFailed()) DropLongTexts(slice, std::max<std::int64_t>(longest, 0));
   return false;
 }
 

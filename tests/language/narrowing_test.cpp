@@ -31,6 +31,8 @@ const Row kNetworks[] = {
   {"a slice that is not empty lies inside the longest text",
    "var string: x; var -9..900: from; var 0..800: to; var {\"abc\", \"ab\"}: z; constraint str_substr(x, from, to, z);",
    "Any, 0..253, 1..800, { \"ab\", \"abc\" }"},
+  {"an end ahead of every text leaves the empty slice",
+   "var string: x; var {-5, 0}: from; var {\"\", \"a\"}: z; constraint str_substr(x, from, -2, z);", "Any, { -5, 0 }, Min"},
   {"nor is it longer than its positions allow",
    "var string: x; var {\"abcd\", \"ab\"}: z; constraint str_substr(x, 2, 4, z);", "Any, \"ab\""},
   {"more numbers than memory has room for",

@@ -30,10 +30,20 @@ Operation ForwardOf(Meaning meaning) {
   }
 }
 
-std::size_t ShortestOf(const Listing& listing) {
-  std::size_t shortest = kTextLimit;
-  for (const ZORString& text : listing.texts) shortest = std::min(shortest, ToView(text).size());
+constexpr std::int64_t kLastPosition = zor::kLengthLimit - 1;  // of a character in any text
+
+std::int64_t ShortestOf(const Listing& listing) {
+  std::int64_t shortest = zor::kLengthLimit;
+  for (const ZORString& text : listing.texts) shortest = std::min<std::int64_t>(shortest, text.GetLengthInChar());
   return shortest;
+}
+
+std::int64_t LowestOr(const Value& number, std::int64_t unknown) {
+  return number.IsKnown() ? number.LowestNumber() : unknown;
+}
+
+std::int64_t HighestOr(const Value& number, std::int64_t unknown) {
+  return number.IsKnown() ? number.HighestNumber() : unknown;
 }
 
 std::size_t LongestOf(const Listing& listing) {
@@ -194,34 +204,25 @@ void Functions::BoundLength(int number) {
 // Narrows positions and slice by each other, whatever the text is. True when the slice must be empty.
 bool Functions::BoundSlice(const Constraint& constraint) {
   const auto [text, from, to, slice] = constraint.arguments;
-  const Value &begin = mStore[from], &end = mStore[to], &part = mStore[slice];
-  const std::int64_t last = static_cast<std::int64_t>(kTextLimit) - 1;
-  const std::int64_t lastBegin = begin.IsKnown() ? begin.HighestNumber() : last,
-                     lastEnd = end.IsKnown() ? end.HighestNumber() : last;
-  const std::int64_t firstBegin = begin.IsKnown() ? begin.LowestNumber() : 0;
+  const std::int64_t first = std::max<std::int64_t>(LowestOr(mStore[from], 0), 0);
+  const std::int64_t last = HighestOr(mStore[to], kLastPosition);
   mStore.StartOperation(Operation::Slice);
-  if (lastBegin < 0 || firstBegin > last || lastEnd < firstBegin) {
+  if (HighestOr(mStore[from], kLastPosition) < 0 || first > kLastPosition || last < first) {
     MeetResult(constraint, {});
     return true;
   }
-  if (!part.IsKnown()) return false;
-  const std::size_t shortest = ShortestOf(mStore.List(slice));
-  if (shortest > 0) BoundPositions(from, to, shortest);
-  const std::int64_t longest = lastEnd - std::max<std::int64_t>(firstBegin, 0) + 1;
-  if (!mStore.HasFailed()) DropLongTexts(slice, std::max<std::int64_t>(longest, 0));
+  if (!mStore[slice].IsKnown()) return false;
+  BoundPositions(from, to, ShortestOf(mStore.List(slice)));
+  if (!mStore.HasFailed()) DropLongTexts(slice, last - first + 1);
   return false;
 }
 
-// A slice of so many characters begins inside the longest text, and ends no earlier than they do.
-void Functions::BoundPositions(int from, int to, std::size_t shortest) {
-  const auto length = static_cast<std::int64_t>(shortest);
-  const Value& end = mStore[to];
-  const std::int64_t lastEnd = end.IsKnown() ? end.HighestNumber() : kTextLimit;
-  Bound(from, 0, std::min<std::int64_t>(lastEnd, kTextLimit - 1) - length + 1);
+// A slice that is not empty begins inside the longest text, and ends so many characters later.
+void Functions::BoundPositions(int from, int to, std::int64_t shortest) {
+  if (shortest == 0) return;
+  Bound(from, 0, std::min(HighestOr(mStore[to], kLastPosition), kLastPosition) - shortest + 1);
   if (mStore.HasFailed()) return;
-  const Value& begin = mStore[from];
-  const std::int64_t firstBegin = begin.IsKnown() ? begin.LowestNumber() : 0;
-  Bound(to, firstBegin + length - 1, std::numeric_limits<ZORLong>::max());
+  Bound(to, LowestOr(mStore[from], 0) + shortest - 1, std::numeric_limits<ZORLong>::max());
 }
 
 void Functions::DropLongTexts(int variable, std::int64_t longest) {

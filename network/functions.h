@@ -26,7 +26,7 @@ class Functions {
   void MeetSet(int variable, const Value& set);
   void BoundLength(int number);
   bool BoundSlice(const Constraint& constraint);
-  void BoundPositions(int from, int to, std::size_t shortest);
+  void BoundPositions(int from, int to, std::int64_t shortest);
   void DropLongTexts(int variable, std::int64_t longest);
   void Bound(int number, std::int64_t lowest, std::int64_t highest);
 

@@ -102,40 +102,34 @@ bool Supports::DriveConcatenation() {
   return true;
 }
 
-// Keeps the ways to cut the result in two.
+// Keeps the ways to cut the result in two: x begins it, y is the rest.
 bool Supports::Split(std::size_t result) {
-  Column &x = At(0), &y = At(1), &z = At(2);
-  const std::string_view text = TextAt(*z.listing, result);
-  const auto isSame = [&](const Column& a, std::size_t i, const Column& b, std::size_t j) {
-    return &a != &b || i == j;
-  };
-  if (!x.IsListed()) {
-    for (std::size_t length = 0; length <= text.size(); ++length) {
+  const Column& x = At(0);
+  const std::string_view text = TextAt(*At(2).listing, result);
+  if (x.IsListed()) {
+    return ForEachBeginning(*x.listing, text, [&](bool begins, std::size_t i) {
       if (!Spend()) return false;
-      const std::size_t j = LowerBound(*y.listing, text.substr(length));
-      if (j == y.listing->count || TextAt(*y.listing, j) != text.substr(length) || !isSame(y, j, z, result)) continue;
-      x.found.push_back({ToZor(text.substr(0, length)), 0});
-      y.Keep(j);
-      z.Keep(result);
-    }
-    return true;
+      if (begins) KeepCut(result, TextAt(*x.listing, i).size(), i);
+      return true;
+    });
   }
-  return ForEachBeginning(*x.listing, text, [&](bool begins, std::size_t i) {
+  for (std::size_t length = 0; length <= text.size(); ++length) {
     if (!Spend()) return false;
-    if (!begins || !isSame(x, i, z, result)) return true;
-    const std::string_view rest = text.substr(TextAt(*x.listing, i).size());
-    if (y.IsListed()) {
-      const std::size_t j = LowerBound(*y.listing, rest);
-      const bool isThere = j < y.listing->count && TextAt(*y.listing, j) == rest;
-      if (!isThere || !isSame(x, i, y, j) || !isSame(y, j, z, result)) return true;
-      y.Keep(j);
-    } else {
-      y.found.push_back({ToZor(rest), 0});
-    }
-    x.Keep(i);
-    z.Keep(result);
-    return true;
-  });
+    KeepCut(result, length, 0);
+  }
+  return true;
+}
+
+// Cuts the result behind so many characters, which are the text of x at i where x is listed.
+void Supports::KeepCut(std::size_t result, std::size_t length, std::size_t i) {
+  Column &x = At(0), &y = At(1), &z = At(2);
+  const std::string_view text = TextAt(*z.listing, result), rest = text.substr(length);
+  const std::size_t j = y.IsListed() ? LowerBound(*y.listing, rest) : 0;
+  if (y.IsListed() && (j == y.listing->count || TextAt(*y.listing, j) != rest)) return;
+  if ((&x == &z && i != result) || (&y == &z && j != result) || (&x == &y && i != j)) return;
+  x.IsListed() ? x.Keep(i) : x.found.push_back({ToZor(text.substr(0, length)), 0});
+  y.IsListed() ? y.Keep(j) : y.found.push_back({ToZor(rest), 0});
+  z.Keep(result);
 }
 
 // Of one unknown text twice.

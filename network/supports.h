@@ -63,6 +63,7 @@ class Supports {
   bool Spend();
   bool DriveConcatenation();
   bool Split(std::size_t result);
+  void KeepCut(std::size_t result, std::size_t length, std::size_t i);
   bool KeepDoubled(std::size_t result);
   void KeepOverflow(std::size_t greatest);
   bool DriveSlice();

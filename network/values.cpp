@@ -153,6 +153,7 @@ std::string Value::Print() const {
 
 // Prints the greatest text of a set as Max: the union of the greatest value and the rest.
 std::string Value::Show() const {
+  if (mSort == Sort::IntegerSet && IsOne()) return fmt::to_string(LowestNumber());
   if (mSort != Sort::TextSet || !IsKnown() || HighestText() != GreatestText()) return Print();
   Value shown(*this), rest(*this);
   shown.Text().CalcMaxValue();

@@ -42,6 +42,7 @@ const Row kNetworks[] = {
   {"orders in a circle",
    "var string: a; var string: b; var string: c; constraint str_lt(a, b); constraint str_eq(b, c); constraint str_ge(a, c);",
    "Nil, Any, Any"},
+  {"a set of one number shows as that number", "var {3, 4}: n; constraint str_text(n, \"4\");", "4"},
   {"above an unknown text", "var string: x; var {\"\", \"a\"}: y; constraint str_lt(x, y);", "Any, \"a\""},
   {"nor does an unknown minimum", "var string: x; var string: z = \"b\"; constraint str_min(x, \"c\", z);", "\"b\", \"b\""},
   {"the least text does not replace what it is compared with",

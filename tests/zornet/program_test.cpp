@@ -80,6 +80,7 @@ TEST(Program, ExitCodes) {
   EXPECT_EQ(Zornet(Quoted(kExamples) + " 2>&1").code, 2);
   EXPECT_EQ(Zornet("--explain nobody " + Example("hello") + " 2>&1").code, 2);
   EXPECT_EQ(Zornet("--dot /no/such/folder/x " + Example("hello") + " 2>&1").code, 2);
+  EXPECT_EQ(Zornet("--raw --explain host " + Example("hello") + " 2>&1").code, 2);
   EXPECT_EQ(RunModel("var x;", "2>&1").code, 3);
   EXPECT_EQ(Zornet("--step-limit 1 " + Example("hello") + " 2>&1").code, 5);
   EXPECT_EQ(Zornet("--help 2>&1").code, 0);
@@ -87,6 +88,27 @@ TEST(Program, ExitCodes) {
     EXPECT_EQ(RunModel(kMany, std::string(arguments) + " 2>/dev/null >/dev/full").code, 2) << arguments;
   EXPECT_EQ(Zornet(Example("hello") + " 2>/dev/null >&-").code, 2);
   EXPECT_EQ(Zornet("--version").code, 0);
+}
+
+// What others make models of: no end, no line end, no memory.
+TEST(Program, HugeModels) {
+  const Ran endless = Zornet("/dev/zero 2>&1");
+  EXPECT_EQ(endless.code, 2);
+  EXPECT_EQ(endless.out, "zornet: error: /dev/zero: is larger than 256 MB\n");
+  const Ran garbage = Zornet("- 2>&1 <<END\n$(head -c 5000000 /dev/zero | tr '\\0' '#')\nEND\n");
+  EXPECT_EQ(garbage.code, 3);
+  EXPECT_LT(garbage.out.size(), 20'000u);
+#if !defined(__SANITIZE_ADDRESS__) && !defined(__clang__)  // whose shadow of the memory is larger than any limit
+  const Ran without = Zornet("-h >/dev/null; ulimit -v 100000; '" + kProgram + "' /dev/zero 2>&1");
+  EXPECT_EQ(without.code, 7);
+  EXPECT_EQ(without.out, "zornet: error: out of memory\n");
+#endif
+}
+
+TEST(Program, GraphsOnStandardOutput) {
+  EXPECT_NE(Zornet("-q --dot - " + Example("hello")).out.find("\ndigraph network {"), std::string::npos);
+  EXPECT_NE(Zornet("-q --svg - " + Example("hello")).out.find("\n<svg "), std::string::npos);
+  EXPECT_FALSE(fs::exists("-"));
 }
 
 TEST(Program, NumbersAreWholeAndNotNegative) {

@@ -6,13 +6,24 @@
 
 namespace zornet {
 
+namespace {
+
+// A message may quote a name as long as the model.
+std::string Shortened(std::string message) {
+  constexpr std::size_t kLongest = 1000, kCut = kLongest / 2;
+  if (message.size() <= kLongest) return message;
+  return message.substr(0, kCut) + "..." + message.substr(message.size() - kCut);
+}
+
+}  // namespace
+
 void Diagnostics::Error(Extent extent, std::string message) {
   ++mErrors;
-  if (!Stopped()) mAll.push_back({Diagnostic::Error, extent, std::move(message)});
+  if (!Stopped()) mAll.push_back({Diagnostic::Error, extent, Shortened(std::move(message))});
 }
 
 void Diagnostics::Note(Extent extent, std::string message) {
-  if (!Stopped()) mAll.push_back({Diagnostic::Note, extent, std::move(message)});
+  if (!Stopped()) mAll.push_back({Diagnostic::Note, extent, Shortened(std::move(message))});
 }
 
 void Diagnostics::Sort() {

@@ -21,6 +21,7 @@ class Diagnostics {
  public:
   static constexpr std::size_t kErrorLimit = 20;
 
+  // The middle of a long message is left out.
   void Error(Extent extent, std::string message);  // beyond the limit nothing is added
   void Note(Extent extent, std::string message);   // to the last error
   void Sort();                                     // into the order of their places

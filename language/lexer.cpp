@@ -25,7 +25,9 @@ std::string NameOf(std::string_view character) {
 
 }  // namespace
 
+// Behind the last error that is told there is nothing worth reading.
 Token Lexer::Next() {
+  if (mDiagnostics.Stopped()) mNext = mText.size();
   SkipBlanks();
   if (mNext >= mText.size()) return Make(Token::End, 0);
   const char c = At(0);

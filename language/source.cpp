@@ -6,13 +6,15 @@
 namespace zornet {
 
 Source::Source(std::string name, std::string text) : mName(std::move(name)), mText(std::move(text)), mLines{0} {
+  mLines.reserve(1 + static_cast<std::size_t>(std::count(mText.begin(), mText.end(), '\n')));
   for (std::size_t end = mText.find('\n'); end != std::string::npos; end = mText.find('\n', end + 1))
     mLines.push_back(end + 1);
 }
 
 std::string_view Source::Line(std::size_t line) const {
   const std::size_t begin = LineBegin(line);
-  std::string_view text = Text().substr(begin, Text().find('\n', begin) - begin);
+  const std::size_t end = line < mLines.size() ? LineBegin(line + 1) - 1 : mText.size();
+  std::string_view text = Text().substr(begin, end - begin);
   if (text.ends_with('\r')) text.remove_suffix(1);
   return text;
 }
@@ -28,9 +30,15 @@ std::size_t Source::LineOf(std::size_t position) const {
   return static_cast<std::size_t>(next - mLines.begin());
 }
 
-Location Source::Locate(std::size_t position) const {
-  const std::size_t line = LineOf(position), begin = LineBegin(line);
-  return {line, 1 + CountCharacters(Text().substr(begin, position - begin))};
+Location Locator::operator()(std::size_t position) {
+  const std::size_t line = mSource.LineOf(position);
+  if (line != mLocation.line || position < mPosition) {
+    mLocation = {line, 1};
+    mPosition = mSource.LineBegin(line);
+  }
+  mLocation.column += CountCharacters(mSource.Text({mPosition, position - mPosition}));
+  mPosition = position;
+  return mLocation;
 }
 
 std::size_t CharacterLength(std::string_view text) {

@@ -33,12 +33,23 @@ class Source {
   std::size_t LineBegin(std::size_t line) const { return mLines[line - 1]; }
   std::string_view InLine(Extent extent) const;  // what of it stands in the line where it begins
   std::size_t LineOf(std::size_t position) const;
-  Location Locate(std::size_t position) const;  // reads the line up to there
 
  private:
   std::string mName;
   std::string mText;
   std::vector<std::size_t> mLines;  // where each begins
+};
+
+// Tells where positions are. A line is read up to there, or on from the position before.
+class Locator {
+ public:
+  explicit Locator(const Source& source) : mSource(source) {}
+  Location operator()(std::size_t position);
+
+ private:
+  const Source& mSource;
+  std::size_t mPosition = 0;
+  Location mLocation;
 };
 
 // Characters of UTF-8; a stray byte counts as one. Bytes of the first, of a text that is not empty:

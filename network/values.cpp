@@ -153,6 +153,7 @@ std::string Value::Print() const {
 
 // A set that lists the greatest text shows it as Max: it is printed as the union of the greatest value and the rest.
 std::string Value::Show() const {
+  if (mSort == Sort::IntegerSet && IsOne()) return fmt::to_string(LowestNumber());
   if (mSort != Sort::TextSet || !IsKnown() || HighestText() != GreatestText()) return Print();
   Value shown(*this), rest(*this);
   shown.Text().CalcMaxValue();

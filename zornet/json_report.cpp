@@ -47,8 +47,9 @@ class JsonReport : public Report {
       : mModel(model), mNames(source, places, model), mResults(results) {}
 
   void Errors(const Source& source, const Diagnostics& diagnostics) override {
+    Locator locate(source);
     for (const Diagnostic& diagnostic : diagnostics.All()) {
-      const Location at = source.Locate(diagnostic.extent.begin);
+      const Location at = locate(diagnostic.extent.begin);
       Tell({{"event", diagnostic.severity == Diagnostic::Error ? "error" : "note"},
             {"file", source.Name()},
             {"line", at.line},

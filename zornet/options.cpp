@@ -41,15 +41,18 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   auto* solutions =
       app.add_option("--solutions", options.solutions, "Print up to N solutions")->type_name("N")->check(WholeFrom(1));
   app.add_flag("--trace", options.trace, "Print each narrowing as it happens");
-  app.add_option("--explain", options.explain, "Print what brought a variable to its value")
-      ->type_name("NAME")
-      ->allow_extra_args(false);
+  auto* explain = app.add_option("--explain", options.explain, "Print what brought a variable to its value")
+                      ->type_name("NAME")
+                      ->allow_extra_args(false);
   app.add_flag("--stats", options.stats, "Print calls, changes and contradictions of each operation");
   app.add_flag("--raw", options.raw, "Call the module's bare operations in the order of the file, once each")
-      ->excludes(solutions);
+      ->excludes(solutions)
+      ->excludes(explain);
   app.add_flag("--json-stream", options.json, "Print everything as one JSON object a line");
-  app.add_option("--dot", options.dot, "Write the network as a graph for Graphviz")->type_name("FILE");
-  app.add_option("--svg", options.svg, "Write the network as a picture; needs Graphviz")->type_name("FILE");
+  app.add_option("--dot", options.dot, "Write the network as a graph for Graphviz; - for standard output")
+      ->type_name("FILE");
+  app.add_option("--svg", options.svg, "Write the network as a picture; - for standard output; needs Graphviz")
+      ->type_name("FILE");
   app.add_option("--color", options.colour, "auto, always or never")
       ->type_name("WHEN")
       ->check(CLI::IsMember({"auto", "always", "never"}));

@@ -10,6 +10,7 @@
 #include <csignal>
 #include <cstring>
 #include <fstream>
+#include <iostream>
 #include <stdexcept>
 #include <string_view>
 
@@ -45,7 +46,7 @@ pid_t StartDot(const std::string& file, const Pipe& input) {
   posix_spawn_file_actions_init(&actions);
   posix_spawn_file_actions_adddup2(&actions, input.ends[0], STDIN_FILENO);
   std::string program = "dot", format = "-Tsvg", output = "-o" + file;
-  char* const arguments[] = {program.data(), format.data(), output.data(), nullptr};
+  char* const arguments[] = {program.data(), format.data(), file == "-" ? nullptr : output.data(), nullptr};
   pid_t child = 0;
   const int error = posix_spawnp(&child, "dot", &actions, nullptr, arguments, environ);
   posix_spawn_file_actions_destroy(&actions);
@@ -72,6 +73,10 @@ void Feed(Pipe& input, std::string_view graph) {
 }  // namespace
 
 void WriteGraph(const std::string& file, const std::string& graph) {
+  if (file == "-") {
+    std::cout << graph;
+    return;
+  }
   std::ofstream out(file);
   out << graph;
   out.close();
@@ -79,6 +84,7 @@ void WriteGraph(const std::string& file, const std::string& graph) {
 }
 
 void WritePicture(const std::string& file, const std::string& graph) {
+  std::cout.flush();
   Pipe input;
   const pid_t child = StartDot(file, input);
   Feed(input, graph);

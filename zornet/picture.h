@@ -1,4 +1,4 @@
-// Graphs as files. Both throw std::runtime_error when the file cannot be written.
+// Graphs as files; - is standard output. Both throw std::runtime_error when the file cannot be written.
 #pragma once
 
 #include <string>

@@ -13,6 +13,7 @@ namespace {
 
 constexpr std::size_t kWindow = 120;  // characters that are shown of a line
 constexpr std::size_t kAhead = 40;    // of them ahead of what is marked
+constexpr std::size_t kLongestCharacter = 4;
 constexpr std::string_view kCut = "...";
 
 std::vector<std::string_view> Split(std::string_view text) {
@@ -41,21 +42,39 @@ std::string Caret(std::size_t characters) {
   return caret;
 }
 
-// The line and below it the mark, both counted in characters. A tab stays one in the blanks ahead of the mark.
-std::string MarkedLine(std::string_view line, std::size_t from, std::size_t marked, const Paint& paint) {
-  const std::vector<std::string_view> characters = Split(line);
+// What is shown of a line is cut out of this many bytes on each side of the mark's begin.
+constexpr std::size_t kReach = kWindow * kLongestCharacter;
+
+// The line and below it the mark, of so many characters from that byte on. A tab stays one in the blanks ahead of it.
+std::string MarkedLine(std::string_view line, std::size_t mark, std::size_t marked, const Paint& paint) {
+  const std::size_t at = std::min(mark, line.size()), begin = at - std::min(at, kReach);
+  const std::size_t end = std::min(at + kReach, line.size());
+  std::vector<std::string_view> characters = Split(line.substr(begin, at - begin));
+  const std::size_t from = characters.size();
+  for (const std::string_view character : Split(line.substr(at, end - at))) characters.push_back(character);
   const std::size_t size = characters.size();
   const std::size_t first = size <= kWindow ? 0 : std::min(from - std::min(from, kAhead), size - kWindow);
   const std::size_t last = std::min(first + kWindow, size);
-  std::string shown(first != 0 ? kCut : "");
+  std::string shown(begin != 0 || first != 0 ? kCut : "");
   std::string below(shown.size(), ' ');
   for (std::size_t i = first; i < last; ++i) {
     shown += Harmless(characters[i]);
     if (i < from) below += characters[i] == "\t" ? '\t' : ' ';
   }
-  if (last != size) shown += kCut;
+  if (end != line.size() || last != size) shown += kCut;
   const std::size_t room = std::max<std::size_t>(last - std::min(from, last), 1);
   return fmt::format("{}\n{}{}", shown, below, paint(Style::Caret, Caret(std::min(marked, room))));
+}
+
+std::string Told(const Source& source, const Diagnostic& diagnostic, const Location& at, bool colour) {
+  const bool error = diagnostic.severity == Diagnostic::Error;
+  const Extent marked{diagnostic.extent.begin, std::min(diagnostic.extent.length, kReach)};
+  const Paint paint(colour);
+  return fmt::format(
+      "{} {} {}\n{}\n", paint(Style::Bold, fmt::format("{}:{}:{}:", source.Name(), at.line, at.column)),
+      error ? paint(Style::Error, "error:") : paint(Style::Note, "note:"),
+      paint(error ? Style::Bold : Style::Plain, Harmless(diagnostic.message)),
+      MarkedLine(source.Line(at.line), marked.begin - source.LineBegin(at.line), MarkedLength(source, marked), paint));
 }
 
 }  // namespace
@@ -64,19 +83,11 @@ std::size_t MarkedLength(const Source& source, Extent extent) {
   return std::max<std::size_t>(CountCharacters(source.InLine(extent)), 1);
 }
 
-std::string Render(const Source& source, const Diagnostic& diagnostic, bool colour) {
-  const bool error = diagnostic.severity == Diagnostic::Error;
-  const Location at = source.Locate(diagnostic.extent.begin);
-  const Paint paint(colour);
-  return fmt::format("{} {} {}\n{}\n", paint(Style::Bold, fmt::format("{}:{}:{}:", source.Name(), at.line, at.column)),
-                     error ? paint(Style::Error, "error:") : paint(Style::Note, "note:"),
-                     paint(error ? Style::Bold : Style::Plain, Harmless(diagnostic.message)),
-                     MarkedLine(source.Line(at.line), at.column - 1, MarkedLength(source, diagnostic.extent), paint));
-}
-
 std::string Render(const Source& source, const Diagnostics& diagnostics, bool colour) {
   std::string text;
-  for (const Diagnostic& diagnostic : diagnostics.All()) text += Render(source, diagnostic, colour);
+  Locator locate(source);
+  for (const Diagnostic& diagnostic : diagnostics.All())
+    text += Told(source, diagnostic, locate(diagnostic.extent.begin), colour);
   if (diagnostics.Stopped()) {
     text += fmt::format("{}: stopped after {} errors\n", source.Name(), Diagnostics::kErrorLimit);
   }

@@ -11,7 +11,6 @@ namespace zornet {
 std::size_t MarkedLength(const Source& source, Extent extent);
 
 // Of a long line the neighbourhood of what is marked. Control characters are shown as question marks.
-std::string Render(const Source& source, const Diagnostic& diagnostic, bool colour);
 std::string Render(const Source& source, const Diagnostics& diagnostics, bool colour);
 
 }  // namespace zornet

@@ -10,7 +10,7 @@
 #include <filesystem>
 #include <fstream>
 #include <iostream>
-#include <iterator>
+#include <new>
 #include <stdexcept>
 
 #include "language/reader.h"
@@ -29,13 +29,27 @@ struct UsageError : std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
+constexpr std::size_t kMegabyte = 1 << 20, kMostMegabytes = 256;  // a model is no larger
+
+// In pieces, since some files have no end.
+std::string ReadAll(std::istream& in, const std::string& name) {
+  std::string text;
+  for (std::size_t size = 0; in; text.resize(size)) {
+    if (size > kMostMegabytes * kMegabyte)
+      throw UsageError(fmt::format("{}: is larger than {} MB", name, kMostMegabytes));
+    text.resize(size + kMegabyte);
+    size += static_cast<std::size_t>(in.read(text.data() + size, kMegabyte).gcount());
+  }
+  return text;
+}
+
 // A model may be named without its ending.
 Source Load(std::string file) {
-  if (file == "-") return {"<stdin>", {std::istreambuf_iterator<char>(std::cin), {}}};
+  if (file == "-") return {"<stdin>", ReadAll(std::cin, "<stdin>")};
   if (!std::filesystem::exists(file) && std::filesystem::exists(file + ".szn")) file += ".szn";
   if (std::filesystem::is_directory(file)) throw UsageError(file + ": is a folder");
   std::ifstream in(file, std::ios::binary);
-  std::string text{std::istreambuf_iterator<char>(in), {}};
+  std::string text = ReadAll(in, file);
   if (!in.is_open() || in.bad()) throw UsageError(fmt::format("{}: {}", file, std::strerror(errno)));
   return {file, std::move(text)};
 }
@@ -144,8 +158,8 @@ int Run(const Options& options) {
     return options.json ? MakeJsonReport(source, places, model, std::cout)
                         : MakeTextReport(source, places, model, style, std::cout, std::cerr);
   };
-  const auto fail = [&](const std::exception& error, int code) {
-    reportOn(Source(options.file, ""), {}, {})->Failure(error.what());
+  const auto fail = [&](const std::string& message, int code) {
+    reportOn(Source(options.file, ""), {}, {})->Failure(message);
     return code;
   };
   try {
@@ -161,9 +175,11 @@ int Run(const Options& options) {
     const auto report = reportOn(source, read.places, network.GetModel());
     return OneRun(options, network, names, *report).Go();
   } catch (const ModuleFailure& error) {
-    return fail(error, kModuleError);
+    return fail(error.what(), kModuleError);
   } catch (const std::runtime_error& error) {
-    return fail(error, kUsage);
+    return fail(error.what(), kUsage);
+  } catch (const std::bad_alloc&) {
+    return fail("out of memory", kNoMemory);
   }
 }
 

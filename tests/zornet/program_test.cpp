@@ -80,6 +80,9 @@ TEST(Program, ExitCodes) {
   EXPECT_EQ(Zornet(Quoted(kExamples) + " 2>&1").code, 2);
   EXPECT_EQ(Zornet("--explain nobody " + Example("hello") + " 2>&1").code, 2);
   EXPECT_EQ(Zornet("--dot /no/such/folder/x " + Example("hello") + " 2>&1").code, 2);
+  EXPECT_TRUE(
+      Zornet("--raw --explain host " + Example("hello") + " 2>&1").out.starts_with("--explain excludes --raw\n"));
+  EXPECT_EQ(Zornet("/dev/zero 2>&1").out, "zornet: error: /dev/zero: is larger than 256 MB\n");
   EXPECT_EQ(RunModel("var x;", "2>&1").code, 3);
   EXPECT_EQ(Zornet("--step-limit 1 " + Example("hello") + " 2>&1").code, 5);
   EXPECT_EQ(Zornet("--help 2>&1").code, 0);
@@ -88,6 +91,14 @@ TEST(Program, ExitCodes) {
   EXPECT_EQ(Zornet(Example("hello") + " 2>/dev/null >&-").code, 2);
   EXPECT_EQ(Zornet("--version").code, 0);
 }
+
+#if !defined(__SANITIZE_ADDRESS__)  // whose own memory is beyond the limit
+TEST(Program, MemoryThatCannotBeHad) {
+  const Ran ran = Zornet("-h >/dev/null; ulimit -v 300000; '" + kProgram + "' /dev/zero 2>&1");
+  EXPECT_EQ(ran.out, "zornet: error: out of memory\n");
+  EXPECT_EQ(ran.code, 7);
+}
+#endif
 
 TEST(Program, NumbersAreWholeAndNotNegative) {
   for (const char* option : {"--budget -1", "--step-limit=-5", "--solutions -1", "--solutions 0", "--budget 1e3"}) {
@@ -236,7 +247,7 @@ TEST(Program, Colours) {
 }
 
 TEST(Program, Graph) {
-  const std::string graph = Zornet("-q --dot /dev/stdout " + Example("clash")).out;
+  const std::string graph = Zornet("-q --dot - " + Example("clash")).out;
   EXPECT_NE(graph.find("<b>found</b><br/>Nil"), std::string::npos);
   EXPECT_NE(graph.find("color=\"#b3261e\", penwidth=2, label=<<b>found</b>"), std::string::npos);
   EXPECT_NE(graph.find("fontcolor=\"#b3261e\", penwidth=2, label=\"str_eq\""), std::string::npos);

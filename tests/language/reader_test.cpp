@@ -189,6 +189,7 @@ TEST(Reader, LongBrokenModels) {
   }
   EXPECT_TRUE(Told(names + uses).ends_with("stopped after 20 errors\n"));
   EXPECT_TRUE(Told(items).starts_with("1:1: error: expected 'var'"));
+  EXPECT_LT(Told("output " + std::string(300000, 'n') + ";").size(), 2000u);
   EXPECT_TRUE(Told("output " + std::string(300000, 'n') + ";" + names).find("is not declared\n") != std::string::npos);
 }
 

@@ -255,7 +255,7 @@ TEST(Program, Colours) {
 }
 
 TEST(Program, Graph) {
-  const std::string graph = Zornet("-q --dot /dev/stdout " + Example("clash")).out;
+  const std::string graph = Zornet("-q --dot - " + Example("clash")).out;
   EXPECT_NE(graph.find("<b>found</b><br/>Nil"), std::string::npos);
   EXPECT_NE(graph.find("color=\"#b3261e\", penwidth=2, label=<<b>found</b>"), std::string::npos);
   EXPECT_NE(graph.find("fontcolor=\"#b3261e\", penwidth=2, label=\"str_eq\""), std::string::npos);

@@ -96,13 +96,13 @@ in_root() {
 
 # The .deb with what it depends on, and a program that was built elsewhere.
 clean_root() {
-  dpkg-deb -x ./*.deb root
-  add_consumer "$PWD/root/opt/app"
-  ldd root/usr/bin/zornet root/usr/lib/lib*.so | tr -s '\t ' '\n' | grep -E '^/(usr/)?lib' | sort -u |
-    xargs cp -L --parents -t root
-  in_root root /usr/bin/zornet /usr/share/doc/zorvadstrings/examples/hello.szn
-  in_root root /opt/app/bin/sharing
-  diff "$here/consumer/network.txt" <(in_root root /opt/app/bin/network)
+  dpkg-deb -x ./*.deb bare
+  add_consumer "$PWD/bare/opt/app"
+  ldd bare/usr/bin/zornet bare/usr/lib/lib*.so | tr -s '\t ' '\n' | grep -E '^/(usr/)?lib' | sort -u |
+    xargs cp -L --parents -t bare
+  in_root bare /usr/bin/zornet /usr/share/doc/zorvadstrings/examples/hello.szn
+  in_root bare /opt/app/bin/sharing
+  diff "$here/consumer/network.txt" <(in_root bare /opt/app/bin/network)
 }
 
 # What each shell offers behind "zornet --" are the options of the help.
@@ -153,9 +153,9 @@ packages() {
   cpack --config "$build/CPackConfig.cmake" -B "$scratch/packages" >"$scratch/cpack.log"
   cd "$scratch/packages"
   clean_root
-  ls root/usr/share/gdb/auto-load/usr/lib/libZORHost.so.*-gdb.py
+  ls bare/usr/share/gdb/auto-load/usr/lib/libZORHost.so.*-gdb.py
   [[ $(dpkg-deb -f ./*.deb Depends) == *libstdc++6* ]] || fail "the .deb does not tell what it needs"
-  [[ $(zcat root/usr/share/doc/zorvadstrings/changelog.gz) == "zorvadstrings ($(dpkg-deb -f ./*.deb Version))"* ]] ||
+  [[ $(zcat bare/usr/share/doc/zorvadstrings/changelog.gz) == "zorvadstrings ($(dpkg-deb -f ./*.deb Version))"* ]] ||
     fail "CHANGELOG.md does not begin with this version"
   mkdir archive && tar -C archive --strip-components=1 -xf ./*.tar.gz
   narrow "$PWD/archive"

@@ -1,4 +1,4 @@
-// The runner: any text is a model or is answered with errors, and a model is narrowed, searched and told about.
+// Models: any text is a model or is answered with errors, and a model is narrowed, searched and told about.
 #include <nlohmann/json.hpp>
 #include <sstream>
 

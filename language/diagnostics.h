@@ -22,7 +22,7 @@ class Diagnostics {
   static constexpr std::size_t kErrorLimit = 20;
 
   // The middle of a long message is left out.
-  void Error(Extent extent, std::string message);  // beyond the limit nothing is added
+  void Error(Extent extent, std::string message);  // ignored beyond the limit
   void Note(Extent extent, std::string message);   // to the last error
   void Sort();                                     // into the order of their places
   bool Failed() const { return mErrors != 0; }

@@ -20,7 +20,7 @@ struct Token {
   bool Is(std::string_view word) const { return (type == Name || type == Mark) && text == word; }
 };
 
-// Takes a source apart. What cannot be a word is told as an error once and comes as Broken.
+// Tokenises a source. An invalid token is reported once, as an error, and comes as Broken.
 class Lexer {
  public:
   Lexer(const Source& source, Diagnostics& diagnostics)

@@ -8,7 +8,7 @@
 
 namespace zornet {
 
-// A stretch of the source, in bytes.
+// A range of the source, in bytes.
 struct Extent {
   std::size_t begin = 0;
   std::size_t length = 0;
@@ -31,7 +31,7 @@ class Source {
   std::string_view Text(Extent extent) const { return Text().substr(extent.begin, extent.length); }
   std::string_view Line(std::size_t line) const;  // without its end; lines count from 1
   std::size_t LineBegin(std::size_t line) const { return mLines[line - 1]; }
-  std::string_view InLine(Extent extent) const;  // what of it stands in the line where it begins
+  std::string_view InLine(Extent extent) const;  // its part in the line where it begins
   std::size_t LineOf(std::size_t position) const;
 
  private:
@@ -40,7 +40,7 @@ class Source {
   std::vector<std::size_t> mLines;  // where each begins
 };
 
-// Tells where positions are. A line is read up to there, or on from the position before.
+// Finds line and column of positions. Counts on from the position before where both are in one line.
 class Locator {
  public:
   explicit Locator(const Source& source) : mSource(source) {}
@@ -52,7 +52,8 @@ class Locator {
   Location mLocation;
 };
 
-// Characters of UTF-8; a stray byte counts as one. Bytes of the first, of a text that is not empty:
+// Characters of UTF-8; a stray byte counts as one. CharacterLength: bytes of the first character, of a text that is not
+// empty.
 std::size_t CharacterLength(std::string_view text);
 std::size_t CountCharacters(std::string_view text);
 

@@ -7,7 +7,7 @@
 
 namespace zornet {
 
-// The word closest to the one given; empty when none is close enough to be meant.
+// The closest word; empty when none is close enough to be meant.
 std::string_view Closest(std::string_view word, std::span<const std::string_view> words);
 
 // "; did you mean 'x'?", or nothing when there is no closest word.

@@ -42,7 +42,7 @@ struct ConstraintSyntax {
 struct Syntax {
   std::vector<DeclarationSyntax> declarations;
   std::vector<ConstraintSyntax> constraints;
-  std::vector<Word> arguments;  // of all constraints, one behind the other
+  std::vector<Word> arguments;  // of all constraints, one after another
   std::vector<Token> outputs;
   std::vector<Token> broken;  // names whose declaration could not be read
 

@@ -1,4 +1,4 @@
-// A line on standard error that says how far a long run is.
+// A line on standard error that shows the progress of a long run.
 #pragma once
 
 #include <chrono>

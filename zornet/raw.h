@@ -1,5 +1,5 @@
 // The module's bare operations, for those who study them: each constraint of the file in turn, each of its operations
-// once, straight on the variables, with what it answers. Nothing is made sound here.
+// once, straight on the variables. The answers are the module's, and not sound.
 #pragma once
 
 #include <functional>

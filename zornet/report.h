@@ -44,10 +44,10 @@ class Report {
   virtual void Finish(const Network& network, const Summary& summary) = 0;
 };
 
-// The sum of all operations.
+// The sums over all operations.
 OperationCount Total(const std::vector<OperationCount>& counts);
 
-// results and remarks are where the two kinds of lines go; the summary is a remark.
+// Results go to one stream, remarks such as the summary to another.
 struct ReportStyle {
   bool colour = false;        // in results
   bool remarkColour = false;  // in remarks
@@ -72,7 +72,6 @@ class Names {
   std::size_t LineOfVariable(int variable) const;
   std::string PlaceOfConstraint(int constraint) const;  // file:line
   std::string PlaceOfVariable(int variable) const;
-  const Source& File() const { return mSource; }
 
  private:
   std::string Written(Extent extent) const;

@@ -87,7 +87,7 @@ std::string TextReport::Line(const Narrowing& narrowing) const {
 void TextReport::Explain(const Network& network, Var variable, const Explanation& explanation) {
   mResults << fmt::format("{} is {}", mPaint(Style::Name, mNames.OfVariable(variable)), Shown(network[variable]));
   if (explanation.narrowings.empty()) {
-    mResults << (explanation.declared.empty() ? ", as nothing tells more about it\n" : ", as it was declared\n");
+    mResults << (explanation.declared.empty() ? ": no constraint narrowed it\n" : ", as it was declared\n");
     return;
   }
   mResults << ", since\n";

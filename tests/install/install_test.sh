@@ -54,7 +54,7 @@ pkg_config() {
 
 opening() { "$scratch/consumer/opening" "$tree/lib/libZORVadStrings.so"; }
 
-runner() { narrow "$tree"; }
+zornet() { narrow "$tree"; }
 
 # The protections of cmake/Hardening.cmake, in each file that runs.
 hardening() {

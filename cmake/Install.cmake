@@ -81,7 +81,7 @@ set(CPACK_GENERATOR DEB TGZ)
 set(CPACK_PACKAGE_NAME zorvadstrings)
 set(ZOR_MAINTAINER "The ZORVadStrings authors <zorvadstrings@example.org>" CACHE STRING "Who answers for the packages")
 set(CPACK_PACKAGE_CONTACT ${ZOR_MAINTAINER})
-set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "String types for a subdefinite constraint solver, and a program that solves with them")
+set(CPACK_PACKAGE_DESCRIPTION_SUMMARY "String value types for constraint solvers, and a program that uses them")
 set(CPACK_PACKAGE_DESCRIPTION
 "A variable of the solver holds what is still possible for it, at most one
 text or a set of texts, and operations narrow that: equality, order, length,

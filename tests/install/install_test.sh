@@ -5,7 +5,7 @@ set -euo pipefail
 build=$1
 here=$(cd "$(dirname "$0")" && pwd)
 scratch=$build/install-test
-tree=$scratch/tree
+tree=${ZOR_TREE:-$scratch/tree}  # what is installed, by the part named tree or elsewhere
 
 fail() { echo "$*" >&2; exit 1; }
 fresh() { rm -rf "$1" && mkdir -p "$1"; }
@@ -134,7 +134,7 @@ offered_by_bash() {
 }
 offered_by_zsh() {
   # shellcheck disable=SC2016  # zsh expands it
-  zsh -fc '_arguments() { print -rl -- $@ }; source $1' zsh "$tree/share/zsh/site-functions/_zornet" |
+  zsh -fc '_arguments() { print -rl -- $@ }; source $1' zsh "$(find "$tree/share/zsh" -name _zornet)" |
     grep -oE '^(\([^)]*\)|\*)*--[a-z-]+' | grep -oE -- '--[a-z-]+$'
 }
 offered_by_fish() {

@@ -24,13 +24,8 @@ class Node : public ZORStreamable {
 const ZORStreamableClass kNodeRecord(
     "Node", [](ZORStreamable* o) { return o != nullptr ? o : new Node; }, 0);
 
-void Check(const ZORVaDoObject& value) {
-  const Content content = ContentOf(value);
-  if (const std::string fault = Fault(value, content); !fault.empty()) Fail(fault + ": " + content.Show());
-}
-
 // Objects are asked for their type as a reader of networks does.
-void Check(ZORStreamable* object) {
+void CheckObject(ZORStreamable* object) {
   const auto* const value = ZORVaDoString::DynamicCast(ZORVaDoBase::FromStream(object));
   if (value != nullptr) Check(*value);
 }
@@ -71,11 +66,11 @@ void ReadByPointer(ZORipstream& in) {
 void ReadObject(ZORipstream& in) {
   ZORStreamable* object = nullptr;
   in.ReadObject(object);
-  Check(object);
+  CheckObject(object);
   delete object;
 }
 
-void ReadObjectPointer(ZORipstream& in) { Check(in.ReadObjectPointer()); }
+void ReadObjectPointer(ZORipstream& in) { CheckObject(in.ReadObjectPointer()); }
 
 constexpr void (*kReaders[])(ZORipstream& in) = {
     ReadAlone<ZORVadSingleString>,

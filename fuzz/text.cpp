@@ -14,7 +14,7 @@ void Reread(const Value& value) {
   ZORistrstream in(form.c_str(), static_cast<int>(form.size()));
   Value again;
   again.InputValue(in);
-  if (!(ContentOf(again) == ContentOf(value)) || in.Left() != 0) Fail(form + " reads as " + Form(again));
+  if (Form(again) != Form(value) || in.Left() != 0) Fail(form + " reads as " + Form(again));
 }
 
 // A value tells nothing of what it held before.
@@ -22,8 +22,7 @@ template <class Value>
 void InputLike(const Value& value, std::size_t left, ZORistrstream in) {
   Value fresh;
   fresh.InputValue(in);
-  if (!(ContentOf(fresh) == ContentOf(value)) || in.Left() != left)
-    Fail("read as " + Form(value) + " or " + Form(fresh));
+  if (Form(fresh) != Form(value) || in.Left() != left) Fail("read as " + Form(value) + " or " + Form(fresh));
 }
 
 template <class Value>
@@ -35,7 +34,7 @@ void Input(const char* text, int size) {
     const ZORistrstream before = in;
     left = in.Left();
     value.InputValue(in);
-    if (const std::string fault = Fault(value, ContentOf(value)); !fault.empty()) Fail(fault);
+    Check(value);
     InputLike(value, in.Left(), before);
     Reread(value);
   }

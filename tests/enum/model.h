@@ -5,23 +5,13 @@
 #include <iterator>
 #include <utility>
 
-#include "tests/enum/sets.h"
+#include "tests/single/model.h"
 
 namespace zor::test::model {
 
-inline const std::string kLeastText = " ", kGreatestText(255, 'z');
-
-inline bool IsNil(const auto& v) { return v.tag == kNilTag; }
-inline bool IsAny(const auto& v) { return v.tag == kAnyTag; }
-inline bool IsMin(const Set& v) { return v.tag == kExact && v.texts == std::vector<std::string>{""}; }
-inline bool IsMax(const Set& v) { return v.tag == kMaxTag && v.texts.empty(); }
-inline bool IsMin(const Str& v) { return v == kMin; }
-inline bool IsMax(const Str& v) { return v.tag == kMaxTag; }
-
 inline void Clear(Set& v, Tag tag) { v = Set{tag, {}}; }
-inline void Clear(Str& v, Tag tag) { v = tag == kNilTag ? kNil : kAny; }
-inline int ToNil(auto& v) { return IsNil(v) ? 0 : (Clear(v, kNilTag), 1); }
-inline int ToAny(auto& v) { return IsAny(v) ? 0 : (Clear(v, kAnyTag), 1); }
+inline int ToNil(Set& v) { return IsNil(v) ? 0 : (Clear(v, kNilTag), 1); }
+inline int ToAny(Set& v) { return IsAny(v) ? 0 : (Clear(v, kAnyTag), 1); }
 inline int ToMin(Set& v) { return IsMin(v) ? 0 : (v = "Min", 1); }
 inline int ToMax(Set& v) { return IsMax(v) ? 0 : (v = "Max", 1); }
 inline void NeverEmpty(Set& v) {
@@ -29,19 +19,6 @@ inline void NeverEmpty(Set& v) {
 }
 
 // Texts one at a time.
-inline std::string Lower(const Set& v) {
-  if (IsNil(v)) return "";
-  if (IsAny(v) || IsMin(v)) return kLeastText;
-  return IsMax(v) ? kGreatestText : v.texts.front();
-}
-inline std::string Upper(const Set& v) {
-  if (IsNil(v)) return "";
-  if (IsMin(v)) return kLeastText;
-  return IsAny(v) || v.tag == kMaxTag ? kGreatestText : v.texts.back();
-}
-inline std::string Lower(const Str& v) { return v.text; }
-inline std::string Upper(const Str& v) { return v.text; }
-
 inline int Contains(const Set& v, const std::string& s) {
   if (IsAny(v) || IsNil(v)) return 0;
   if (IsMax(v)) return -1;
@@ -50,8 +27,7 @@ inline int Contains(const Set& v, const std::string& s) {
 }
 inline int Insert(Set& v, std::string s) {
   if (Contains(v, s) > 0) return 0;
-  v.texts.push_back(s);
-  std::sort(v.texts.begin(), v.texts.end());
+  v.texts.insert(std::upper_bound(v.texts.begin(), v.texts.end(), s), s);
   return 1;
 }
 inline int SetExactValue(Set& v, std::string s) { return v = Set{kExact, {s}}, 0; }
@@ -184,24 +160,10 @@ inline int CalcInverseUnequalValue(Set z, Str& x) {
 }
 
 // Relations into a Boolean.
-constexpr int kOpen = 'o', kUndefined = 'u', kContradiction = 'n', kTrue = 't', kFalse = 'f';
-inline int Known(const Set& z, const auto& x, bool strict) {
-  if (IsAny(z) || IsAny(x)) return kUndefined;
-  if (IsNil(z) || IsNil(x)) return kContradiction;
-  if ((IsMin(z) && IsMin(x)) || (IsMax(z) && IsMax(x))) return strict ? kFalse : kTrue;
-  return kOpen;
-}
 inline int CalcIsEqual(Set z, auto x) {
   if (Known(z, x, false) != kOpen) return Known(z, x, false);
   if (IsMin(z) || IsMax(z) || IsMin(x) || IsMax(x) || IsIntersected(z, x) == 0) return kFalse;
   return Lower(z) == Upper(z) && Lower(z) == Lower(x) && Lower(z) == Upper(x) ? kTrue : kOpen;
-}
-inline int CompareEnds(const Set& z, const auto& x, bool strict) {
-  if (Known(z, x, strict) != kOpen) return Known(z, x, strict);
-  if (IsMax(x) || IsMin(z)) return kTrue;
-  if (IsMax(z) || IsMin(x)) return kFalse;
-  if (Upper(z) < Lower(x) || (!strict && Upper(z) == Lower(x))) return kTrue;
-  return Lower(z) > Upper(x) || (strict && Lower(z) == Upper(x)) ? kFalse : kOpen;
 }
 inline int CalcIsLessOrEqual(Set z, auto x) { return CompareEnds(z, x, false); }
 inline int CalcIsLess(Set z, auto x) { return CompareEnds(z, x, true); }
@@ -339,6 +301,31 @@ inline int CalcLowerValue(Set& z, auto x) { return Fold(z, x, Folded<'A', 'Z'>);
 inline int CalcUpperValue(Set& z, auto x) { return Fold(z, x, Folded<'a', 'z'>); }
 inline int CalcInverseLowerValue(Set z, auto& x) { return InverseFold(z, x, Folded<'A', 'Z'>); }
 inline int CalcInverseUpperValue(Set z, auto& x) { return InverseFold(z, x, Folded<'a', 'z'>); }
+
+// Lengths, into and from a single integer.
+inline int CalcLength(Set z, Int& n) {
+  if (IsNil(z) || IsAny(z)) return n = Int(z.tag), 1;
+  const auto has = [&](ZORLong length) {
+    return std::any_of(z.texts.begin(), z.texts.end(),
+                       [&](auto& t) { return static_cast<ZORLong>(t.size()) == length; });
+  };
+  const Int before = n;
+  const Int first = z.texts.empty() ? Int(kNilTag) : Int(static_cast<ZORLong>(z.texts[0].size()));
+  const bool one = std::all_of(z.texts.begin(), z.texts.end(), [&](auto& t) { return t.size() == z.texts[0].size(); });
+  if (n.tag == kAnyTag && one) n = first;
+  if (n.tag == kExact && !has(n.value)) n = Int(kNilTag);
+  return n == before ? 0 : 1;
+}
+inline int CalcInverseLength(Set& z, Int n) {
+  if (IsNil(z) || n.tag == kAnyTag) return 0;
+  if (n.tag == kNilTag || (n.value < 0 && !IsAny(z))) return ToNil(z);
+  if (IsAny(z)) return 0;
+  std::erase_if(z.texts, [&](auto& text) { return static_cast<ZORLong>(text.size()) != n.value; });
+  z.texts.erase(std::unique(z.texts.begin(), z.texts.end()), z.texts.end());
+  z.tag = kExact;
+  if (z.texts.size() > 256) Clear(z, kAnyTag);
+  return NeverEmpty(z), 1;
+}
 
 // What an entry tests before it goes to the typed form.
 template <class Target, class Body, class... Sources>

@@ -1,5 +1,9 @@
 // Text and stream forms of sets of texts.
-#include "tests/enum/sets.h"
+#include <gtest/gtest.h>
+
+#include <climits>
+
+#include "tests/support/values.h"
 
 namespace zor::test {
 namespace {
@@ -76,6 +80,12 @@ TEST(EnumText, Input) {
       EXPECT_EQ(held.Now(), value) << why << ", over " << before;
     }
   }
+}
+
+std::string Printed(const ZORVadEnumString& v) {
+  std::ostringstream out;
+  out << v;
+  return out.str();
 }
 
 std::string Stored(const ZORVadEnumString& v) {

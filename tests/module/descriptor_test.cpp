@@ -1,5 +1,6 @@
 // Descriptors, records and the type tests of the string classes.
 #include <cstddef>
+#include <initializer_list>
 #include <memory>
 #include <vector>
 
@@ -85,6 +86,22 @@ TEST(Descriptors, MadeAnewByEachCall) {
   EXPECT_NE(second.get(), first);
   EXPECT_EQ(ZORVadSingleString::sDescriptor, second.get());
   ZORVadSingleString::sDescriptor = first;
+}
+
+// What is no single string is null and fails the stream; it stays the reader's to delete.
+TEST(Descriptors, PointersToOtherClassesFailTheStream) {
+  const ZORVadSingleString single("a");
+  const ZORVadEnumString set("a");
+  for (const ZORStreamable* stored : std::initializer_list<const ZORStreamable*>{nullptr, &single, &set}) {
+    ZORopstream out;
+    out.WriteObjectPointer(stored);
+    ZORipstream in(out.Bytes());
+    ZORVadSingleString* read = nullptr;
+    ZORVadSingleString::readPtr(in, read);
+    EXPECT_EQ(read != nullptr, stored == &single);
+    EXPECT_EQ(in.Fail(), stored == &set);
+    for (const ZORStreamable* object : in.Objects()) delete object;
+  }
 }
 
 TEST(TypeTests, ByIdentity) {

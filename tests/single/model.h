@@ -8,21 +8,17 @@
 #include <string>
 #include <string_view>
 
-#include "tests/support/values.h"
+#include "tests/support/beside.h"
 
 namespace zor::test::model {
 
-inline bool IsNil(const Str& v) { return v.tag == kNilTag; }
-inline bool IsAny(const Str& v) { return v.tag == kAnyTag; }
-inline bool IsMax(const Str& v) { return v.tag == kMaxTag; }
-inline bool IsMin(const Str& v) { return v == kMin; }
-inline int Set(Str& t, const Str& value) { return t = value, 1; }
-inline int ToNil(Str& t) { return IsNil(t) ? 0 : Set(t, kNil); }
-inline int ToAny(Str& t) { return IsAny(t) ? 0 : Set(t, kAny); }
-inline int ToMin(Str& t) { return IsMin(t) ? 0 : Set(t, kMin); }
-inline int ToMax(Str& t) { return IsMax(t) ? 0 : Set(t, kMax); }
+inline int Put(Str& t, const Str& value) { return t = value, 1; }
+inline int ToNil(Str& t) { return IsNil(t) ? 0 : Put(t, kNil); }
+inline int ToAny(Str& t) { return IsAny(t) ? 0 : Put(t, kAny); }
+inline int ToMin(Str& t) { return IsMin(t) ? 0 : Put(t, kMin); }
+inline int ToMax(Str& t) { return IsMax(t) ? 0 : Put(t, kMax); }
 inline int Settle(Str& t, const std::string& c) {
-  if (IsAny(t)) return Set(t, Text(c));
+  if (IsAny(t)) return Put(t, Text(c));
   return t.text == c ? 0 : ToNil(t);
 }
 
@@ -55,6 +51,28 @@ inline int CalcUnequalValue(Str& z, Str x) {
   return IsAny(z) || z.text != x.text ? 0 : ToNil(z);
 }
 inline int CalcInverseUnequalValue(Str z, Str& x) { return CalcUnequalValue(x, z); }
+
+// Relations into a Boolean, of singles and of sets.
+int Known(const auto& z, const auto& x, bool strict) {
+  if (IsAny(z) || IsAny(x)) return kUndefined;
+  if (IsNil(z) || IsNil(x)) return kContradiction;
+  if ((IsMin(z) && IsMin(x)) || (IsMax(z) && IsMax(x))) return strict ? kFalse : kTrue;
+  return kOpen;
+}
+int CompareEnds(const auto& z, const auto& x, bool strict) {
+  if (Known(z, x, strict) != kOpen) return Known(z, x, strict);
+  if (IsMax(x) || IsMin(z)) return kTrue;
+  if (IsMax(z) || IsMin(x)) return kFalse;
+  if (Upper(z) < Lower(x) || (!strict && Upper(z) == Lower(x))) return kTrue;
+  return Lower(z) > Upper(x) || (strict && Lower(z) == Upper(x)) ? kFalse : kOpen;
+}
+inline int CalcIsEqual(Str z, Str x) {
+  const int known = Known(z, x, false);
+  if (known != kOpen || IsMin(z) || IsMax(z) || IsMin(x) || IsMax(x)) return known == kOpen ? kFalse : known;
+  return z.text == x.text ? kTrue : kFalse;
+}
+inline int CalcIsLessOrEqual(Str z, Str x) { return CompareEnds(z, x, false); }
+inline int CalcIsLess(Str z, Str x) { return CompareEnds(z, x, true); }
 
 // Order. t is one of a and b, as it was.
 inline int Less(Str a, Str b, Str& t) {
@@ -102,7 +120,7 @@ inline int CalcFirstInverseMaxValue(Str z, Str& x, Str y) {
   if (IsAny(x)) {
     if (IsMax(z)) return ToMax(x);
     if (IsMin(z) || z.text < y.text) return ToNil(x);
-    return z.text == y.text ? 0 : Set(x, z);
+    return z.text == y.text ? 0 : Put(x, z);
   }
   if (y.text <= x.text && z.text == x.text) return 0;
   return x.text < y.text && z.text == y.text ? 0 : ToNil(x);
@@ -111,7 +129,7 @@ inline int CalcFirstInverseMinValue(Str z, Str& x, Str y) {
   if ((IsAny(z) && IsAny(x)) || IsAny(y) || IsNil(x)) return 0;
   if (IsNil(z) || IsNil(y)) return ToNil(x);
   if (IsAny(z)) return ToAny(x);
-  if (IsAny(x)) return IsMax(z) || z.text > y.text ? ToNil(x) : Set(x, z);
+  if (IsAny(x)) return IsMax(z) || z.text > y.text ? ToNil(x) : Put(x, z);
   if (x.text <= y.text && z.text == x.text) return 0;
   return y.text < x.text && z.text == y.text ? 0 : ToNil(x);
 }
@@ -171,20 +189,20 @@ inline int CalcFirstInverseSubString(Str z, Str& x, Int start, Int end) {
   if (IsAny(x)) return 0;
   return !OneIs(kNilTag, start, end) && z.text == Slice(x, start, end) ? 0 : ToNil(x);
 }
-inline int Set(Int& t, Int value) { return t == value && value.tag != kExact ? 0 : (t = value, 1); }
+inline int Put(Int& t, Int value) { return t == value && value.tag != kExact ? 0 : (t = value, 1); }
 // Narrows the start or the end, t as it was.
 inline int Position(Str z, Str x, Int start, Int end, Int& t, bool isStart) {
   const ZORLong n = static_cast<ZORLong>(z.text.size());
   const Int known = isStart ? end : start;
-  if (IsNil(z) || IsNil(x) || OneIs(kNilTag, start, end)) return Set(t, kNoNumber);
-  if (IsAny(z) || IsAny(x)) return Set(t, kAnyNumber);
-  if (!OneIs(kAnyTag, start, end)) return z.text == Slice(x, start, end) ? 0 : Set(t, kNoNumber);
+  if (IsNil(z) || IsNil(x) || OneIs(kNilTag, start, end)) return Put(t, Int(kNilTag));
+  if (IsAny(z) || IsAny(x)) return Put(t, Int());
+  if (!OneIs(kAnyTag, start, end)) return z.text == Slice(x, start, end) ? 0 : Put(t, Int(kNilTag));
   if (t.tag == kExact) return 0;
   ZORLong at = static_cast<ZORLong>(x.text.find(z.text));  // below 0 when nowhere
-  if (known.tag == kAnyTag && at < 0) return Set(t, kNoNumber);
+  if (known.tag == kAnyTag && at < 0) return Put(t, Int(kNilTag));
   if (known.tag == kExact) at = isStart ? Wrap(std::int64_t{end.value} + 1 - n) : start.value;
-  if (known.tag == kExact && Sub(x.text, at, n) != z.text) return Set(t, kNoNumber);
-  return Set(t, Number(isStart ? at : Wrap(std::int64_t{at} + n - 1)));
+  if (known.tag == kExact && Sub(x.text, at, n) != z.text) return Put(t, Int(kNilTag));
+  return Put(t, Int(isStart ? at : Wrap(std::int64_t{at} + n - 1)));
 }
 inline int CalcSecondInverseSubString(Str z, Str x, Int& start, Int end) {
   return Position(z, x, start, end, start, true);
@@ -215,6 +233,30 @@ inline int CalcInverseLowerValue(Str z, Str& x) { return InverseFold(z, x, Folde
 inline int CalcUpperValue(Str& z, Str x) { return Fold(z, x, Folded<'a', 'z'>); }
 inline int CalcInverseUpperValue(Str z, Str& x) { return InverseFold(z, x, Folded<'a', 'z'>); }
 
+// Lengths, into and from a single integer.
+inline int CalcLength(Str z, Int& n) {
+  if (IsNil(z) || IsAny(z)) return n.tag == z.tag ? 0 : (n = Int(z.tag), 1);
+  const Int length = static_cast<ZORLong>(z.text.size());
+  if (n.tag == kNilTag || n == length) return 0;
+  return n = n.tag == kAnyTag ? length : Int(kNilTag), 1;
+}
+inline int CalcInverseLength(Str& z, Int n) {
+  if (IsNil(z)) return 0;
+  if (n.tag != kExact) return n.tag == kNilTag ? ToNil(z) : 0;
+  if (IsAny(z)) return n.value < 0 ? ToNil(z) : 0;
+  return n.value == static_cast<ZORLong>(z.text.size()) ? 0 : ToNil(z);
+}
+
+// Texts that a value takes as such.
+inline int SetExactValue(Str& z, Word w) { return z = Text(w.text), 0; }
+inline int SetLowerBound(Str& z, Word w) { return z = Text(w.text), 0; }
+inline int SetUpperBound(Str& z, Word w) { return z = Text(w.text), 0; }
+inline int InsertExactValue(Str& z, Word w) {
+  if (!IsAny(z) && (IsNil(z) || z.text != w.text)) z = IsNil(z) ? Text(w.text) : kAny;
+  return 0;
+}
+inline int RemoveExactValue(Str& z, Word w) { return IsNil(z) || IsAny(z) || z.text != w.text ? 0 : ToNil(z); }
+
 // Text forms.
 inline std::string Print(const Str& v) {
   return IsNil(v) ? "Nil" : IsAny(v) ? "Any" : IsMax(v) ? "Max" : IsMin(v) ? "Min" : '"' + v.text + '"';
@@ -233,10 +275,10 @@ inline Str Input(std::string_view& in) {
   const std::string word = Line(in, 3, '\n');
   return word == "Min" ? kMin : word == "Max" ? kMax : word == "Any" ? kAny : kNil;
 }
-inline int CalcStringRepresentation(Str& z, Str x) { return Set(z, Text(Print(x))); }
+inline int CalcStringRepresentation(Str& z, Str x) { return Put(z, Text(Print(x))); }
 inline int CalcInverseStringRepresentation(Str z, Str& x) {
   std::string_view in = z.text;
-  return Set(x, Input(in));
+  return Put(x, Input(in));
 }
 
 }  // namespace zor::test::model

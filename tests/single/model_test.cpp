@@ -1,95 +1,70 @@
 // Every operation on every combination of values, beside the model.
-#include <iterator>
-#include <tuple>
+#include <gtest/gtest.h>
 
-#include "enum/ZORVadEnumString.h"
-#include "tests/single/model.h"
-#include "tests/support/beside.h"
-#include "tests/support/check.h"
+#include <climits>
+
+#include "tests/single/rows.h"
 
 using namespace zor::test;
 
-// clang-format off
-#define PAIR(Name, target, ofEntry) ZOR_BESIDE(Name, 2, target, (*v[1]), (v[0], v[1]), ofEntry),
-#define ZOR_Algebra(Name, ...)  PAIR(Name, 0, (model::Name(v[0], v[1]), 0))
-#define ZOR_Test(Name, ...)     PAIR(Name, 0, (model::Name(v[0], v[1])))
-#define ZOR_Pair(Name, ...)     PAIR(Name, (zor::TargetOf<__VA_ARGS__>()), (model::Name(v[0], v[1])))
-#define ZOR_Equality ZOR_Pair
-#define ZOR_Form ZOR_Pair
-#define ZOR_Triple(Name, ...) \
-  ZOR_BESIDE(Name, 3, (zor::TargetOf<__VA_ARGS__>()), (*v[1], *v[2]), (v[0], v[1], v[2]), (model::Name(v[0], v[1], v[2]))),
-#define ZOR_Alone(...)
-#define ZOR_Truth(...)
-#define ZOR_Length(...)
-#define ZOR_Slice(...)  // below, with positions
-#define ROW(Shape, ...) ZOR_##Shape(__VA_ARGS__)
-
-static const Beside<Str> kBeside[] = {ZOR_STRING_OPERATIONS(ROW)};
-
 // The last ones are for operations on two strings alone.
-static const Str kValues[] = {
-  kNil, {kNilTag, "ab"}, kAny, {kAnyTag, "a"}, kMax, kMin, Text(""), Text("a"), Text("ab"), Text("b"), Text("aba"),
-  Times(255, 'z'), Times(254, 'z'), Times(200, 'a'), Times(55, 'a'), Times(56, 'a'),
-  Text("A"), Text("aB"), Text("  "), Text("a!"), Text("\"a\""), Text("Max"), Text("\xff!"), Times(255, 'A'),
-  Times(256, 'z'), Times(254, 'z', "y"), Times(254, 'a', "z"), Times(256, 'a', "z"), {kNilTag, "Min"},
-};
-static constexpr std::size_t kOfThree = 16;
-static const Str kSliced[] = {kNil, kAny, {kAnyTag, "b"}, kMax, kMin, Text(""), Text("a"), Text("bc"), Text("b"), Text("abcbc"),
-                       Text("bcb"), Times(255, 'z'), Times(300, 'c')};
-static const Int kPositions[] = {kNoNumber, kAnyNumber, Number(INT_MIN), Number(INT_MIN + 1), Number(-2), Number(-1), Number(0),
-                          Number(1), Number(2), Number(3), Number(254), Number(255), Number(299), Number(INT_MAX - 1),
-                          Number(INT_MAX)};
-// clang-format on
+static const std::vector<Value> kValues = {Str(kNil),
+                                           Str(kNilTag, "ab"),
+                                           Str(kAny),
+                                           Str(kAnyTag, "a"),
+                                           Str("Max"),
+                                           Str("Min"),
+                                           Str(""),
+                                           Str("a"),
+                                           Str("ab"),
+                                           Str("b"),
+                                           Str("aba"),
+                                           Str("z*255"),
+                                           Str("z*254"),
+                                           Str("a*200"),
+                                           Str("a*55"),
+                                           Str("a*56"),  // in triples
+                                           Str("A"),
+                                           Str("aB"),
+                                           Str("  "),
+                                           Str("a!"),
+                                           Str("\"a\""),
+                                           Text("Max"),
+                                           Str("\xff!"),
+                                           Str("A*255"),
+                                           Str("z*256"),
+                                           Str("z*254y"),
+                                           Str("a*254z"),
+                                           Str("a*256z"),
+                                           Str(kNilTag, "Min"),
+                                           Str("@A[\xc4`1"),
+                                           Str("7")};
+static const std::vector<Value> kTripled(kValues.begin(), kValues.begin() + 16);
+static const std::vector<Value> kSliced = {Str("Nil"), Str("Any"),   Str(kAnyTag, "b"), Str("Max"), Str("Min"),
+                                           Str(""),    Str("a"),     Str("bc"),         Str("b"),   Str("abcbc"),
+                                           Str("bcb"), Str("z*255"), Str("c*300")};
+static const std::vector<Value> kNumbers = {Int(kNilTag), Int(),    Int(INT_MIN), Int(INT_MIN + 1), Int(-2),
+                                            Int(-1),      Int(0),   Int(1),       Int(2),           Int(3),
+                                            Int(254),     Int(255), Int(299),     Int(INT_MAX - 1), Int(INT_MAX)};
+static const std::vector<Value> kWords = {
+    Word{""}, Word{"a"}, Word{"ab"}, Word{" "}, Word{std::string(255, 'z')}, Word{std::string(300, 'x')}};
+
 TEST(SingleModel, EveryCombination) {
-  for (const auto& operation : kBeside) ASSERT_NO_FATAL_FAILURE(CompareAll(operation, kValues, kOfThree));
+  for (const Row& row : SingleRows()) {
+    std::vector<std::vector<Value>> lists;
+    const auto& strings = row.kinds.size() == 4 ? kSliced : row.kinds.size() == 3 ? kTripled : kValues;
+    for (const std::size_t kind : row.kinds) lists.push_back(kind == 0 ? strings : kind == 2 ? kNumbers : kWords);
+    EXPECT_EQ(CompareAll(row, lists), "");
+  }
 }
 
 TEST(SingleModel, WrongOperands) {
-  ZORVadEnumString set(ZORString("b"));
-  for (const Str& z : {Text("ab"), kAny, kMax}) {
-    for (const auto& operation : kBeside) {
-      if (operation.Is("CalcStringRepresentation", "CalcInverseStringRepresentation")) continue;
-      CheckWrongOperands(operation, z, Text("b"), nullptr);
-      CheckWrongOperands(operation, z, Text("b"), &set);
-    }
-    CheckIntegers(z);
+  ZORVadEnumString set("b");
+  ZORVadSingleInteger number(7);
+  for (const Value& z : {Value(Str("ab")), Value(Str("Any")), Value(Str("Max"))}) {
+    for (ZORVaDoAny* wrong : {static_cast<ZORVaDoAny*>(nullptr), static_cast<ZORVaDoAny*>(&set)})
+      EXPECT_EQ(CheckWrongOperand(z, Str("b"), wrong, true, 2), "") << z;
+    EXPECT_EQ(CheckWrongOperand(z, Str("b"), &number, false, 2), "") << z;
   }
-  EXPECT_TRUE(set.GetState() == kExact && set.Count() == 1);
+  EXPECT_EQ(Of(set), Set("{b}"));
 }
-
-// Two calls; both positions may be one object.
-template <class Operation, class Model>
-static void CompareSlice(Operation operation, Model slow, Str z, Str x, Int start, Int end, bool shared, bool typed) {
-  HeldSingle heldZ(z), heldX(x);
-  HeldInteger heldStart(start), heldEnd(end);
-  HeldInteger& last = shared ? heldStart : heldEnd;
-  for (int call = 1; call <= 2; ++call) {
-    const Int before = start;
-    const int expected = slow(z, x, start, end);
-    if (shared) start = end = start == before ? end : start;
-    const int answer = typed ? operation(heldZ.value, heldX.value, heldStart.value, last.value)
-                             : operation(heldZ.Abstract(), heldX.Abstract(), heldStart.Abstract(), last.Abstract());
-    ASSERT_EQ(std::tuple(answer, heldZ.Now(), heldX.Now(), heldStart.Now(), last.Now()),
-              std::tuple(expected, z, x, start, end));
-  }
-}
-
-template <class Operation, class Model>
-static void CompareSlices(Operation operation, Model slow) {
-  constexpr std::size_t n = std::size(kSliced), m = std::size(kPositions);
-  for (std::size_t i = 0; i < n * n * m * m; ++i) {
-    const Str &z = kSliced[i % n], &x = kSliced[i / n % n];
-    const Int &start = kPositions[i / n / n % m], &end = kPositions[i / n / n / m];
-    for (const int form : {0, 1, 2, 3}) {
-      const bool shared = form >= 2;
-      if (!shared || start == end) CompareSlice(operation, slow, z, x, start, end, shared, form % 2 == 0);
-      ASSERT_FALSE(testing::Test::HasFatalFailure()) << z << ", " << x << ", " << start << ", " << end << ' ' << form;
-    }
-  }
-}
-
-#define COMPARE_SLICES(Name) CompareSlices(ZOR_OPERATION(Name), [](auto&... v) { return model::Name(v...); })
-TEST(SingleModel, SubString) { COMPARE_SLICES(CalcSubString); }
-TEST(SingleModel, FirstInverseSubString) { COMPARE_SLICES(CalcFirstInverseSubString); }
-TEST(SingleModel, SecondInverseSubString) { COMPARE_SLICES(CalcSecondInverseSubString); }
-TEST(SingleModel, ThirdInverseSubString) { COMPARE_SLICES(CalcThirdInverseSubString); }

@@ -1,6 +1,6 @@
-// Counts what is allocated, by texts and by operator new alike. For one source file of a program. Where the address
-// sanitizer has a malloc of its own, nothing is counted. Hidden from the libraries, which the build makes the default,
-// it would see nothing of theirs.
+// Counts what is allocated and freed, by texts and by operator new alike. For one source file of a program. Where the
+// address sanitizer has a malloc of its own, nothing is counted. Hidden from the libraries, which the build makes the
+// default, it would see nothing of theirs.
 #pragma once
 
 #include <cstdlib>
@@ -14,15 +14,20 @@
 #endif
 
 namespace zor::test {
-inline int sAllocations = 0;
+inline int sAllocations = 0, sFreed = 0;
 }  // namespace zor::test
 
 #ifndef ZOR_HAS_OWN_MALLOC
 extern "C" {
 void* __libc_malloc(std::size_t size);
+void __libc_free(void* memory);
 [[gnu::visibility("default")]] void* malloc(std::size_t size) {
   ++zor::test::sAllocations;
   return __libc_malloc(size);
+}
+[[gnu::visibility("default")]] void free(void* memory) {
+  if (memory != nullptr) ++zor::test::sFreed;
+  __libc_free(memory);
 }
 }
 #endif

@@ -1,18 +1,18 @@
-// Values as the tables of the tests write them: plain, printable, and made into values of the module for each call.
+// Values as the tables of the tests write them: plain, printable, and made into objects of the module for each call.
 #pragma once
-
-#include <gtest/gtest.h>
 
 #include <algorithm>
 #include <cctype>
-#include <climits>
+#include <deque>
 #include <ostream>
+#include <sstream>
 #include <string>
 #include <string_view>
+#include <variant>
 #include <vector>
 
-#include "host/ZORNumbers.h"
-#include "single/ZORVadSingleString.h"
+#include "enum/ZORVadEnumString.h"
+#include "host/ZORPrint.h"
 
 namespace zor::test {
 
@@ -20,16 +20,7 @@ using Tag = ZORVaDoString::ZORStringStateTag;
 constexpr Tag kExact = ZORVaDoString::ZorStringExact, kAnyTag = ZORVaDoString::ZorStringAny,
               kNilTag = ZORVaDoString::ZorStringNil, kMaxTag = ZORVaDoString::ZorStringMax;
 
-inline std::string Plain(const ZORString& text) {
-  return {text.CastToCharPtr(), static_cast<std::size_t>(text.GetLengthInChar())};
-}
-inline ZORString Packed(const std::string& text) { return {text.data(), text.size()}; }
-
-inline std::ostream& PrintValue(std::ostream& out, Tag tag, const std::string& text) {
-  out << (tag == kExact ? "" : tag == kAnyTag ? "Any:" : tag == kNilTag ? "Nil:" : tag == kMaxTag ? "Max:" : "?:");
-  if (text.size() <= 24) return out << '\'' << text << '\'';
-  return out << '\'' << text.substr(0, 4) << "..." << text.substr(text.size() - 4) << "' (" << text.size() << ')';
-}
+inline std::string Plain(const ZORString& text) { return std::string(text.View()); }
 
 // A text as tables write it: a*254z is 254 times a, then z.
 inline std::string Unpacked(std::string_view text) {
@@ -45,97 +36,226 @@ inline std::string Unpacked(std::string_view text) {
   return plain;
 }
 
-// A single string.
+inline std::ostream& Show(std::ostream& out, Tag tag, const std::string& text) {
+  out << (tag == kExact ? "" : tag == kAnyTag ? "Any:" : tag == kNilTag ? "Nil:" : tag == kMaxTag ? "Max:" : "?:");
+  if (text.size() <= 24) return out << '\'' << text << '\'';
+  return out << '\'' << text.substr(0, 4) << "..." << text.substr(text.size() - 4) << "' (" << text.size() << ')';
+}
+
+// A single string. Notations: Nil, Any, Max, Min, or a text.
 struct Str {
   using Held = struct HeldSingle;
-  static Str Parse(const std::string& notation);  // Nil, Any, Max, Min or a text
-  bool HasEquals() const { return false; }
-  Tag tag;
-  std::string text;
+  Tag tag = kAnyTag;
+  std::string text = std::string(256, 'z');
+
+  Str() = default;
+  Str(Tag state, std::string held) : tag(state), text(std::move(held)) {}
+  Str(const char* notation);  // NOLINT(google-explicit-constructor)
   bool operator==(const Str&) const = default;
-  friend std::ostream& operator<<(std::ostream& out, const Str& v) { return PrintValue(out, v.tag, v.text); }
+  friend std::ostream& operator<<(std::ostream& out, const Str& v) { return Show(out, v.tag, v.text); }
 };
 
 inline Str Text(const std::string& text) { return {kExact, text}; }
 inline Str Times(int count, char c, const std::string& tail = "") { return Text(std::string(count, c) + tail); }
-inline const Str kNil{kNilTag, ""}, kAny{kAnyTag, std::string(256, 'z')}, kMax{kMaxTag, std::string(255, 'z')},
-    kMin{kExact, " "};
-inline Str Str::Parse(const std::string& notation) {
-  if (notation == "Nil" || notation == "Any") return notation == "Nil" ? kNil : kAny;
-  if (notation == "Max" || notation == "Min") return notation == "Max" ? kMax : kMin;
-  return Text(Unpacked(notation));
+inline const Str kNil{kNilTag, ""}, kAny, kMax{kMaxTag, std::string(255, 'z')}, kMin{kExact, " "};
+inline Str::Str(const char* notation) : Str(Text(Unpacked(notation))) {
+  for (const auto& [word, value] : {std::pair("Nil", kNil), {"Any", kAny}, {"Max", kMax}, {"Min", kMin}})
+    if (std::string_view(word) == notation) *this = value;
 }
 
-struct HeldSingle {
-  explicit HeldSingle(const Str& v) : value(Packed(v.text)) {
-    ZORVadSingleString state;
-    if (v.tag == kMaxTag) value.CalcMaxValue();
-    if (v.tag == kNilTag) state.SetNilValue();
-    if (v.tag == kNilTag || v.tag == kAnyTag) value = state;  // which leaves the text as it is
+// A set of texts. Notations:
+//   Nil  Any  Max  Min    the states that need no text, and "" alone
+//   {a,b}  {a,b,Max}      the texts in any order, and the greatest beside them; {,a} begins with ""
+//   Any{a}  Nil{a}        what Insert leaves of such a value
+struct Set {
+  using Held = struct HeldSet;
+  Tag tag = kAnyTag;
+  std::vector<std::string> texts;
+
+  Set() = default;
+  Set(Tag state, std::vector<std::string> listed) : tag(state), texts(std::move(listed)) { Sort(); }
+  Set(std::string_view notation) {  // NOLINT(google-explicit-constructor)
+    const std::string_view word = notation.substr(0, notation.find('{'));
+    tag = word == "Nil" ? kNilTag : word == "Any" ? kAnyTag : word == "Max" ? kMaxTag : kExact;
+    if (word == "Min") texts = {""};
+    notation.remove_prefix(word.size());
+    while (notation.size() > 1) {  // the comma or brace before a text, and more
+      notation.remove_prefix(1);
+      const std::string_view text = notation.substr(0, notation.find_first_of(",}"));
+      notation.remove_prefix(text.size());
+      if (text == "Max") tag = kMaxTag;
+      if (text != "Max") texts.push_back(Unpacked(text));
+    }
+    Sort();
   }
-  Str Now() const { return {value.GetState(), Plain(value.GetLowerBound())}; }
-  std::vector<const ZORString*> Objects() const { return {}; }  // its text is no object of its own
-  ZORVadSingleString& Typed() { return value; }
-  ZORVaDoString& Abstract() { return value; }
-  ZORVadSingleString value;
+  Set(const char* notation) : Set(std::string_view(notation)) {}  // NOLINT(google-explicit-constructor)
+
+  void Sort() { std::sort(texts.begin(), texts.end()); }
+  bool HasEquals() const { return std::adjacent_find(texts.begin(), texts.end()) != texts.end(); }
+  bool operator==(const Set&) const = default;
+  friend std::ostream& operator<<(std::ostream& out, const Set& v) {
+    Show(out, v.tag, "") << " {";
+    for (std::size_t i = 0; i < std::min<std::size_t>(v.texts.size(), 6); ++i) Show(out << ' ', kExact, v.texts[i]);
+    return out << " } of " << v.texts.size();
+  }
 };
 
-// A single integer.
+// a0, a1, ... as the sets of many texts.
+inline Set Many(int count, const std::string& head = "a") {
+  Set set{kExact, {}};
+  for (int i = 0; i < count; ++i) set.texts.push_back(head + std::to_string(i));
+  set.Sort();
+  return set;
+}
+
+// A single integer. Notations: Nil, Any, or a number.
 struct Int {
   using Held = struct HeldInteger;
-  static Int Parse(const std::string& notation);  // Nil, Any or a number
-  Tag tag;
+  Tag tag = kAnyTag;
   ZORLong value = 0;
+
+  Int() = default;
+  Int(ZORLong number) : tag(kExact), value(number) {}  // NOLINT(google-explicit-constructor)
+  explicit Int(Tag state) : tag(state) {}
   bool operator==(const Int&) const = default;
   friend std::ostream& operator<<(std::ostream& out, const Int& v) {
     return v.tag == kExact ? out << v.value : out << (v.tag == kNilTag ? "Nil" : "Any");
   }
 };
 
-inline Int Number(ZORLong value) { return {kExact, value}; }
-constexpr Int kNoNumber{kNilTag}, kAnyNumber{kAnyTag};
-inline Int Int::Parse(const std::string& notation) {
-  return notation == "Nil" ? kNoNumber : notation == "Any" ? kAnyNumber : Number(std::stoi(notation));
+// A text that an operation takes as such.
+struct Word {
+  using Held = struct HeldWord;
+  std::string text;
+  bool operator==(const Word&) const = default;
+  friend std::ostream& operator<<(std::ostream& out, const Word& v) { return Show(out, kExact, v.text); }
+};
+
+using Value = std::variant<Str, Set, Int, Word>;
+inline std::ostream& operator<<(std::ostream& out, const Value& value) {
+  return std::visit([&](const auto& v) -> std::ostream& { return out << v; }, value);
 }
 
+inline std::string ShownAs(const Value& value) {
+  std::ostringstream out;
+  out << value;
+  return out.str();
+}
+
+inline Str Of(const ZORVadSingleString& value) { return {value.GetState(), Plain(value.GetLowerBound())}; }
+inline Set Of(const ZORVadEnumString& value) {
+  Set now{value.GetState(), {}};
+  for (int i = 0; i < value.Count(); ++i) now.texts.push_back(Plain(value.GetValue(i)));
+  return now;
+}
+inline Int Of(const ZORVadSingleInteger& value) {
+  return value.IsNil() != 0 ? Int(kNilTag) : value.IsUndefined() != 0 ? Int() : Int(value.GetValue());
+}
+
+// The objects. Typed is what typed forms are called with, Abstract what the entries of the solver's table get.
+struct HeldSingle {
+  HeldSingle(const Str& v) : value(ZORString(v.text)) {  // NOLINT(google-explicit-constructor)
+    ZORVadSingleString state;
+    if (v.tag == kMaxTag) value.CalcMaxValue();
+    if (v.tag == kNilTag) state.SetNilValue();
+    if (v.tag == kNilTag || v.tag == kAnyTag) value = state;  // which leaves the text as it is
+  }
+  Str Now() const { return Of(value); }
+  std::vector<const ZORString*> Objects() const { return {}; }  // its text is no object of its own
+  ZORVadSingleString& Typed() { return value; }
+  ZORVaDoString& Abstract() { return value; }
+  ZORVadSingleString value;
+};
+
+struct HeldSet {
+  HeldSet(const Set& v) {  // NOLINT(google-explicit-constructor)
+    if (v.tag == kNilTag || v.tag == kExact) value.SetNilValue();
+    if (v.tag == kMaxTag) value.CalcMaxValue();
+    // Equal texts go in while the value is Nil, the one after them gives the state.
+    const std::size_t last = std::min<std::size_t>(v.texts.size() - 1, 200);
+    for (std::size_t i = 0; i < v.texts.size(); ++i) {
+      if (v.tag == kExact && i == last) {
+        value.InsertExactValue(v.texts[i]);
+      } else {
+        value.Insert(v.texts[i]);
+      }
+    }
+  }
+  Set Now() const { return Of(value); }
+  std::vector<const ZORString*> Objects() const {
+    std::vector<const ZORString*> objects;
+    for (int i = 0; i < value.Count(); ++i) objects.push_back(&value.GetValue(i));
+    return objects;
+  }
+  ZORVadEnumString& Typed() { return value; }
+  ZORVaDoString& Abstract() { return value; }
+  ZORVadEnumString value;
+};
+
 struct HeldInteger {
-  explicit HeldInteger(const Int& v) {
+  HeldInteger(const Int& v) {  // NOLINT(google-explicit-constructor)
     if (v.tag == kExact) value.SetExactValue(v.value);
     if (v.tag == kNilTag) value.SetNilValue();
   }
-  Int Now() const {
-    if (value.IsNil() || value.IsUndefined()) return value.IsNil() ? kNoNumber : kAnyNumber;
-    return Number(value.GetValue());
-  }
+  Int Now() const { return Of(value); }
+  std::vector<const ZORString*> Objects() const { return {}; }
   ZORVaDoInteger& Typed() { return value; }
   ZORVaDoInteger& Abstract() { return value; }
   ZORVadSingleInteger value;
 };
 
-// A value of another class, by its text form. Operations take it as Base.
-template <class Class, class Base>
-struct Form {
-  struct Held {
-    explicit Held(const Form& v) {
-      ZORistrstream in(v.form.c_str(), 0);
-      value.InputValue(in);
-    }
-    Form Now() const {
-      ZORostrstream out;
-      value.PrintOn(out);
-      return {std::string(out.View())};
-    }
-    Base& Typed() { return value; }
-    Base& Abstract() { return value; }
-    Class value;
-  };
-  static Form Parse(const char* notation) { return {notation}; }
-  std::string form;
-  bool operator==(const Form&) const = default;
-  friend std::ostream& operator<<(std::ostream& out, const Form& v) { return out << v.form; }
+// The text itself, or one that a set lists.
+struct HeldWord {
+  HeldWord(const Word& v) : own(v.text) {}  // NOLINT(google-explicit-constructor)
+  Word Now() const { return {Plain(own)}; }
+  std::vector<const ZORString*> Objects() const { return {}; }
+  const ZORString& Typed() const { return listed != nullptr ? *listed : own; }
+  const ZORString& Abstract() const { return Typed(); }
+  ZORString own;
+  const ZORString* listed = nullptr;
 };
-using Truth = Form<ZORVadSingleBoolean, ZORVaDoBoolean>;
-using HeldBoolean = Truth::Held;
+
+using Object = std::variant<HeldSingle, HeldSet, HeldInteger, HeldWord>;  // in the order of Value
+inline Value NowOf(const Object& object) {
+  return std::visit([](const auto& held) { return Value(held.Now()); }, object);
+}
+inline std::vector<const ZORString*> ObjectsOf(const Object& object) {
+  return std::visit([](const auto& held) { return held.Objects(); }, object);
+}
+
+// As the solver's table takes it; null for a word.
+inline ZORVaDoAny* OperandOf(Object& object) {
+  return std::visit(
+      [](auto& held) -> ZORVaDoAny* {
+        if constexpr (requires { held.value; }) return &held.value;
+        return nullptr;
+      },
+      object);
+}
+
+// Objects where they stay: a copy of one would not be it.
+class Objects {
+ public:
+  explicit Objects(const std::vector<Value>& values) {
+    for (const Value& value : values)
+      std::visit([&]<class Plain>(const Plain& v) { mHeld.emplace_back(std::in_place_type<typename Plain::Held>, v); },
+                 value);
+  }
+  Object& operator[](std::size_t i) { return mHeld[i]; }
+  void Replace(std::size_t i, const Value& value) {
+    std::visit([&]<class Plain>(const Plain& v) { mHeld[i].emplace<typename Plain::Held>(v); }, value);
+  }
+  bool ShareTexts() const {
+    std::vector<const ZORString*> all;
+    for (const Object& object : mHeld)
+      for (const ZORString* text : ObjectsOf(object)) all.push_back(text);
+    std::sort(all.begin(), all.end());
+    return std::adjacent_find(all.begin(), all.end()) != all.end();
+  }
+
+ private:
+  std::deque<Object> mHeld;
+};
 
 // What the models do to a text.
 template <char first, char last>
@@ -153,6 +273,32 @@ inline std::string Previous(const std::string& s) {  // of a text that is not em
   if (s.back() != ' ') u += static_cast<char>(s.back() - 1);
   return u + std::string(u.size() < 255 ? 255 - u.size() : 0, 'z');
 }
+
+// States and bounds, as the models see them.
+namespace model {
+
+inline const std::string kLeastText = " ", kGreatestText(255, 'z');
+
+inline bool IsNil(const auto& v) { return v.tag == kNilTag; }
+inline bool IsAny(const auto& v) { return v.tag == kAnyTag; }
+inline bool IsMin(const Str& v) { return v == kMin; }
+inline bool IsMax(const Str& v) { return v.tag == kMaxTag; }
+inline bool IsMin(const Set& v) { return v.tag == kExact && v.texts == std::vector<std::string>{""}; }
+inline bool IsMax(const Set& v) { return v.tag == kMaxTag && v.texts.empty(); }
+inline std::string Lower(const Str& v) { return v.text; }
+inline std::string Upper(const Str& v) { return v.text; }
+inline std::string Lower(const Set& v) {
+  if (IsNil(v)) return "";
+  if (IsAny(v) || IsMin(v)) return kLeastText;
+  return IsMax(v) ? kGreatestText : v.texts.front();
+}
+inline std::string Upper(const Set& v) {
+  if (IsNil(v)) return "";
+  if (IsMin(v)) return kLeastText;
+  return IsAny(v) || v.tag == kMaxTag ? kGreatestText : v.texts.back();
+}
+
+}  // namespace model
 
 // A reference to nothing, as a caller passes it where an operand is missing.
 template <class Value>

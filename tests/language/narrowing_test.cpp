@@ -16,30 +16,6 @@ TEST(Propagation, SettlesTo) {
   }
 }
 
-// At the limit of 255 characters.
-TEST(Propagation, GreatestText) {
-  const std::string greatest(255, 'z'), long200(200, 'a');
-  Solved solved("var string: over; var set string: in; var {\"" + long200 +
-                "\", \"b\"}: x; var set string: sums; var set string: up;" + "constraint str_concat(\"" + long200 +
-                "\", \"" + long200 + "\", over);" + "constraint str_eq(over, in);" +
-                "constraint str_concat(x, x, sums); constraint str_upper(in, up); var bool: top; constraint "
-                "str_eq_reif(over, \"" +
-                greatest + "\", top);");
-  EXPECT_EQ(solved.Narrow(), zornet::Outcome::Settled);
-  EXPECT_EQ(solved.Print("over"), "Max");
-  EXPECT_EQ(solved.Print("in"), "Max");
-  EXPECT_EQ(solved.Print("sums"), "{ \"bb\", Max }");
-  EXPECT_EQ(solved.Print("up"), '"' + std::string(255, 'Z') + '"');
-  EXPECT_EQ(solved.Print("top"), "true");
-}
-
-TEST(Propagation, GreatestTextIsItsOwnSuccessor) {
-  Solved solved("var set string: before; var {\"" + std::string(255, 'z') +
-                "\"}: last; constraint str_next(before, last);");
-  EXPECT_EQ(solved.Narrow(), zornet::Outcome::Settled);
-  EXPECT_EQ(solved.Print("before"), "{ \"" + std::string(254, 'z') + "y\", Max }");
-}
-
 // The module gives up at the 257th pair, though many pairs give one text.
 TEST(Propagation, MorePairsThanASetLists) {
   std::string set;

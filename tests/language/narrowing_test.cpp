@@ -57,11 +57,6 @@ TEST(Propagation, IsDrivenFromTheResults) {
   EXPECT_EQ(cut["z"].Texts().size(), 300u);
 }
 
-TEST(Propagation, StepLimit) {
-  Solved solved("var string: x; constraint str_eq(x, \"a\"); constraint str_ne(x, \"b\");", {65536, 1});
-  EXPECT_EQ(solved.Narrow(), zornet::Outcome::StepLimit);
-}
-
 // Ten times the network, ten times the work.
 TEST(Propagation, WorkGrowsWithTheNetwork) {
   const auto passes = [](int size) {

@@ -102,20 +102,4 @@ TEST(Reader, SurvivesAnyBytes) {
   }
 }
 
-TEST(Reader, ReadsAllThereIs) {
-  const zornet::Source source("",
-                              "var string:a;var set string : b;var {\"x\",\"x\", \"\"}:c;var int:d=-5;var -2..3:e=1;\n"
-                              "var {3,1}:f={1};var bool:g=true;constraint str_eq(a,b);% end\noutput a,c;output g;");
-  zornet::Diagnostics diagnostics;
-  const zornet::Model model = zornet::Read(source, diagnostics).model;
-  ASSERT_FALSE(diagnostics.Failed()) << zornet::Render(source, diagnostics, false);
-  ASSERT_EQ(model.Variables().size(), 7u);
-  EXPECT_EQ(model.Variables()[2].texts, (std::vector<std::string>{"", "x"}));
-  EXPECT_EQ(model.Variables()[3].numbers, std::vector<std::int32_t>{-5});
-  EXPECT_EQ(model.Variables()[4].numbers, (std::vector<std::int32_t>{1, 1}));
-  EXPECT_EQ(model.Variables()[5].numbers, std::vector<std::int32_t>{1});
-  EXPECT_EQ(model.Variables()[6].numbers, std::vector<std::int32_t>{1});
-  EXPECT_EQ(model.Wanted(), (std::vector<int>{0, 2, 6}));
-}
-
 }  // namespace

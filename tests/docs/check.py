@@ -21,6 +21,8 @@ import sys
 root, build = (pathlib.Path(argument).resolve() for argument in sys.argv[1:3])
 page = root / sys.argv[3]
 folder, prefix = build / 'docs-test' / page.stem, build / 'install-test/tree'
+SOURCES = ('host', 'vector', 'module', 'single', 'enum', 'network', 'language', 'zornet', 'tests', 'fuzz', 'bench', 'docs',
+           'examples', 'editors', 'cmake', 'gdb')
 failures = []
 
 shutil.rmtree(folder, ignore_errors=True)
@@ -63,20 +65,42 @@ def check_block(kind, text):
 
 
 def check_references(text):
-    """Links and paths lead to files, commands and presets are known, and a filter of tests finds some."""
-    usage = (root / 'dev').read_text()
-    presets = {preset['name'] for preset in json.loads((root / 'CMakePresets.json').read_text())['configurePresets']}
-    paths = [path for path in re.findall(r'`((?:[\w.-]+/)+[\w.-]*)[` ]', text) if (root / path.split('/')[0]).is_dir()]
-    named = re.findall(r'--preset (\w+)|\./dev build (\w+)', text)
-    named += [(name, '') for listed in re.findall(r'The presets are (.*?)\.\s', text, re.S) for name in re.findall(r'`(\w+)`', listed)]
+    """Links and names lead to files, presets, commands and options are known, and a filter of tests finds some."""
+    prose = re.sub(r'^```.*?^```$', '', text, flags=re.M | re.S)
+    codes = [code.split() for code in re.findall(r'`([^`]+)`', prose) if code.strip()]
     missing = [link for link in re.findall(r'\]\(([\w./-]+)[)#]', text) if not (page.parent / link).exists()]
-    missing += [path for path in paths if not path.startswith('build/') and 'FAMILY' not in path and not (root / path).exists()]
-    missing += [f'preset {name}' for pair in named for name in pair if name and name not in presets]
+    missing += [word for code in codes for word in code if is_file(word) and not find_file(word)]
+
+    presets = {preset['name'] for preset in json.loads((root / 'CMakePresets.json').read_text())['configurePresets']
+               if not preset.get('hidden')}
+    named = [name for row in re.findall(r'--preset (\w+)|\./dev build (\w+)|`(\w+)` preset|preset `(\w+)`'
+                                        r'|[Tt]he (\w+) preset\b|\bits (\w+) build\b|build/(\w+)', text) for name in row if name]
+    missing += [f'preset {name}' for name in named if name not in presets | {'docs', 'fuzz'}]
+    for listed in re.findall(r'The presets are (.*?)\.\s', text, re.S):
+        missing += [f'preset {name}' for name in presets ^ set(re.findall(r'`(\w+)`', listed))]
+    usage = (root / 'dev').read_text().split("cat <<'EOT'\n")[1].split('EOT')[0]
     missing += [command for command in re.findall(r'\./dev [a-z-]+', text) if f'{command} ' not in usage]
+
+    helped = set(re.findall(r'(?<![\w-])--?[a-z-]+', subprocess.check_output([build / 'bin/zornet', '--help'], text=True)))
+    for code in (code for code in codes if code[0] == 'zornet' or code[0].startswith('-')):
+        missing += [f'option {word}' for word in code if re.match('--?[a-z]', word) and word.split('=')[0] not in helped]
     for name in re.findall(r'ctest --preset dev -R (\S+?)`', text):
         if 'Total Tests: 0' in subprocess.check_output(['ctest', '-N', '-R', name], cwd=build, text=True):
-            missing.append(name)
+            missing.append(f'test {name}')
     failures.extend(f'There is no {what}' for what in missing)
+
+
+def is_file(word):
+    return re.fullmatch(r'(?:[\w.-]+/)+[\w.-]*|[\w.-]+\.(cpp|h|md|py|sh|txt|szn|json|so|cmake|svg|expected)', word)
+
+
+# By its path or by its name alone; a block of the page may make it. FAMILY stands for any of the families.
+def find_file(word):
+    word = word.replace('FAMILY', 'order')
+    if '/' in word:
+        return (root / word).exists() or word.startswith('build/')
+    return (folder / word).exists() or (build / 'bin' / word).exists() or any(
+        (root / place).is_dir() and any((root / place).rglob(word)) for place in SOURCES) or (root / word).exists()
 
 
 def check_table(text):

@@ -66,7 +66,7 @@ class Check {
 
   void CheckHolds(const naive::Assignment& assignment) const {
     for (const naive::Constraint& constraint : mNetwork.constraints) {
-      ASSERT_TRUE(naive::Holds(mNetwork, constraint, assignment)) << mText << constraint.name << " fails for\n"
+      ASSERT_TRUE(naive::Holds(mNetwork, constraint, assignment)) << mText << constraint.Name() << " fails for\n"
                                                                   << Describe(assignment);
     }
   }
@@ -116,7 +116,7 @@ class Check {
     for (std::size_t v = 0; v < mNetwork.variables.size(); ++v)
       text += "v" + std::to_string(v) + ": " + mSolved[static_cast<int>(v)].Print() + "\n";
     for (const naive::Constraint& constraint : mNetwork.constraints) {
-      text += constraint.name;
+      text += constraint.Name();
       for (const int argument : constraint.arguments) text += " v" + std::to_string(argument);
       text += "\n";
     }

@@ -3,7 +3,6 @@
 #include <fmt/core.h>
 
 #include <algorithm>
-#include <array>
 #include <cstdint>
 #include <unordered_map>
 #include <unordered_set>
@@ -41,6 +40,12 @@ std::string_view Describe(Takes takes) {
       return "a truth value";
     case Takes::Anything:
       return "anything";
+    case Takes::Texts:
+      return "a list of texts";
+    case Takes::Integers:
+      return "a list of integers";
+    case Takes::Booleans:
+      return "a list of truth values";
   }
   return "";
 }
@@ -185,15 +190,16 @@ bool Resolver::IsAllowed(const Variable& variable, const Word& word) const {
 void Resolver::Add(const ConstraintSyntax& syntax) {
   const Kind* kind = FindKindFor(syntax);
   if (kind == nullptr) return;
-  std::array<Var, kMostArguments> variables;
+  std::vector<Argument> variables;
   bool good = true;
   const std::span<const Word> arguments = mSyntax.ArgumentsOf(syntax);
   for (std::size_t i = 0; i < arguments.size(); ++i) {
-    variables[i].index = AddArgument(arguments[i], kind->takes[i], kind->name, kind->roles[i]);
-    good = good && variables[i].index != kUnknown;
+    const int variable = AddArgument(arguments[i], kind->takes[i], kind->name, kind->roles[i]);
+    variables.emplace_back(Var{variable});
+    good = good && variable != kUnknown;
   }
   if (!good) return;
-  mModel.Post(*kind, std::span(variables).first(arguments.size()));
+  mModel.Post(*kind, variables);
   mRead.places.constraints.push_back(syntax.extent);
 }
 

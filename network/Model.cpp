@@ -89,33 +89,78 @@ Var Model::AddConstant(const Argument& value) {
 }
 
 int Model::Post(std::string_view name, std::initializer_list<Argument> arguments) {
-  const Kind* const kind = FindKind(name);
+  const bool list = std::any_of(arguments.begin(), arguments.end(), std::mem_fn(&Argument::IsList));
+  const Kind* const kind = FindKind(name, list);
   if (kind == nullptr) Refuse("there is no constraint '" + std::string(name) + "'");
+  return Post(*kind, {arguments.begin(), arguments.size()});
+}
+
+int Model::Post(const Kind& kind, std::span<const Argument> arguments) {
+  if (static_cast<int>(arguments.size()) != kind.arity)
+    Refuse(std::string(kind.name) + " takes " + std::to_string(kind.arity) + " arguments, not " +
+           std::to_string(arguments.size()));
   const std::size_t before = mVariables.size();
   try {
-    std::vector<Var> variables;
-    for (const Argument& argument : arguments) variables.push_back(AddConstant(argument));
-    return Post(*kind, variables);
+    Flatten(kind, arguments);
   } catch (...) {
     mVariables.resize(before);
     throw;
   }
+  mConstraints.push_back({&kind, Keep(mPosted)});
+  return static_cast<int>(mConstraints.size()) - 1;
 }
 
-int Model::Post(const Kind& kind, std::span<const Var> arguments) {
-  if (static_cast<int>(arguments.size()) != kind.arity)
-    Refuse(std::string(kind.name) + " takes " + std::to_string(kind.arity) + " arguments, not " +
-           std::to_string(arguments.size()));
-  Constraint constraint{&kind};
-  for (std::size_t i = 0; i < arguments.size(); ++i) {
-    const auto at = static_cast<std::size_t>(arguments[i].index);
-    if (at >= mVariables.size()) Refuse("no variable of this model");
-    if (!Fits(mVariables[at].sort, kind.takes[i]))
-      Refuse(std::string(kind.name) + " cannot take '" + mVariables[at].name + "' for " + std::string(kind.roles[i]));
-    constraint.arguments[i] = arguments[i].index;
+void Model::Flatten(const Kind& kind, std::span<const Argument> arguments) {
+  mPosted.clear();
+  for (std::size_t place = 0; place < arguments.size(); ++place) {
+    const auto* const list = std::get_if<std::vector<Argument>>(&arguments[place].mValue);
+    if ((list != nullptr) != IsList(kind.takes[place]))
+      Refuse(std::string(kind.name) + " takes " + (list != nullptr ? "no list" : "a list") + " for " +
+             std::string(kind.roles[place]));
+    if (list == nullptr) {
+      Take(kind, place, arguments[place]);
+    } else if (list->empty()) {
+      Refuse(std::string(kind.name) + " takes at least one member in " + std::string(kind.roles[place]));
+    } else {
+      for (const Argument& member : *list) Take(kind, place, member);
+    }
   }
-  mConstraints.push_back(constraint);
-  return static_cast<int>(mConstraints.size()) - 1;
+}
+
+void Model::Take(const Kind& kind, std::size_t place, const Argument& argument) {
+  if (argument.IsList()) Refuse("a list holds no list");
+  const Var variable = AddConstant(argument);
+  const auto at = static_cast<std::size_t>(variable.index);
+  if (at >= mVariables.size()) Refuse("no variable of this model");
+  if (!Fits(mVariables[at].sort, MemberOf(kind.takes[place])))
+    Refuse(std::string(kind.name) + " cannot take '" + mVariables[at].name + "' for " + std::string(kind.roles[place]));
+  mPosted.push_back(variable.index);
+}
+
+std::span<const int> Model::Keep(std::span<const int> numbers) {
+  constexpr std::size_t kBlock = 4096;
+  if (mArguments.empty() || mArguments.back().size - mArguments.back().used < numbers.size()) {
+    const std::size_t size = std::max(kBlock, numbers.size());
+    mArguments.push_back({std::make_unique<int[]>(size), 0, size});
+  }
+  Block& block = mArguments.back();
+  int* const first = block.numbers.get() + block.used;
+  std::copy(numbers.begin(), numbers.end(), first);
+  block.used += numbers.size();
+  return {first, numbers.size()};
+}
+
+Model::Model(const Model& other)
+    : mVariables(other.mVariables), mConstraints(other.mConstraints), mWanted(other.mWanted) {
+  for (Constraint& constraint : mConstraints) constraint.arguments = Keep(constraint.arguments);
+}
+
+Model& Model::operator=(Model other) noexcept {
+  mVariables.swap(other.mVariables);
+  mConstraints.swap(other.mConstraints);
+  mArguments.swap(other.mArguments);
+  mWanted.swap(other.mWanted);
+  return *this;
 }
 
 void Model::Want(Var variable) {

@@ -12,6 +12,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <initializer_list>
+#include <memory>
 #include <span>
 #include <string>
 #include <string_view>
@@ -78,35 +79,56 @@ enum class Meaning {
   TextForm,
 };
 
-enum class Takes { Text, Integer, Boolean, Anything };
-inline constexpr int kMostArguments = 4;
+// What stands at one place of a constraint. The plural is a list, as str_concat([a, "-", b], z) has one; a constraint
+// has at most one list.
+enum class Takes {
+  Text,
+  Integer,
+  Boolean,
+  Anything,
+  Texts,
+  Integers,
+  Booleans,
+};
+constexpr bool IsList(Takes takes) { return takes >= Takes::Texts; }
+ZOR_EXPORT Takes MemberOf(Takes list);  // what the list holds; of another place what stands there
 
-// A constraint that can be posted.
+inline constexpr int kMostArguments = 5;
+
+// A constraint that can be posted. Two forms may share a name: one with a list and one without.
 struct Kind {
   std::string_view name;
   Meaning meaning;
   bool mirrored;  // the relation with first and second exchanged
   bool reified;
-  int arity;
+  int arity;  // arguments as they are written, where a list is one
   std::array<Takes, kMostArguments> takes;
   std::array<std::string_view, kMostArguments> roles;
 
   constexpr bool IsRelation() const { return meaning <= Meaning::Less; }
-  constexpr int Inputs() const { return arity - 1; }  // of a function: its result comes last
+  ZOR_EXPORT bool HasList() const;
 };
 
 ZOR_EXPORT std::span<const Kind> Kinds();
-ZOR_EXPORT const Kind* FindKind(std::string_view name);  // null when there is none
+
+// The constraint of that name; of two forms the one with a list, or the one without. Null when there is none.
+ZOR_EXPORT const Kind* FindKind(std::string_view name, bool list = false);
 ZOR_EXPORT bool Fits(Sort sort, Takes takes);
 
+// A constraint of a model, to which its arguments belong.
 struct Constraint {
   const Kind* kind = nullptr;
-  std::array<int, kMostArguments> arguments = {};  // variables by number
+  std::span<const int> arguments = {};  // variables by number; a list's members stand in its place one by one
 
-  int Result() const { return arguments[static_cast<std::size_t>(kind->Inputs())]; }
+  std::size_t Inputs() const { return arguments.size() - 1; }  // of a function: its result comes last
+  int Result() const { return arguments.back(); }
+
+  // Where arguments[position] stands as the constraint is written: an index into takes and roles.
+  ZOR_EXPORT std::size_t Place(std::size_t position) const;
+  std::string_view RoleOf(std::size_t position) const { return kind->roles[Place(position)]; }
 };
 
-// An argument of a constraint: a variable, or a constant.
+// An argument of a constraint as it is written: a variable, a constant, or a list of them.
 class Argument {
  public:
   // NOLINTBEGIN(google-explicit-constructor): arguments are written as what they are
@@ -115,15 +137,25 @@ class Argument {
   Argument(std::string text) : mValue(std::move(text)) {}
   Argument(std::int32_t number) : mValue(number) {}
   Argument(bool truth) : mValue(truth) {}
+  Argument(std::vector<Argument> list) : mValue(std::move(list)) {}
+  Argument(std::initializer_list<Argument> list) : mValue(std::vector<Argument>(list)) {}
   // NOLINTEND(google-explicit-constructor)
+
+  bool IsList() const { return std::holds_alternative<std::vector<Argument>>(mValue); }
 
  private:
   friend class Model;
-  std::variant<Var, std::string, std::int32_t, bool> mValue;
+  std::variant<Var, std::string, std::int32_t, bool, std::vector<Argument>> mValue;
 };
 
 class ZOR_EXPORT Model {
  public:
+  Model() = default;
+  Model(const Model& other);
+  Model(Model&&) noexcept = default;
+  Model& operator=(Model other) noexcept;
+  ~Model() = default;
+
   // clang-format off
   // Variables, by a name for people, which may be empty. Without a value nothing is known of them.
   Var Text      (std::string name);
@@ -142,8 +174,11 @@ class ZOR_EXPORT Model {
 
   // Posts the constraint of that name, such as "str_concat"; docs/language.md lists them with their arguments.
   // Answers its number.
+  //
+  //   model.Post("str_concat", {x, "-7", z});
+  //   model.Post("str_concat", {{a, "-", b}, z});  // with a list; FindKind chooses the form
   int Post(std::string_view name, std::initializer_list<Argument> arguments);
-  int Post(const Kind& kind, std::span<const Var> arguments);
+  int Post(const Kind& kind, std::span<const Argument> arguments);
 
   // Names a variable that is wanted: solutions that differ elsewhere only are one solution. Without any, all
   // variables are wanted.
@@ -157,8 +192,19 @@ class ZOR_EXPORT Model {
   void Reserve(std::size_t variables, std::size_t constraints);  // room, for large models
 
  private:
+  struct Block {
+    std::unique_ptr<int[]> numbers;
+    std::size_t used = 0, size = 0;
+  };
+
+  void Flatten(const Kind& kind, std::span<const Argument> arguments);
+  void Take(const Kind& kind, std::size_t place, const Argument& argument);
+  std::span<const int> Keep(std::span<const int> numbers);
+
   std::vector<Variable> mVariables;
   std::vector<Constraint> mConstraints;
+  std::vector<Block> mArguments;  // of all constraints; never moved, so that these may point at them
+  std::vector<int> mPosted;       // the arguments of the constraint that is posted
   std::vector<int> mWanted;
 };
 

@@ -66,7 +66,8 @@ bool ForEachBeginning(const Listing& listing, std::string_view text, Visit visit
 double Supports::DrivenCost(const Constraint& constraint) {
   const Meaning meaning = constraint.kind->meaning;
   if (meaning != Meaning::Concatenation && meaning != Meaning::Slice) return kNever;
-  const Column &x = At(0), &y = At(1), &result = At(constraint.kind->Inputs());
+  if (meaning == Meaning::Concatenation && constraint.Inputs() != 2) return kNever;
+  const Column &x = At(0), &y = At(1), &result = At(constraint.Inputs());
   if (!result.IsListed()) return kNever;
   if (meaning == Meaning::Slice) {
     if (!x.IsListed() || !y.IsListed() || !At(2).IsListed()) return kNever;

@@ -85,29 +85,25 @@ Status Functions::Narrow(const Constraint& constraint) {
 }
 
 bool Functions::HasExactInputs(const Constraint& constraint) const {
-  for (int i = 0; i < constraint.kind->Inputs(); ++i) {
-    if (!mStore[constraint.arguments[static_cast<std::size_t>(i)]].IsOne()) return false;
-  }
-  return true;
+  const auto inputs = constraint.arguments.first(constraint.Inputs());
+  return std::all_of(inputs.begin(), inputs.end(), [this](int input) { return mStore[input].IsOne(); });
 }
 
 void Functions::ComputeExact(const Constraint& constraint) {
-  std::array<Exact, kMostArguments> inputs{};
-  std::array<ZORString, kMostArguments> texts;
-  for (int i = 0; i < constraint.kind->Inputs(); ++i) {
-    const auto at = static_cast<std::size_t>(i);
-    const Value& value = mStore[constraint.arguments[at]];
-    inputs[at].sort = value.Sort();
+  mExact.resize(constraint.Inputs());
+  mTexts.resize(std::max(mTexts.size(), constraint.Inputs()));
+  for (std::size_t i = 0; i < constraint.Inputs(); ++i) {
+    const Value& value = mStore[constraint.arguments[i]];
     if (IsText(value.Sort())) {
-      texts[at] = value.LowestText();
-      inputs[at].text = &texts[at];
+      mTexts[i] = value.LowestText();
+      mExact[i] = {&mTexts[i], 0, value.Sort()};
     } else {
-      inputs[at].number = value.LowestNumber();
+      mExact[i] = {nullptr, value.LowestNumber(), value.Sort()};
     }
   }
   mStore.StartOperation(ForwardOf(constraint.kind->meaning));
   Answer answer;
-  if (!mSemantics.Compute(*constraint.kind, inputs.data(), answer)) return mStore.Fail(constraint.Result());
+  if (!mSemantics.Compute(*constraint.kind, mExact, answer)) return mStore.Fail(constraint.Result());
   MeetResult(constraint, answer);
 }
 
@@ -125,9 +121,11 @@ void Functions::MeetResult(const Constraint& constraint, const Answer& answer) {
 bool Functions::ComputeSets(const Constraint& constraint) {
   const Kind& kind = *constraint.kind;
   if (kind.meaning == Meaning::Slice || kind.meaning == Meaning::TextForm) return false;
+  if (constraint.Inputs() > 2) return false;
+  const bool binary = constraint.Inputs() == 2;
   const int first = constraint.arguments[0], second = constraint.arguments[1];
-  if (kind.Inputs() == 2 && first == second) return false;  // the module would pair different texts too
-  if (!mStore[first].IsKnown() || (kind.Inputs() == 2 && !mStore[second].IsKnown())) return false;
+  if (binary && first == second) return false;  // the module would pair different texts too
+  if (!mStore[first].IsKnown() || (binary && !mStore[second].IsKnown())) return false;
   const Value& x = AsSet(first, mX);
   if (kind.meaning == Meaning::Length) {
     Value& lengths = mStore.FreshLike(constraint.Result());
@@ -136,7 +134,7 @@ bool Functions::ComputeSets(const Constraint& constraint) {
     mStore.Meet(constraint.Result(), lengths);
     return true;
   }
-  const Value& y = kind.Inputs() == 2 ? AsSet(second, mY) : x;
+  const Value& y = binary ? AsSet(second, mY) : x;
   mZ.Reset();
   if (!CallSets(constraint, x, y, mZ)) return false;
   if (mZ.IsUndefined()) return false;  // more texts than an operation on sets lists
@@ -203,7 +201,7 @@ void Functions::BoundLength(int number) {
 
 // Narrows positions and slice by each other, whatever the text is. True when the slice must be empty.
 bool Functions::BoundSlice(const Constraint& constraint) {
-  const auto [text, from, to, slice] = constraint.arguments;
+  const int from = constraint.arguments[1], to = constraint.arguments[2], slice = constraint.Result();
   const std::int64_t first = std::max<std::int64_t>(LowestOr(mStore[from], 0), 0);
   const std::int64_t last = HighestOr(mStore[to], kLastPosition);
   mStore.StartOperation(Operation::Slice);

@@ -33,7 +33,9 @@ class Functions {
   Store& mStore;
   Semantics mSemantics;
   Supports mSupports;
-  Value mX, mY, mZ;  // sets
+  Value mX, mY, mZ;           // sets
+  std::vector<Exact> mExact;  // inputs
+  std::vector<ZORString> mTexts;
 };
 
 }  // namespace zornet

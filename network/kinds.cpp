@@ -6,7 +6,7 @@ namespace zornet {
 
 namespace {
 
-constexpr Takes T = Takes::Text, I = Takes::Integer, B = Takes::Boolean, V = Takes::Anything;
+constexpr Takes T = Takes::Text, I = Takes::Integer, B = Takes::Boolean, V = Takes::Anything, Ts = Takes::Texts;
 
 // clang-format off
 constexpr Kind kKinds[] = {
@@ -23,12 +23,15 @@ constexpr Kind kKinds[] = {
   {"str_le_reif",  Meaning::LessOrEqual,      false, true,   3,    {T, T, B},    {"x", "y", "b"}},
 
   {"str_concat",   Meaning::Concatenation, false, false,  3,    {T, T, T},    {"x", "y", "z"}},
+  {"str_concat",   Meaning::Concatenation, false, false,  2,    {Ts, T},      {"xs", "z"}},
   {"str_substr",   Meaning::Slice,         false, false,  4,    {T, I, I, T}, {"x", "from", "to", "z"}},
   {"str_length",   Meaning::Length,        false, false,  2,    {T, I},       {"x", "n"}},
   {"str_lower",    Meaning::Lower,         false, false,  2,    {T, T},       {"x", "z"}},
   {"str_upper",    Meaning::Upper,         false, false,  2,    {T, T},       {"x", "z"}},
   {"str_min",      Meaning::Minimum,       false, false,  3,    {T, T, T},    {"x", "y", "z"}},
   {"str_max",      Meaning::Maximum,       false, false,  3,    {T, T, T},    {"x", "y", "z"}},
+  {"str_min",      Meaning::Minimum,       false, false,  2,    {Ts, T},      {"xs", "z"}},
+  {"str_max",      Meaning::Maximum,       false, false,  2,    {Ts, T},      {"xs", "z"}},
   {"str_next",     Meaning::Successor,     false, false,  2,    {T, T},       {"x", "z"}},
   {"str_text",     Meaning::TextForm,      false, false,  2,    {V, T},       {"v", "x"}},
 };
@@ -48,9 +51,37 @@ constexpr SortNames kSortNames[kSorts] = {
 
 std::span<const Kind> Kinds() { return kKinds; }
 
-const Kind* FindKind(std::string_view name) {
-  const auto* found = std::find_if(std::begin(kKinds), std::end(kKinds), [&](const Kind& k) { return k.name == name; });
-  return found != std::end(kKinds) ? found : nullptr;
+const Kind* FindKind(std::string_view name, bool list) {
+  const Kind* found = nullptr;
+  for (const Kind& kind : kKinds) {
+    if (kind.name == name && (found == nullptr || kind.HasList() == list)) found = &kind;
+  }
+  return found;
+}
+
+bool Kind::HasList() const { return std::any_of(takes.begin(), takes.begin() + arity, IsList); }
+
+Takes MemberOf(Takes list) {
+  switch (list) {
+    case Takes::Texts:
+      return Takes::Text;
+    case Takes::Integers:
+      return Takes::Integer;
+    case Takes::Booleans:
+      return Takes::Boolean;
+    default:
+      return list;
+  }
+}
+
+// Behind a list every argument stands by as many places as its other members take.
+std::size_t Constraint::Place(std::size_t position) const {
+  const auto places = static_cast<std::size_t>(kind->arity);
+  const std::size_t others = arguments.size() + 1 - places;  // members of the list, if there is one
+  const auto* const list = std::find_if(kind->takes.begin(), kind->takes.begin() + kind->arity, IsList);
+  const auto first = static_cast<std::size_t>(list - kind->takes.begin());
+  if (position <= first) return position;
+  return position < first + others ? first : position + 1 - others;
 }
 
 bool Fits(Sort sort, Takes takes) {
@@ -63,8 +94,9 @@ bool Fits(Sort sort, Takes takes) {
       return sort == Sort::Boolean;
     case Takes::Anything:
       return true;
+    default:
+      return false;  // no variable is a list
   }
-  return false;
 }
 
 const SortNames& NamesOf(Sort sort) { return kSortNames[static_cast<std::size_t>(sort)]; }

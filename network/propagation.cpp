@@ -24,10 +24,8 @@ void Propagation::Connect() {
   mFirstReader.resize(mModel.Variables().size() + 1, 0);
   const auto each = [this](auto visit) {
     for (std::size_t c = 0; c < mModel.Constraints().size(); ++c) {
-      const Constraint& constraint = mModel.Constraints()[c];
-      for (int i = 0; i < constraint.kind->arity; ++i) {
-        visit(static_cast<int>(c), static_cast<std::size_t>(constraint.arguments[static_cast<std::size_t>(i)]));
-      }
+      for (const int variable : mModel.Constraints()[c].arguments)
+        visit(static_cast<int>(c), static_cast<std::size_t>(variable));
     }
   };
   each([this](int, std::size_t variable) { ++mFirstReader[variable + 1]; });

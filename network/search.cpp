@@ -17,7 +17,7 @@ Search::Search(Store& store, Propagation& propagation)
   for (const int variable : store.Model().Wanted()) take(variable);
   mWanted = mOrder.size();
   for (const Constraint& constraint : store.Model().Constraints()) {
-    for (int i = 0; i < constraint.kind->arity; ++i) take(constraint.arguments[static_cast<std::size_t>(i)]);
+    for (const int variable : constraint.arguments) take(variable);
   }
   for (std::size_t place = 0; place < mOrder.size(); ++place) {
     if (!mStore.List(mOrder[place]).known) mUnlisted.push_back(place);
@@ -153,9 +153,7 @@ bool Search::CanBecomeKnown(int variable, std::uint64_t before) {
   for (std::size_t i = 0; i < reached.size(); ++i) {
     for (const int number : mPropagation.ReadersOf(reached[i])) {
       if (mPropagation.IsFinished(number)) continue;
-      const Constraint& constraint = mStore.Model().Constraints()[static_cast<std::size_t>(number)];
-      for (int a = 0; a < constraint.kind->arity; ++a) {
-        const int other = constraint.arguments[static_cast<std::size_t>(a)];
+      for (const int other : mStore.Model().Constraints()[static_cast<std::size_t>(number)].arguments) {
         if (mStore[other].IsOne() || stamp(other) == mStamp) continue;
         if (mStore.List(other).known || stamp(other) > before) return true;
         stamp(other) = mStamp;
@@ -192,18 +190,17 @@ void Search::Leaf(const Solution& solution) {
 
 // Each constraint by itself. One that an argument without a value is left to is finished: it holds for any.
 bool Search::Confirm() {
-  return std::all_of(mStore.Model().Constraints().begin(), mStore.Model().Constraints().end(),
-                     [&](const Constraint& c) {
-                       std::array<Exact, kMostArguments> exact{};
-                       for (int i = 0; i < c.kind->arity; ++i) {
-                         const auto at = static_cast<std::size_t>(i);
-                         if (!mStore[c.arguments[at]].IsOne()) return true;
-                         const Listing& listing = mStore.List(c.arguments[at]);
-                         exact[at] = {IsText(listing.sort) ? &listing.texts.front() : nullptr,
-                                      IsText(listing.sort) ? 0 : listing.NumberAt(0), listing.sort};
-                       }
-                       return mSemantics.Holds(*c.kind, exact.data());
-                     });
+  const auto& constraints = mStore.Model().Constraints();
+  return std::all_of(constraints.begin(), constraints.end(), [this](const Constraint& constraint) {
+    mExact.clear();
+    for (const int variable : constraint.arguments) {
+      if (!mStore[variable].IsOne()) return true;
+      const Listing& listing = mStore.List(variable);
+      const bool text = IsText(listing.sort);
+      mExact.push_back({text ? &listing.texts.front() : nullptr, text ? 0 : listing.NumberAt(0), listing.sort});
+    }
+    return mSemantics.Holds(constraint, mExact);
+  });
 }
 
 // The wanted values as they are printed.

@@ -73,6 +73,7 @@ class Search {
   std::vector<std::uint64_t> mStamps;  // when CanBecomeKnown reached each variable last
   std::uint64_t mStamp = 0;
   std::vector<Frame> mFrames;
+  std::vector<Exact> mExact;     // arguments of the constraint that is confirmed
   std::set<std::string> mShown;  // solutions below the first loose frame
   int mWitnessOpen = kNone;      // a variable that stayed open while a witness was looked for
   std::uint64_t mFound = 0;

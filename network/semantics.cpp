@@ -1,7 +1,6 @@
 #include "network/semantics.h"
 
 #include <algorithm>
-#include <array>
 
 namespace zornet {
 
@@ -23,19 +22,25 @@ Semantics::Semantics(const Types& types)
 }
 
 // Operands are Exact, the greatest text too: the module would fold a Max by its state.
-bool Semantics::Compute(const Kind& kind, const Exact* inputs, Answer& result) {
+bool Semantics::Compute(const Kind& kind, std::span<const Exact> inputs, Answer& result) {
   if (kind.meaning == Meaning::TextForm) return ComputeTextForm(inputs[0], result);
-  if (kind.meaning == Meaning::Slice) {
-    result.text = Slice(*inputs[0].text, inputs[1].number, inputs[2].number);
-    return true;
+  const ZORString& x = *inputs[0].text;
+  switch (kind.meaning) {
+    case Meaning::Slice:
+      result.text = Slice(x, inputs[1].number, inputs[2].number);
+      return true;
+    case Meaning::Concatenation:
+    case Meaning::Minimum:
+    case Meaning::Maximum:
+      result.text = x;
+      for (const Exact& input : inputs.subspan(1)) result.text = Fold(kind.meaning, result.text, *input.text);
+      return true;
+    default:
+      break;
   }
-  mX.Text().SetExactValue(*inputs[0].text);
-  if (kind.Inputs() == 2) mY.Text().SetExactValue(*inputs[1].text);
+  mX.Text().SetExactValue(x);
   mZ.Reset();
   switch (kind.meaning) {
-    case Meaning::Concatenation:
-      mZ.Text().CalcConcatenation(mX.Text(), mY.Text());
-      break;
     case Meaning::Lower:
       mZ.Text().CalcLowerValue(mX.Text());
       break;
@@ -44,16 +49,6 @@ bool Semantics::Compute(const Kind& kind, const Exact* inputs, Answer& result) {
       break;
     case Meaning::Successor:
       mZ.Text().CalcNextValue(mX.Text());
-      break;
-    case Meaning::Maximum:
-      mZ.Text().CalcMaxValue(mX.Text(), mY.Text());
-      break;
-    case Meaning::Minimum:
-      if (inputs[0].text->GetLengthInChar() == 0 || inputs[1].text->GetLengthInChar() == 0) {
-        mZ.Text().SetExactValue(ZORString());
-      } else {
-        mZ.Text().CalcMinValue(mX.Text(), mY.Text());
-      }
       break;
     case Meaning::Length:
       mLength.Reset();
@@ -65,6 +60,23 @@ bool Semantics::Compute(const Kind& kind, const Exact* inputs, Answer& result) {
   }
   result.text = mZ.Text().GetLowerBound();
   return !mZ.IsNil();
+}
+
+// Of two texts what a list of inputs gives from its beginning on.
+ZORString Semantics::Fold(Meaning meaning, const ZORString& x, const ZORString& y) {
+  mX.Text().SetExactValue(x);
+  mY.Text().SetExactValue(y);
+  mZ.Reset();
+  if (meaning == Meaning::Concatenation) {
+    mZ.Text().CalcConcatenation(mX.Text(), mY.Text());
+  } else if (meaning == Meaning::Maximum) {
+    mZ.Text().CalcMaxValue(mX.Text(), mY.Text());
+  } else if (x.GetLengthInChar() == 0 || y.GetLengthInChar() == 0) {
+    return {};
+  } else {
+    mZ.Text().CalcMinValue(mX.Text(), mY.Text());
+  }
+  return mZ.Text().GetLowerBound();
 }
 
 bool Semantics::ComputeTextForm(const Exact& value, Answer& result) {
@@ -84,13 +96,9 @@ bool Semantics::ComputeTextForm(const Exact& value, Answer& result) {
 // A number has one text form, whatever its sort; the module would put a set of one number in braces.
 Value& Semantics::FormOf(Sort sort) { return mForms[static_cast<std::size_t>(IsInteger(sort) ? Sort::Integer : sort)]; }
 
-bool Semantics::CanInvert(const Kind& kind, int position) {
-  return position < kind.Inputs() && kind.meaning != Meaning::Slice;
-}
-
-std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, int position, const Exact* values) {
-  const Exact& result = values[kind.Inputs()];
-  const Exact& other = values[kind.Inputs() == 2 ? 1 - position : 0];
+std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, std::size_t position,
+                                                     std::span<const Exact> values) {
+  const Exact& result = values.back();
   std::vector<Answer> proposals;
   proposals.reserve(2);
   switch (kind.meaning) {
@@ -98,8 +106,9 @@ std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, int posit
       if (*result.text == GreatestText()) return std::nullopt;  // every text that is too long gives it
       break;
     case Meaning::Minimum:
-    case Meaning::Maximum:
-      if (*result.text == *other.text) return std::nullopt;  // so does everything beyond it
+    case Meaning::Maximum:  // so does everything beyond it
+      if (values.size() > 2 && *result.text == FoldOthers(kind.meaning, values.first(values.size() - 1), position))
+        return std::nullopt;
       break;
     case Meaning::Lower:
     case Meaning::Upper:  // a folded text is its own fold, and others may fold to it
@@ -121,51 +130,44 @@ std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, int posit
   return found;
 }
 
-// Whether this input gives the result with the others.
-bool Semantics::Gives(const Kind& kind, int position, const Answer& input, const Exact* values) {
-  std::array<Exact, kMostArguments> exact{};
-  std::copy_n(values, kind.arity, exact.begin());
-  exact[static_cast<std::size_t>(position)].text = &input.text;
-  exact[static_cast<std::size_t>(position)].number = input.number;
-  return Holds(kind, exact.data());
+ZORString Semantics::FoldOthers(Meaning meaning, std::span<const Exact> inputs, std::size_t except) {
+  const std::size_t first = except == 0 ? 1 : 0;
+  ZORString folded = *inputs[first].text;
+  for (std::size_t i = first + 1; i < inputs.size(); ++i) {
+    if (i != except) folded = Fold(meaning, folded, *inputs[i].text);
+  }
+  return folded;
 }
 
-// The module's inverse, and the inputs that it misses.
-void Semantics::Propose(const Kind& kind, int position, const Exact* values, std::vector<Answer>& proposals) {
-  const Exact& result = values[kind.Inputs()];
-  const Exact& other = values[kind.Inputs() == 2 ? 1 - position : 0];
-  if (kind.meaning == Meaning::TextForm) return ProposeByTextForm(values[0], *result.text, proposals);
+// Whether this input gives the result with the others.
+bool Semantics::Gives(const Kind& kind, std::size_t position, const Answer& input, std::span<const Exact> values) {
+  mGiven.assign(values.begin(), values.end());
+  mGiven[position].text = &input.text;
+  mGiven[position].number = input.number;
+  return Holds(kind, mGiven);
+}
+
+// Inputs among which all are that give the result: of the module's inverses, and those that it misses.
+void Semantics::Propose(const Kind& kind, std::size_t position, std::span<const Exact> values,
+                        std::vector<Answer>& proposals) {
+  if (kind.meaning == Meaning::TextForm) return ProposeByTextForm(values[0], *values[1].text, proposals);
   if (kind.meaning == Meaning::Length) return proposals.push_back({});  // the one text without characters
-  const ZORString& z = *result.text;
-  mZ.Text().SetExactValue(z);
-  mX.Reset();
+  const ZORString& z = *values.back().text;
+  std::int64_t before = 0, behind = 0;
   switch (kind.meaning) {
     case Meaning::Concatenation:
-      mY.Text().SetExactValue(*other.text);
-      if (position == 0) {
-        mZ.Text().CalcFirstInverseConcatenation(mX.Text(), mY.Text());
-        Take(proposals, mX);  // the module takes the first place of the second text, which may not be the end
-        if (z.GetLengthInChar() >= other.text->GetLengthInChar()) {
-          proposals.push_back({Slice(z, 0, z.GetLengthInChar() - other.text->GetLengthInChar() - 1), 0});
-        }
-      } else {
-        mZ.Text().CalcSecondInverseConcatenation(mY.Text(), mX.Text());
-        Take(proposals, mX);
+      for (std::size_t i = 0; i + 1 < values.size(); ++i) {
+        if (i != position) (i < position ? before : behind) += values[i].text->GetLengthInChar();
       }
+      proposals.push_back({Slice(z, before, z.GetLengthInChar() - behind - 1), 0});
       break;
     case Meaning::Minimum:
-      mY.Text().SetExactValue(*other.text);
-      mZ.Text().CalcFirstInverseMinValue(mX.Text(), mY.Text());
-      Take(proposals, mX);
-      proposals.push_back({z, 0});  // the module refuses it at one space
-      break;
     case Meaning::Maximum:
-      mY.Text().SetExactValue(*other.text);
-      mZ.Text().CalcFirstInverseMaxValue(mX.Text(), mY.Text());
-      Take(proposals, mX);
       proposals.push_back({z, 0});
       break;
     case Meaning::Successor:
+      mZ.Text().SetExactValue(z);
+      mX.Reset();
       mZ.Text().CalcInverseNextValue(mX.Text());
       Take(proposals, mX);  // of 255 characters; a shorter text with a space behind it is possible too
       if (EndsWithSpace(z)) proposals.push_back({Slice(z, 0, z.GetLengthInChar() - 2), 0});
@@ -208,7 +210,7 @@ bool Semantics::Relates(Meaning meaning, const ZORString& x, const ZORString& y)
   }
 }
 
-bool Semantics::Holds(const Kind& kind, const Exact* values) {
+bool Semantics::Holds(const Kind& kind, std::span<const Exact> values) {
   if (kind.IsRelation()) {
     const Exact& x = values[kind.mirrored ? 1 : 0];
     const Exact& y = values[kind.mirrored ? 0 : 1];
@@ -216,8 +218,8 @@ bool Semantics::Holds(const Kind& kind, const Exact* values) {
     return kind.reified ? holds == (values[2].number != 0) : holds;
   }
   Answer answer;
-  if (!Compute(kind, values, answer)) return false;
-  const Exact& result = values[kind.Inputs()];
+  if (!Compute(kind, values.first(values.size() - 1), answer)) return false;
+  const Exact& result = values.back();
   return result.text != nullptr ? answer.text == *result.text : answer.number == result.number;
 }
 

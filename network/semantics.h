@@ -12,6 +12,7 @@
 #pragma once
 
 #include <optional>
+#include <span>
 #include <vector>
 
 #include "network/ZORModel.h"
@@ -39,29 +40,33 @@ class Semantics {
   explicit Semantics(const Types& types);
 
   // The value of a function; false when it has none.
-  bool Compute(const Kind& kind, const Exact* inputs, Answer& result);
+  bool Compute(const Kind& kind, std::span<const Exact> inputs, Answer& result);
 
   // All values of one input that give the result with the other inputs; nothing when they cannot be listed. Ignores
   // values[position].
-  std::optional<std::vector<Answer>> Invert(const Kind& kind, int position, const Exact* values);
+  std::optional<std::vector<Answer>> Invert(const Kind& kind, std::size_t position, std::span<const Exact> values);
 
-  // Whether Invert ever lists something at this position.
-  static bool CanInvert(const Kind& kind, int position);
+  // Whether Invert ever lists something for an input.
+  static bool CanInvert(const Kind& kind) { return kind.meaning != Meaning::Slice; }
 
   static bool Relates(Meaning meaning, const ZORString& x, const ZORString& y);
-  bool Holds(const Kind& kind, const Exact* values);
+  bool Holds(const Constraint& constraint, std::span<const Exact> values) { return Holds(*constraint.kind, values); }
+  bool Holds(const Kind& kind, std::span<const Exact> values);
 
  private:
   bool ComputeTextForm(const Exact& value, Answer& result);
+  ZORString Fold(Meaning meaning, const ZORString& x, const ZORString& y);
+  ZORString FoldOthers(Meaning meaning, std::span<const Exact> inputs, std::size_t except);
   Value& FormOf(Sort sort);
-  bool Gives(const Kind& kind, int position, const Answer& input, const Exact* values);
-  void Propose(const Kind& kind, int position, const Exact* values, std::vector<Answer>& proposals);
+  bool Gives(const Kind& kind, std::size_t position, const Answer& input, std::span<const Exact> values);
+  void Propose(const Kind& kind, std::size_t position, std::span<const Exact> values, std::vector<Answer>& proposals);
   void ProposeByTextForm(const Exact& value, const ZORString& form, std::vector<Answer>& proposals);
   void Take(std::vector<Answer>& proposals, const Value& target);
 
   Value mX, mY, mZ;           // single texts
   Value mLength;              // a single integer
   std::vector<Value> mForms;  // one of each sort, for text forms
+  std::vector<Exact> mGiven;  // what Gives looks at
 };
 
 }  // namespace zornet

@@ -59,9 +59,9 @@ void Supports::Column::Keep(std::size_t place) {
 bool Supports::Narrow(const Constraint& constraint) {
   Prepare(constraint);
   mTargets.clear();
-  for (int position = constraint.kind->Inputs(); position >= 0; --position) {
-    const bool result = position == constraint.kind->Inputs();
-    if (!result && !Semantics::CanInvert(*constraint.kind, position)) continue;
+  for (std::size_t position = constraint.arguments.size(); position-- > 0;) {
+    const bool result = position == constraint.Inputs();
+    if (!result && !Semantics::CanInvert(*constraint.kind)) continue;
     const double combinations = Combinations(constraint, position);
     if (combinations <= static_cast<double>(mBudget)) {
       mTargets.emplace_back(combinations * (result ? 1 : kInversionCost), position);
@@ -79,9 +79,11 @@ bool Supports::Narrow(const Constraint& constraint) {
 
 void Supports::Prepare(const Constraint& constraint) {
   mCount = 0;
-  mArity = constraint.kind->arity;
-  for (int position = 0; position < mArity; ++position) {
-    const auto at = static_cast<std::size_t>(position);
+  const std::size_t arity = constraint.arguments.size();
+  mColumns.resize(std::max(mColumns.size(), arity));
+  mColumnOf.resize(arity);
+  mExact.resize(arity);
+  for (std::size_t at = 0; at < arity; ++at) {
     const int variable = constraint.arguments[at];
     std::size_t column = 0;
     while (column < mCount && mColumns[column].variable != variable) ++column;
@@ -126,10 +128,10 @@ void Supports::ClampPosition(Column& column, std::int64_t last, bool openAbove) 
 }
 
 // How many combinations of the other arguments there are; infinity when one of them is not listed.
-double Supports::Combinations(const Constraint& constraint, int target) {
+double Supports::Combinations(const Constraint& constraint, std::size_t target) {
   mTried.clear();
   double combinations = 1;
-  for (int position = 0; position < constraint.kind->arity; ++position) {
+  for (std::size_t position = 0; position < constraint.arguments.size(); ++position) {
     Column& column = At(position);
     if (position == target || IsTried(column)) continue;
     if (!column.IsListed()) return std::numeric_limits<double>::infinity();
@@ -144,7 +146,7 @@ bool Supports::IsTried(const Column& column) const {
 }
 
 // False when a listed target has more supports than can be listed.
-bool Supports::Try(const Constraint& constraint, int target) {
+bool Supports::Try(const Constraint& constraint, std::size_t target) {
   const bool none = Combinations(constraint, target) == 0;
   Start();
   if (none) return true;
@@ -159,13 +161,14 @@ void Supports::Start() {
   for (std::size_t i = 0; i < mCount; ++i) mColumns[i].Start();
 }
 
-bool Supports::TryOne(const Constraint& constraint, int target) {
+bool Supports::TryOne(const Constraint& constraint, std::size_t target) {
   bool accepted = false;
-  if (target == constraint.kind->Inputs()) {
+  if (target == constraint.Inputs()) {
     Answer answer;
-    accepted = mSemantics.Compute(*constraint.kind, mExact.data(), answer) && Accept(target, std::move(answer));
+    accepted = mSemantics.Compute(*constraint.kind, std::span(mExact).first(target), answer) &&
+               Accept(target, std::move(answer));
   } else {
-    auto answers = mSemantics.Invert(*constraint.kind, target, mExact.data());
+    auto answers = mSemantics.Invert(*constraint.kind, target, mExact);
     if (!answers && At(target).IsListed()) return false;
     if (!answers) accepted = At(target).open = true;
     if (answers) {
@@ -191,9 +194,9 @@ bool Supports::Advance() {
 
 void Supports::Choose(Column& column, std::size_t index) {
   column.index = index;
-  for (int position = 0; position < mArity; ++position) {
+  for (std::size_t position = 0; position < mExact.size(); ++position) {
     if (&At(position) != &column) continue;
-    Exact& exact = mExact[static_cast<std::size_t>(position)];
+    Exact& exact = mExact[position];
     if (IsText(column.listing->sort)) {
       exact.text = &column.listing->texts[index];
     } else {
@@ -203,7 +206,7 @@ void Supports::Choose(Column& column, std::size_t index) {
 }
 
 // Whether the target can take answer; where this combination gave it a value, it must be that one.
-bool Supports::Accept(int target, Answer answer) {
+bool Supports::Accept(std::size_t target, Answer answer) {
   Column& column = At(target);
   if (!column.IsListed()) {
     column.found.push_back(std::move(answer));
@@ -225,7 +228,7 @@ bool Supports::HasAll() const {
 void Supports::Apply(const Constraint& constraint) {
   mStore.StartOperation(Operation::Supports);
   for (const bool constants : {false, true}) {
-    for (int position = constraint.kind->Inputs(); position >= 0; --position) {
+    for (std::size_t position = constraint.arguments.size(); position-- > 0;) {
       Column& column = At(position);
       if (mStore.HasFailed()) return;
       if (column.met || mStore.Declared(column.variable).constant != constants) continue;

@@ -5,7 +5,6 @@
 // for among the texts it begins with, so that what is tried is close to what is found.
 #pragma once
 
-#include <array>
 #include <utility>
 #include <vector>
 
@@ -49,13 +48,13 @@ class Supports {
   void Prepare(const Constraint& constraint);
   void ClampPositions(const Constraint& constraint);
   void ClampPosition(Column& column, std::int64_t last, bool openAbove);
-  double Combinations(const Constraint& constraint, int target);
-  bool Try(const Constraint& constraint, int target);
+  double Combinations(const Constraint& constraint, std::size_t target);
+  bool Try(const Constraint& constraint, std::size_t target);
   void Start();
-  bool TryOne(const Constraint& constraint, int target);
+  bool TryOne(const Constraint& constraint, std::size_t target);
   bool Advance();
   void Choose(Column& column, std::size_t index);
-  bool Accept(int target, Answer answer);
+  bool Accept(std::size_t target, Answer answer);
   bool HasAll() const;
 
   double DrivenCost(const Constraint& constraint);
@@ -75,20 +74,19 @@ class Supports {
   void MeetTexts(Column& column);
   void MeetNumbers(Column& column);
   void MeetFound(Column& column);
-  Column& At(int position) { return mColumns[static_cast<std::size_t>(mColumnOf[static_cast<std::size_t>(position)])]; }
+  Column& At(std::size_t position) { return mColumns[mColumnOf[position]]; }
   bool IsTried(const Column& column) const;
 
   Store& mStore;
   Semantics& mSemantics;
   std::size_t mBudget;
-  std::size_t mCount = 0;                               // of the columns in use
-  std::array<Column, kMostArguments> mColumns;          // one for each different variable
-  std::array<std::size_t, kMostArguments> mColumnOf{};  // by position
-  std::array<Exact, kMostArguments> mExact{};           // what is tried, by position
-  int mArity = 0;
-  std::size_t mTries = 0;                        // left of the budget of a driven pass
-  std::vector<Column*> mTried;                   // the columns whose combinations are tried
-  std::vector<std::pair<double, int>> mTargets;  // by their cost; the result before inputs of equal cost
+  std::size_t mCount = 0;                                // of the columns in use
+  std::vector<Column> mColumns;                          // one for each different variable
+  std::vector<std::size_t> mColumnOf;                    // by position
+  std::vector<Exact> mExact;                             // what is tried, by position
+  std::size_t mTries = 0;                                // left of the budget of a driven pass
+  std::vector<Column*> mTried;                           // the columns whose combinations are tried
+  std::vector<std::pair<double, std::size_t>> mTargets;  // by their cost; the result before inputs of equal cost
 };
 
 }  // namespace zornet

@@ -64,7 +64,7 @@ class Drawing {
 
   void DrawVariable(int variable);
   void DrawConstraint(int number);
-  void DrawEdge(const Constraint& constraint, int number, int position);
+  void DrawEdge(const Constraint& constraint, int number, std::size_t position);
   std::string_view Fill(const Domain& domain) const;
 
   const Network& mNetwork;
@@ -99,16 +99,15 @@ void Drawing::DrawConstraint(int number) {
   Add("  c{} [shape=ellipse, height=0.3, margin=\"0.05,0.02\", color=\"{}\", fontcolor=\"{}\", penwidth={}, "
       "label=\"{}\"];\n",
       number, failed ? "#b3261e" : "#3367a8", failed ? "#b3261e" : "#3367a8", failed ? 2 : 1, constraint.kind->name);
-  for (int i = 0; i < constraint.kind->arity; ++i) DrawEdge(constraint, number, i);
+  for (std::size_t i = 0; i < constraint.arguments.size(); ++i) DrawEdge(constraint, number, i);
 }
 
 // A relation has no result but its truth value: it stands between its two sides.
-void Drawing::DrawEdge(const Constraint& constraint, int number, int position) {
-  const auto at = static_cast<std::size_t>(position);
-  const int variable = constraint.arguments[at];
+void Drawing::DrawEdge(const Constraint& constraint, int number, std::size_t position) {
+  const int variable = constraint.arguments[position];
   const bool relation = constraint.kind->IsRelation();
-  const bool result = position == constraint.kind->Inputs() && (!relation || constraint.kind->reified);
-  const std::string_view role = constraint.kind->arity > 2 ? constraint.kind->roles[at] : "";
+  const bool result = position == constraint.Inputs() && (!relation || constraint.kind->reified);
+  const std::string_view role = constraint.arguments.size() > 2 ? constraint.RoleOf(position) : "";
   if (result || (relation && position == 1)) {
     Add("  c{} -> v{} [label=\"{}\"{}];\n", number, variable, role, result ? "" : ", dir=none");
   } else {

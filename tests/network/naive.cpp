@@ -180,8 +180,8 @@ zornet::Model Network::Build() const {
     model.Add(std::move(declared));
   }
   for (const Constraint& constraint : constraints) {
-    std::vector<zornet::Var> arguments;
-    for (const int argument : constraint.arguments) arguments.push_back({argument});
+    std::vector<zornet::Argument> arguments;
+    for (const int argument : constraint.arguments) arguments.emplace_back(zornet::Var{argument});
     model.Post(*zornet::FindKind(constraint.name), arguments);
   }
   return model;

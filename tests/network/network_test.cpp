@@ -37,6 +37,18 @@ TEST(Model, RefusesWhatItCannotHold) {
          m.Post("str_eq", {"a", Var{}});
        },
        "no variable of this model"},
+      {[](Model& m, Var x, Var n) {
+         m.Post("str_concat", {{x, "a", n}, x});
+       },
+       "str_concat cannot take 'n' for xs"},
+      {[](Model& m, Var x, Var) {
+         m.Post("str_concat", {std::vector<zornet::Argument>(), x});
+       },
+       "str_concat takes at least one member in xs"},
+      {[](Model& m, Var x, Var) {
+         m.Post("str_eq", {{x, "a"}, x});
+       },
+       "str_eq takes no list for x"},
   };
   for (const auto& row : rows) {
     Model model;

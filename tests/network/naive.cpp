@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <numeric>
 #include <set>
 
 namespace naive {
@@ -48,16 +49,18 @@ std::optional<Value> Compute(const Network& network, const Constraint& constrain
   };
   const std::string& name = constraint.name;
   const std::string& x = at(0).text;
+  std::vector<std::string> inputs;
+  for (std::size_t i = 0; i + 1 < constraint.arguments.size(); ++i) inputs.push_back(at(i).text);
   if (name == "str_concat") {
-    const std::string z = x + at(1).text;
+    const std::string z = std::accumulate(inputs.begin(), inputs.end(), std::string());
     return Value{z.size() > kLongest ? kGreatest : z, 0};
   }
   if (name == "str_substr") return Value{Slice(x, at(1).number, at(2).number), 0};
   if (name == "str_length") return Value{"", static_cast<std::int64_t>(x.size())};
   if (name == "str_lower") return Value{Fold(x, 'A', 'Z', 'a' - 'A'), 0};
   if (name == "str_upper") return Value{Fold(x, 'a', 'z', 'A' - 'a'), 0};
-  if (name == "str_min") return Value{std::min(x, at(1).text), 0};
-  if (name == "str_max") return Value{std::max(x, at(1).text), 0};
+  if (name == "str_min") return Value{*std::min_element(inputs.begin(), inputs.end()), 0};
+  if (name == "str_max") return Value{*std::max_element(inputs.begin(), inputs.end()), 0};
   if (name == "str_next") return Value{Next(x), 0};
   if (name == "str_text") {
     const std::string form = Form(network.variables[static_cast<std::size_t>(constraint.arguments[0])].type, at(0));
@@ -180,9 +183,13 @@ zornet::Model Network::Build() const {
     model.Add(std::move(declared));
   }
   for (const Constraint& constraint : constraints) {
-    std::vector<zornet::Argument> arguments;
-    for (const int argument : constraint.arguments) arguments.emplace_back(zornet::Var{argument});
-    model.Post(*zornet::FindKind(constraint.name), arguments);
+    std::vector<zornet::Argument> arguments, members;
+    for (const int argument : constraint.arguments) {
+      auto& list = members.size() < constraint.members ? members : arguments;
+      list.emplace_back(zornet::Var{argument});
+    }
+    if (!members.empty()) arguments.insert(arguments.begin(), members);
+    model.Post(*zornet::FindKind(constraint.name, !members.empty()), arguments);
   }
   return model;
 }
@@ -268,23 +275,27 @@ class Maker {
   void AddConstraint() {
     struct Shape {
       const char* name;
-      const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything
+      const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything; *: a list of what follows
     };
-    static constexpr Shape kShapes[] = {{"str_eq", "tt"},       {"str_ne", "tt"},       {"str_lt", "tt"},
-                                        {"str_le", "tt"},       {"str_gt", "tt"},       {"str_ge", "tt"},
-                                        {"str_eq_reif", "ttb"}, {"str_lt_reif", "ttb"}, {"str_le_reif", "ttb"},
-                                        {"str_concat", "ttt"},  {"str_concat", "ttt"},  {"str_concat", "ttt"},
-                                        {"str_substr", "tiit"}, {"str_substr", "tiit"}, {"str_length", "ti"},
-                                        {"str_lower", "tt"},    {"str_upper", "tt"},    {"str_min", "ttt"},
-                                        {"str_max", "ttt"},     {"str_next", "tt"},     {"str_text", "at"}};
+    static constexpr Shape kShapes[] = {
+        {"str_eq", "tt"},       {"str_ne", "tt"},       {"str_lt", "tt"},       {"str_le", "tt"},
+        {"str_gt", "tt"},       {"str_ge", "tt"},       {"str_eq_reif", "ttb"}, {"str_lt_reif", "ttb"},
+        {"str_le_reif", "ttb"}, {"str_concat", "ttt"},  {"str_concat", "ttt"},  {"str_concat", "ttt"},
+        {"str_substr", "tiit"}, {"str_substr", "tiit"}, {"str_length", "ti"},   {"str_lower", "tt"},
+        {"str_upper", "tt"},    {"str_min", "ttt"},     {"str_max", "ttt"},     {"str_next", "tt"},
+        {"str_text", "at"},     {"str_concat", "*tt"},  {"str_concat", "*tt"},  {"str_min", "*tt"},
+        {"str_max", "*tt"}};
     const Shape& shape = kShapes[Draw(std::size(kShapes))];
     Constraint constraint{shape.name, {}};
-    for (const char* takes = shape.takes; *takes != '\0'; ++takes) {
+    if (*shape.takes == '*') constraint.members = 1 + Draw(4);
+    const std::string takes =
+        constraint.members == 0 ? shape.takes : std::string(constraint.members, shape.takes[1]) + (shape.takes + 2);
+    for (const char wanted : takes) {
       std::vector<int> fitting;
       for (std::size_t v = 0; v < mNetwork.variables.size(); ++v) {
         const Type type = mNetwork.variables[v].type;
         const char letter = IsText(type) ? 't' : type == Type::Boolean ? 'b' : 'i';
-        if (*takes == 'a' || *takes == letter) fitting.push_back(static_cast<int>(v));
+        if (wanted == 'a' || wanted == letter) fitting.push_back(static_cast<int>(v));
       }
       if (fitting.empty()) return;
       constraint.arguments.push_back(fitting[Draw(fitting.size())]);

@@ -34,6 +34,7 @@ struct Variable {
 struct Constraint {
   std::string name;
   std::vector<int> arguments;
+  std::size_t members = 0;  // so many of the first arguments are a list
 };
 
 struct Network {

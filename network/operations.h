@@ -25,6 +25,7 @@ enum class Operation {
   Maximum,
   Successor,
   TextForm,
+  Matching,
   Supports,
   Choice,
 };
@@ -49,6 +50,7 @@ constexpr std::string_view NameOf(Operation operation) {
                                                                 "CalcMaxValue",
                                                                 "CalcNextValue",
                                                                 "CalcStringRepresentation",
+                                                                "matching",
                                                                 "supports",
                                                                 "choice"};
   return kNames[static_cast<std::size_t>(operation)];

@@ -7,9 +7,11 @@
 #include <span>
 #include <vector>
 
+#include "network/all_different.h"
 #include "network/functions.h"
 #include "network/relations.h"
 #include "network/store.h"
+#include "network/tables.h"
 
 namespace zornet {
 
@@ -41,6 +43,7 @@ class Propagation {
   void WakeReaders(int except);
   void FailOrderCycle();
   Status Narrow(int constraint);
+  Status Narrow(const Constraint& constraint);
   int Next();
 
   Store& mStore;
@@ -48,6 +51,8 @@ class Propagation {
   Limits mLimits;
   Relations mRelations;
   Functions mFunctions;
+  AllDifferent mAllDifferent;
+  Tables mTables;
   Teller mTeller;
 
   // Constraints that read a variable: mReaders[mFirstReader[v]] and those up to mFirstReader[v + 1].

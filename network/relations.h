@@ -2,16 +2,10 @@
 #pragma once
 
 #include "network/semantics.h"
+#include "network/status.h"
 #include "network/store.h"
 
 namespace zornet {
-
-// What a pass over a constraint leaves to do.
-enum class Status {
-  Subsumed,  // nothing: it holds whatever values are left
-  Fixpoint,  // nothing until another constraint changes one of its variables
-  Again,     // another pass after every change of its variables, its own changes included
-};
 
 class Relations {
  public:

@@ -62,7 +62,8 @@ struct Variable {
 };
 
 // What a constraint says: a relation between its first two arguments, whose truth a reified relation puts into its
-// third, or a function that gives its last argument.
+// third, or a function that gives its last argument. Of truth values, which are 0 and 1 where numbers are asked for,
+// unequal is "not", less or equal is "implies", the minimum is "and" and the maximum "or".
 enum class Meaning {
   Equal,
   Unequal,
@@ -77,6 +78,8 @@ enum class Meaning {
   Maximum,
   Successor,
   TextForm,
+  Sum,
+  Product,
 };
 
 // What stands at one place of a constraint. The plural is a list, as str_concat([a, "-", b], z) has one; a constraint
@@ -91,6 +94,9 @@ enum class Takes {
   Booleans,
 };
 constexpr bool IsList(Takes takes) { return takes >= Takes::Texts; }
+constexpr bool IsNumber(Takes takes) {
+  return takes != Takes::Text && takes != Takes::Texts && takes != Takes::Anything;
+}
 ZOR_EXPORT Takes MemberOf(Takes list);  // what the list holds; of another place what stands there
 
 inline constexpr int kMostArguments = 5;
@@ -106,6 +112,7 @@ struct Kind {
   std::array<std::string_view, kMostArguments> roles;
 
   constexpr bool IsRelation() const { return meaning <= Meaning::Less; }
+  constexpr bool IsOfNumbers() const { return IsNumber(takes[0]); }  // integers or truth values, no texts
   ZOR_EXPORT bool HasList() const;
 };
 

@@ -25,6 +25,9 @@ enum class Operation {
   Maximum,
   Successor,
   TextForm,
+  Sum,
+  Product,
+  Bounds,
   Supports,
   Choice,
 };
@@ -49,6 +52,9 @@ constexpr std::string_view NameOf(Operation operation) {
                                                                 "CalcMaxValue",
                                                                 "CalcNextValue",
                                                                 "CalcStringRepresentation",
+                                                                "sum",
+                                                                "product",
+                                                                "bounds",
                                                                 "supports",
                                                                 "choice"};
   return kNames[static_cast<std::size_t>(operation)];

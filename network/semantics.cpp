@@ -23,6 +23,7 @@ Semantics::Semantics(const Types& types)
 
 // Operands are Exact, the greatest text too: the module would fold a Max by its state.
 bool Semantics::Compute(const Kind& kind, std::span<const Exact> inputs, Answer& result) {
+  if (kind.IsOfNumbers()) return ComputeNumber(kind, inputs, result);
   if (kind.meaning == Meaning::TextForm) return ComputeTextForm(inputs[0], result);
   const ZORString& x = *inputs[0].text;
   switch (kind.meaning) {
@@ -98,6 +99,7 @@ Value& Semantics::FormOf(Sort sort) { return mForms[static_cast<std::size_t>(IsI
 
 std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, std::size_t position,
                                                      std::span<const Exact> values) {
+  if (kind.IsOfNumbers()) return InvertNumber(kind, position, values);
   const Exact& result = values.back();
   std::vector<Answer> proposals;
   proposals.reserve(2);
@@ -195,26 +197,12 @@ void Semantics::Take(std::vector<Answer>& proposals, const Value& target) {
   proposals.push_back(text ? Answer{target.LowestText(), 0} : Answer{ZORString(), target.LowestNumber()});
 }
 
-bool Semantics::Relates(Meaning meaning, const ZORString& x, const ZORString& y) {
-  switch (meaning) {
-    case Meaning::Equal:
-      return x == y;
-    case Meaning::Unequal:
-      return !(x == y);
-    case Meaning::LessOrEqual:
-      return x <= y;
-    case Meaning::Less:
-      return x < y;
-    default:
-      return false;
-  }
-}
-
 bool Semantics::Holds(const Kind& kind, std::span<const Exact> values) {
   if (kind.IsRelation()) {
     const Exact& x = values[kind.mirrored ? 1 : 0];
     const Exact& y = values[kind.mirrored ? 0 : 1];
-    const bool holds = Relates(kind.meaning, *x.text, *y.text);
+    const bool holds =
+        kind.IsOfNumbers() ? Relates(kind.meaning, x.number, y.number) : Relates(kind.meaning, *x.text, *y.text);
     return kind.reified ? holds == (values[2].number != 0) : holds;
   }
   Answer answer;

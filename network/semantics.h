@@ -9,6 +9,7 @@
 //                  below 0, behind the text, or behind its own end
 //   successor      of the greatest text: itself
 //   text form      of more than 255 characters: none
+//   sum, product   outside the 32-bit integers: none
 #pragma once
 
 #include <optional>
@@ -49,11 +50,15 @@ class Semantics {
   // Whether Invert ever lists something for an input.
   static bool CanInvert(const Kind& kind) { return kind.meaning != Meaning::Slice; }
 
-  static bool Relates(Meaning meaning, const ZORString& x, const ZORString& y);
+  template <class T>
+  static bool Relates(Meaning meaning, const T& x, const T& y);
   bool Holds(const Constraint& constraint, std::span<const Exact> values) { return Holds(*constraint.kind, values); }
   bool Holds(const Kind& kind, std::span<const Exact> values);
 
  private:
+  static bool ComputeNumber(const Kind& kind, std::span<const Exact> inputs, Answer& result);
+  static std::optional<std::vector<Answer>> InvertNumber(const Kind& kind, std::size_t position,
+                                                         std::span<const Exact> values);
   bool ComputeTextForm(const Exact& value, Answer& result);
   ZORString Fold(Meaning meaning, const ZORString& x, const ZORString& y);
   ZORString FoldOthers(Meaning meaning, std::span<const Exact> inputs, std::size_t except);
@@ -68,5 +73,21 @@ class Semantics {
   std::vector<Value> mForms;  // one of each sort, for text forms
   std::vector<Exact> mGiven;  // what Gives looks at
 };
+
+template <class T>
+bool Semantics::Relates(Meaning meaning, const T& x, const T& y) {
+  switch (meaning) {
+    case Meaning::Equal:
+      return x == y;
+    case Meaning::Unequal:
+      return !(x == y);
+    case Meaning::LessOrEqual:
+      return x <= y;
+    case Meaning::Less:
+      return x < y;
+    default:
+      return false;
+  }
+}
 
 }  // namespace zornet

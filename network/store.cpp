@@ -111,6 +111,19 @@ void Store::Narrow(int variable, const Value& outcome) {
   if (held.Sort() == Sort::Text && held.IsKnown() && held.LowestText() == GreatestText()) held.Text().CalcMaxValue();
 }
 
+// An unknown single number stays unknown unless one number is left.
+void Store::Bound(int number, std::int64_t lowest, std::int64_t highest) {
+  const Value& held = (*this)[number];
+  if (held.IsNil()) return;
+  lowest = std::max<std::int64_t>(lowest, held.LowestNumber());
+  highest = std::min<std::int64_t>(highest, held.HighestNumber());
+  if (lowest > highest) return Fail(number);
+  if (lowest == held.LowestNumber() && highest == held.HighestNumber()) return;
+  Value& range = Fresh(held.Sort() == Sort::Boolean ? Sort::Boolean : Sort::Interval);
+  range.SetRange(static_cast<ZORLong>(lowest), static_cast<ZORLong>(highest));
+  Meet(number, range);
+}
+
 void Store::Fail(int variable) {
   Value& nil = FreshLike(variable);
   nil.Any().SetNilValue();

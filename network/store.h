@@ -58,6 +58,7 @@ class Store {
   void StartConstraint(int constraint) { mConstraint = constraint; }
   void StartOperation(Operation operation);
   void Meet(int variable, const Value& outcome);
+  void Bound(int number, std::int64_t lowest, std::int64_t highest);  // keeps the numbers between them, both included
   void Fail(int variable);
 
   bool HasFailed() const { return mFailed != kNone; }

@@ -280,6 +280,7 @@ void Supports::MeetFound(Column& column) {
   found.erase(std::unique(found.begin(), found.end()), found.end());
   const Sort sort = mStore[column.variable].Sort();
   if (found.empty()) return mStore.Fail(column.variable);
+  if (IsInteger(sort)) return MeetFoundNumbers(column);
   if (found.size() > (sort == Sort::TextSet ? zor::kSetLimit : 1)) return;
   Value& outcome = mStore.Fresh(sort);
   if (sort == Sort::TextSet) {
@@ -287,11 +288,20 @@ void Supports::MeetFound(Column& column) {
     texts.reserve(found.size());
     for (Answer& answer : found) texts.push_back(std::move(answer.text));
     outcome.SetTexts(texts);
-  } else if (sort == Sort::Text) {
-    outcome.SetText(found.front().text);
   } else {
-    outcome.SetNumber(found.front().number);
+    outcome.SetText(found.front().text);
   }
+  mStore.Meet(column.variable, outcome);
+}
+
+// A set that cannot list them all stays unknown, as does a single that could be several.
+void Supports::MeetFoundNumbers(const Column& column) {
+  Value& outcome = mStore.FreshLike(column.variable);
+  if (outcome.Sort() == Sort::IntegerSet && column.found.size() > ZORVadEnumInteger::kListLimit) return;
+  std::vector<ZORLong> numbers;
+  numbers.reserve(column.found.size());
+  for (const Answer& answer : column.found) numbers.push_back(answer.number);
+  outcome.SetNumbers(numbers);
   mStore.Meet(column.variable, outcome);
 }
 

@@ -74,6 +74,7 @@ class Supports {
   void MeetTexts(Column& column);
   void MeetNumbers(Column& column);
   void MeetFound(Column& column);
+  void MeetFoundNumbers(const Column& column);
   Column& At(std::size_t position) { return mColumns[mColumnOf[position]]; }
   bool IsTried(const Column& column) const;
 

@@ -99,6 +99,7 @@ class Resolver {
   Diagnostics& mDiagnostics;
   ReadModel mRead;
   Model& mModel = mRead.model;
+  std::vector<Argument> mArguments;  // of the constraint that is added
   std::unordered_map<std::string_view, int> mNames;
   std::unordered_set<std::string_view> mBroken;  // of these it was told already that something is wrong
 };
@@ -190,16 +191,16 @@ bool Resolver::IsAllowed(const Variable& variable, const Word& word) const {
 void Resolver::Add(const ConstraintSyntax& syntax) {
   const Kind* kind = FindKindFor(syntax);
   if (kind == nullptr) return;
-  std::vector<Argument> variables;
+  mArguments.clear();
   bool good = true;
   const std::span<const Word> arguments = mSyntax.ArgumentsOf(syntax);
   for (std::size_t i = 0; i < arguments.size(); ++i) {
     const int variable = AddArgument(arguments[i], kind->takes[i], kind->name, kind->roles[i]);
-    variables.emplace_back(Var{variable});
+    mArguments.emplace_back(Var{variable});
     good = good && variable != kUnknown;
   }
   if (!good) return;
-  mModel.Post(*kind, variables);
+  mModel.Post(*kind, mArguments);
   mRead.places.constraints.push_back(syntax.extent);
 }
 

@@ -81,11 +81,11 @@ Var Model::Boolean(std::string name) { return Add({std::move(name), Sort::Boolea
 Var Model::Boolean(std::string name, bool truth) { return Add({std::move(name), Sort::Boolean, {}, {truth ? 1 : 0}}); }
 
 Var Model::AddConstant(const Argument& value) {
+  if (const auto* variable = std::get_if<Var>(&value.mValue)) return *variable;
   if (const auto* text = std::get_if<std::string>(&value.mValue)) return Add({"", Sort::Text, {*text}, {}, true});
   if (const auto* number = std::get_if<std::int32_t>(&value.mValue))
     return Add({"", Sort::Integer, {}, {*number}, true});
-  if (const auto* truth = std::get_if<bool>(&value.mValue)) return Add({"", Sort::Boolean, {}, {*truth ? 1 : 0}, true});
-  return std::get<Var>(value.mValue);
+  return Add({"", Sort::Boolean, {}, {std::get<bool>(value.mValue) ? 1 : 0}, true});
 }
 
 int Model::Post(std::string_view name, std::initializer_list<Argument> arguments) {

@@ -33,8 +33,8 @@ bool Semantics::Compute(const Kind& kind, std::span<const Exact> inputs, Answer&
     case Meaning::Concatenation:
     case Meaning::Minimum:
     case Meaning::Maximum:
-      result.text = x;
-      for (const Exact& input : inputs.subspan(1)) result.text = Fold(kind.meaning, result.text, *input.text);
+      result.text = inputs.size() == 1 ? x : Fold(kind.meaning, x, *inputs[1].text);
+      for (std::size_t i = 2; i < inputs.size(); ++i) result.text = Fold(kind.meaning, result.text, *inputs[i].text);
       return true;
     default:
       break;

@@ -41,12 +41,38 @@ std::string Form(Type type, const Value& value) {
   return '"' + value.text + '"';
 }
 
+struct NumberFunction {
+  const char* name;
+  std::int64_t (*fold)(std::int64_t x, std::int64_t y);
+};
+
+const NumberFunction* FindNumberFunction(const std::string& name) {
+  static constexpr auto sum = [](std::int64_t x, std::int64_t y) { return x + y; };
+  static constexpr auto least = [](std::int64_t x, std::int64_t y) { return x < y ? x : y; };
+  static constexpr auto greatest = [](std::int64_t x, std::int64_t y) { return x < y ? y : x; };
+  static constexpr auto both = [](std::int64_t x, std::int64_t y) { return x * y; };
+  static constexpr auto either = [](std::int64_t x, std::int64_t y) { return x + y - x * y; };
+  static const NumberFunction kFunctions[] = {
+      {"int_plus", sum},     {"int_times", both},       {"int_min", least},
+      {"int_max", greatest}, {"bool_and", both},        {"array_bool_and", both},
+      {"bool_or", either},   {"array_bool_or", either}, {"int_sum", sum}};
+  const auto* found = std::find_if(std::begin(kFunctions), std::end(kFunctions),
+                                   [&](const NumberFunction& function) { return function.name == name; });
+  return found != std::end(kFunctions) ? found : nullptr;
+}
+
 // The value of a function; nothing when it has none, or when the constraint is a relation.
 std::optional<Value> Compute(const Network& network, const Constraint& constraint, const Assignment& values) {
   const auto at = [&](std::size_t i) -> const Value& {
     return values[static_cast<std::size_t>(constraint.arguments[i])];
   };
   const std::string& name = constraint.name;
+  if (const NumberFunction* function = FindNumberFunction(name)) {
+    std::int64_t number = at(0).number;
+    for (std::size_t i = 1; i + 1 < constraint.arguments.size(); ++i) number = function->fold(number, at(i).number);
+    if (number != static_cast<std::int32_t>(number)) return std::nullopt;
+    return Value{"", number};
+  }
   const std::string& x = at(0).text;
   if (name == "str_concat") {
     const std::string z = x + at(1).text;
@@ -69,15 +95,16 @@ std::optional<Value> Compute(const Network& network, const Constraint& constrain
 bool IsFunction(const Constraint& constraint) {
   static const std::set<std::string> functions = {"str_concat", "str_substr", "str_length", "str_lower", "str_upper",
                                                   "str_min",    "str_max",    "str_next",   "str_text"};
-  return functions.contains(constraint.name);
+  return functions.contains(constraint.name) || FindNumberFunction(constraint.name) != nullptr;
 }
 
-bool Compare(const std::string& relation, const std::string& x, const std::string& y) {
-  if (relation == "str_eq") return x == y;
-  if (relation == "str_ne") return x != y;
-  if (relation == "str_lt") return x < y;
-  if (relation == "str_le") return x <= y;
-  if (relation == "str_gt") return x > y;
+// A relation by its name behind the type.
+bool Compare(const std::string& relation, const Value& x, const Value& y) {
+  if (relation == "eq" || relation == "bool2int") return x == y;
+  if (relation == "ne" || relation == "not" || relation == "xor") return x != y;
+  if (relation == "lt") return x < y;
+  if (relation == "le" || relation == "imply") return x <= y;
+  if (relation == "gt") return x > y;
   return x >= y;
 }
 
@@ -157,10 +184,10 @@ bool Holds(const Network& network, const Constraint& constraint, const Assignmen
     const auto image = Compute(network, constraint, values);
     return image && *image == values[static_cast<std::size_t>(constraint.arguments.back())];
   }
-  const std::string reified = "_reif";
-  if (!constraint.name.ends_with(reified)) return Compare(constraint.name, at(0).text, at(1).text);
-  const std::string relation = constraint.name.substr(0, constraint.name.size() - reified.size());
-  return Compare(relation, at(0).text, at(1).text) == (at(2).number != 0);
+  std::string relation = constraint.name.substr(constraint.name.find('_') + 1);
+  relation = relation.substr(0, relation.find("_reif"));
+  const bool holds = Compare(relation, at(0), at(1));
+  return constraint.arguments.size() == 2 ? holds : holds == (at(2).number != 0);
 }
 
 void Solve(const Network& network, const std::vector<std::string>& universe,
@@ -180,9 +207,12 @@ zornet::Model Network::Build() const {
     model.Add(std::move(declared));
   }
   for (const Constraint& constraint : constraints) {
-    std::vector<zornet::Argument> arguments;
-    for (const int argument : constraint.arguments) arguments.emplace_back(zornet::Var{argument});
-    model.Post(*zornet::FindKind(constraint.name), arguments);
+    std::vector<zornet::Argument> list, arguments;
+    for (const int argument : constraint.arguments)
+      (list.size() < constraint.listed ? list : arguments).emplace_back(zornet::Var{argument});
+    const bool hasList = !list.empty();
+    if (hasList) arguments.emplace(arguments.begin(), std::move(list));
+    model.Post(*zornet::FindKind(constraint.name, hasList), arguments);
   }
   return model;
 }
@@ -195,7 +225,10 @@ class Maker {
 
   Network Make() {
     MakeUniverse();
-    const std::size_t texts = 2 + Draw(3), numbers = Draw(3), truths = Draw(2);
+    const bool isOfNumbers = Draw(2) != 0;
+    const std::size_t texts = isOfNumbers ? Draw(2) : 2 + Draw(3);
+    const std::size_t numbers = isOfNumbers ? 1 + Draw(4) : Draw(3);
+    const std::size_t truths = isOfNumbers ? 1 + Draw(4) : Draw(2);
     for (std::size_t i = 0; i < texts; ++i) AddText();
     for (std::size_t i = 0; i < numbers; ++i) AddNumber();
     for (std::size_t i = 0; i < truths; ++i) mNetwork.variables.push_back({Type::Boolean, MaybeTruth()});
@@ -268,26 +301,37 @@ class Maker {
   void AddConstraint() {
     struct Shape {
       const char* name;
-      const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything
+      const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything; T, I, B: a list of them
     };
-    static constexpr Shape kShapes[] = {{"str_eq", "tt"},       {"str_ne", "tt"},       {"str_lt", "tt"},
-                                        {"str_le", "tt"},       {"str_gt", "tt"},       {"str_ge", "tt"},
-                                        {"str_eq_reif", "ttb"}, {"str_lt_reif", "ttb"}, {"str_le_reif", "ttb"},
-                                        {"str_concat", "ttt"},  {"str_concat", "ttt"},  {"str_concat", "ttt"},
-                                        {"str_substr", "tiit"}, {"str_substr", "tiit"}, {"str_length", "ti"},
-                                        {"str_lower", "tt"},    {"str_upper", "tt"},    {"str_min", "ttt"},
-                                        {"str_max", "ttt"},     {"str_next", "tt"},     {"str_text", "at"}};
+    static constexpr Shape kShapes[] = {
+        {"str_eq", "tt"},        {"str_ne", "tt"},       {"str_lt", "tt"},         {"str_le", "tt"},
+        {"str_gt", "tt"},        {"str_ge", "tt"},       {"str_eq_reif", "ttb"},   {"str_lt_reif", "ttb"},
+        {"str_le_reif", "ttb"},  {"str_concat", "ttt"},  {"str_concat", "ttt"},    {"str_concat", "ttt"},
+        {"str_substr", "tiit"},  {"str_substr", "tiit"}, {"str_length", "ti"},     {"str_lower", "tt"},
+        {"str_upper", "tt"},     {"str_min", "ttt"},     {"str_max", "ttt"},       {"str_next", "tt"},
+        {"str_text", "at"},      {"int_eq", "ii"},       {"int_ne", "ii"},         {"int_lt", "ii"},
+        {"int_le", "ii"},        {"int_eq_reif", "iib"}, {"int_ne_reif", "iib"},   {"int_lt_reif", "iib"},
+        {"int_le_reif", "iib"},  {"int_plus", "iii"},    {"int_plus", "iii"},      {"int_times", "iii"},
+        {"int_times", "iii"},    {"int_min", "iii"},     {"int_max", "iii"},       {"int_min", "Ii"},
+        {"int_max", "Ii"},       {"int_sum", "Ii"},      {"int_sum", "Ii"},        {"bool_eq", "bb"},
+        {"bool_not", "bb"},      {"bool_lt", "bb"},      {"bool_le", "bb"},        {"bool_imply", "bb"},
+        {"bool_eq_reif", "bbb"}, {"bool_xor", "bbb"},    {"bool_lt_reif", "bbb"},  {"bool_le_reif", "bbb"},
+        {"bool_and", "bbb"},     {"bool_or", "bbb"},     {"array_bool_and", "Bb"}, {"array_bool_or", "Bb"},
+        {"bool2int", "bi"}};
     const Shape& shape = kShapes[Draw(std::size(kShapes))];
-    Constraint constraint{shape.name, {}};
+    Constraint constraint{shape.name, {}, 0};
     for (const char* takes = shape.takes; *takes != '\0'; ++takes) {
       std::vector<int> fitting;
       for (std::size_t v = 0; v < mNetwork.variables.size(); ++v) {
         const Type type = mNetwork.variables[v].type;
         const char letter = IsText(type) ? 't' : type == Type::Boolean ? 'b' : 'i';
-        if (*takes == 'a' || *takes == letter) fitting.push_back(static_cast<int>(v));
+        if (*takes == 'a' || (*takes | 0x20) == letter) fitting.push_back(static_cast<int>(v));
       }
       if (fitting.empty()) return;
-      constraint.arguments.push_back(fitting[Draw(fitting.size())]);
+      const bool list = *takes < 'a';
+      for (std::size_t members = list ? 1 + Draw(3) : 1; members != 0; --members)
+        constraint.arguments.push_back(fitting[Draw(fitting.size())]);
+      if (list) constraint.listed = constraint.arguments.size();
     }
     mNetwork.constraints.push_back(std::move(constraint));
   }

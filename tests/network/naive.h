@@ -34,6 +34,7 @@ struct Variable {
 struct Constraint {
   std::string name;
   std::vector<int> arguments;
+  std::size_t listed = 0;  // so many of them, from the first on, are a list
 };
 
 struct Network {

@@ -203,7 +203,8 @@ zornet::Model Network::Build() const {
       if (IsText(variable.type)) declared.texts.push_back(value.text);
       if (!IsText(variable.type)) declared.numbers.push_back(static_cast<std::int32_t>(value.number));
     }
-    if (variable.type == Type::Interval) declared.numbers = {declared.numbers.front(), declared.numbers.back()};
+    if (!declared.numbers.empty() && variable.type == Type::Interval)
+      declared.numbers = {declared.numbers.front(), declared.numbers.back()};
     model.Add(std::move(declared));
   }
   for (const Constraint& constraint : constraints) {
@@ -279,6 +280,7 @@ class Maker {
     const std::int64_t from = end == 0 ? least : end == 1 ? greatest - 5 : static_cast<std::int64_t>(Draw(5)) - 2;
     Variable variable{Type::Integer, {}};
     const std::size_t kind = Draw(4);
+    if (kind == 0 && Draw(3) == 0) variable.type = Draw(2) == 0 ? Type::Interval : Type::IntegerSet;
     if (kind == 1) variable.domain = {{"", from}};
     if (kind == 2) {
       variable.type = Type::Interval;

@@ -36,14 +36,11 @@ bool Arithmetic::NeedsSupports(const Constraint& constraint) const {
   const auto arguments = constraint.arguments;
   const auto hasHoles = [this](int variable) {
     const Value& value = mStore[variable];
-    return value.Sort() == Sort::IntegerSet && value.IsKnown() && !value.IsOne();
+    return mStore.HasCandidates(variable) || (value.Sort() == Sort::IntegerSet && value.IsKnown() && !value.IsOne());
   };
-  if (arguments.size() == 3 &&
-      (arguments[0] == arguments[1] || arguments[0] == arguments[2] || arguments[1] == arguments[2]))
-    return true;
-  const bool isExact =
-      arguments.size() == 3 && constraint.kind->meaning != Meaning::Sum && constraint.kind->meaning != Meaning::Product;
-  return !isExact && std::any_of(arguments.begin(), arguments.end(), hasHoles);
+  if (std::any_of(arguments.begin(), arguments.end(), hasHoles)) return true;
+  return arguments.size() == 3 &&
+         (arguments[0] == arguments[1] || arguments[0] == arguments[2] || arguments[1] == arguments[2]);
 }
 
 // Each term is what the others leave to nought.
@@ -118,30 +115,8 @@ Arithmetic::Range Arithmetic::Divide(Range z, Range y) {
   return x;
 }
 
+// The greatest is the least of the opposites. Where one input alone can be the extreme, it is.
 void Arithmetic::Extreme(const Constraint& constraint) {
-  if (constraint.Inputs() != 2) return ExtremeOfList(constraint);
-  const int x = constraint.arguments[0], y = constraint.arguments[1], z = constraint.Result();
-  const ZORVaDoAny &first = mStore[x].Any(), &second = mStore[y].Any(), &extreme = mStore[z].Any();
-  const bool least = constraint.kind->meaning == Meaning::Minimum;
-  const auto narrow = [&](int target, auto operation) {
-    if (mStore.HasFailed()) return;
-    Value& outcome = mStore.CopyOf(target);
-    mStore.StartOperation(least ? Operation::Minimum : Operation::Maximum);
-    operation(outcome.Any());
-    mStore.Meet(target, outcome);
-  };
-  const auto invert = [&](int target, const ZORVaDoAny& other) {
-    narrow(target, [&](ZORVaDoAny& value) {
-      least ? extreme.CalcFirstInverseMinValue(value, other) : extreme.CalcFirstInverseMaxValue(value, other);
-    });
-  };
-  narrow(z, [&](ZORVaDoAny& value) { least ? value.CalcMinValue(first, second) : value.CalcMaxValue(first, second); });
-  invert(x, second);
-  invert(y, first);
-}
-
-// The greatest of a list is the least of the opposites. Where one input alone can be the extreme, it is.
-void Arithmetic::ExtremeOfList(const Constraint& constraint) {
   const bool opposite = constraint.kind->meaning == Meaning::Maximum;
   const auto turned = [&](Range range) { return opposite ? Range{-range.highest, -range.lowest} : range; };
   const auto inputs = constraint.arguments.first(constraint.Inputs());
@@ -175,11 +150,11 @@ bool Arithmetic::IsDecided(const Constraint& constraint) const {
   if (meaning == Meaning::Product && number != 0) return false;
   const auto inputs = constraint.arguments.first(constraint.Inputs());
   const bool isThere = std::any_of(inputs.begin(), inputs.end(), [&](int input) {
-    return mStore[input].IsOne() && mStore[input].LowestNumber() == number;
+    return mStore[input].IsOne() && mStore.LowestNumber(input) == number;
   });
   return isThere && std::all_of(inputs.begin(), inputs.end(), [&](int input) {
-           if (meaning == Meaning::Minimum) return mStore[input].LowestNumber() >= number;
-           return meaning == Meaning::Product || mStore[input].HighestNumber() <= number;
+           if (meaning == Meaning::Minimum) return mStore.LowestNumber(input) >= number;
+           return meaning == Meaning::Product || mStore.HighestNumber(input) <= number;
          });
 }
 

@@ -38,10 +38,9 @@ class Arithmetic {
   static Range Multiply(Range x, Range y);
   static Range Divide(Range z, Range y);
   void Extreme(const Constraint& constraint);
-  void ExtremeOfList(const Constraint& constraint);
   bool IsDecided(const Constraint& constraint) const;
 
-  Range RangeOf(int variable) const { return {mStore[variable].LowestNumber(), mStore[variable].HighestNumber()}; }
+  Range RangeOf(int variable) const { return {mStore.LowestNumber(variable), mStore.HighestNumber(variable)}; }
   void Bound(int variable, Range range) { mStore.Bound(variable, range.lowest, range.highest); }
 
   Store& mStore;

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <utility>
 
 namespace zornet {
 
@@ -32,6 +33,11 @@ Operation ForwardOf(Meaning meaning) {
     default:
       return Operation::TextForm;
   }
+}
+
+// Whether it takes any number of inputs.
+bool IsFold(Meaning meaning) {
+  return meaning == Meaning::Concatenation || meaning == Meaning::Minimum || meaning == Meaning::Maximum;
 }
 
 constexpr std::int64_t kLastPosition = zor::kLengthLimit - 1;  // of a character in any text
@@ -82,7 +88,7 @@ Status Functions::Narrow(const Constraint& constraint) {
     MeetResult(constraint, {GreatestText(), 0});  // the greatest text is its own successor
     return Status::Subsumed;
   }
-  if (mStore[constraint.Result()].IsUndefined() && ComputeSets(constraint)) return Status::Fixpoint;
+  if (!mStore.List(constraint.Result()).known && ComputeSets(constraint)) return Status::Fixpoint;
   if (mSupports.Narrow(constraint)) return Status::Fixpoint;
   if (constraint.kind->meaning == Meaning::Slice && BoundSlice(constraint)) return Status::Subsumed;
   if (mStore.HasFailed()) return Status::Fixpoint;
@@ -114,7 +120,9 @@ void Functions::ComputeExact(const Constraint& constraint) {
       mExact[i] = {nullptr, value.LowestNumber(), value.Sort()};
     }
   }
-  mStore.StartOperation(ForwardOf(constraint.kind->meaning));
+  const bool isExtreme = constraint.kind->IsOfNumbers() && constraint.kind->meaning != Meaning::Sum &&
+                         constraint.kind->meaning != Meaning::Product;
+  mStore.StartOperation(isExtreme ? Operation::Bounds : ForwardOf(constraint.kind->meaning));
   Answer answer;
   if (!mSemantics.Compute(*constraint.kind, mExact, answer)) return mStore.Fail(constraint.Result());
   MeetResult(constraint, answer);
@@ -132,36 +140,52 @@ void Functions::MeetResult(const Constraint& constraint, const Answer& answer) {
 
 // False when the module has no such operation on sets, or when it would lose results.
 bool Functions::ComputeSets(const Constraint& constraint) {
-  const Kind& kind = *constraint.kind;
-  if (kind.meaning == Meaning::Slice || kind.meaning == Meaning::TextForm) return false;
-  if (constraint.Inputs() > 2) return false;
-  const bool binary = constraint.Inputs() == 2;
-  const int first = constraint.arguments[0], second = constraint.arguments[1];
-  if (binary && first == second) return false;  // the module would pair different texts too
-  if (!mStore[first].IsKnown() || (binary && !mStore[second].IsKnown())) return false;
-  const Value& x = AsSet(first, mX);
-  if (kind.meaning == Meaning::Length) {
+  const Meaning meaning = constraint.kind->meaning;
+  if (meaning == Meaning::Slice || meaning == Meaning::TextForm || !HasKnownInputs(constraint)) return false;
+  const Value& first = AsSet(constraint.arguments[0], mX);
+  if (meaning == Meaning::Length) {
     Value& lengths = mStore.FreshLike(constraint.Result());
     mStore.StartOperation(Operation::Length);
-    x.Text().CalcLength(lengths.Integer());
+    first.Text().CalcLength(lengths.Integer());
     mStore.Meet(constraint.Result(), lengths);
     return true;
   }
-  const Value& y = binary ? AsSet(second, mY) : x;
-  mZ.Reset();
-  if (!CallSets(constraint, x, y, mZ)) return false;
+  if (!(IsFold(meaning) ? FoldSets(constraint, first) : CallSets(meaning, first, first, mZ))) return false;
   if (mZ.IsUndefined()) return false;  // more texts than an operation on sets lists
   MeetSet(constraint.Result(), mZ);
   return true;
 }
 
-bool Functions::CallSets(const Constraint& constraint, const Value& x, const Value& y, Value& result) {
+// Whether all are known and, since the module would pair different texts of one input too, none stands twice.
+bool Functions::HasKnownInputs(const Constraint& constraint) {
+  const auto inputs = constraint.arguments.first(constraint.Inputs());
+  if (!std::all_of(inputs.begin(), inputs.end(), [this](int input) { return mStore[input].IsKnown(); })) return false;
+  mInputs.assign(inputs.begin(), inputs.end());
+  std::sort(mInputs.begin(), mInputs.end());
+  return std::adjacent_find(mInputs.begin(), mInputs.end()) == mInputs.end();
+}
+
+// The sets of all inputs, one after another.
+bool Functions::FoldSets(const Constraint& constraint, const Value& first) {
   const Meaning meaning = constraint.kind->meaning;
   if (meaning == Meaning::Concatenation && MayOverflow(constraint)) return false;
+  if (constraint.Inputs() == 1) mZ.Any().Assign(first.Any());
+  const Value* folded = &first;
+  for (const int input : constraint.arguments.first(constraint.Inputs()).subspan(1)) {
+    if (!CallSets(meaning, *folded, AsSet(input, mY), mZ)) return false;
+    if (mZ.IsUndefined() || input == constraint.arguments[constraint.Inputs() - 1]) return true;
+    std::swap(mX, mZ);
+    folded = &mX;
+  }
+  return true;
+}
+
+bool Functions::CallSets(Meaning meaning, const Value& x, const Value& y, Value& result) {
   // The module takes one space for the lower bound of a set that lists "" alone, and would put it into the result.
   const bool leastBound = x.LowestText().GetLengthInChar() == 0 && y.LowestText().GetLengthInChar() == 0;
   if (meaning == Meaning::Maximum && leastBound) return false;
   mStore.StartOperation(ForwardOf(meaning));
+  result.Reset();
   ZORVaDoString& z = result.Text();
   switch (meaning) {
     case Meaning::Concatenation:
@@ -188,8 +212,9 @@ bool Functions::CallSets(const Constraint& constraint, const Value& x, const Val
 
 // The module lists concatenations of any length in sets; here those above the limit are the greatest text.
 bool Functions::MayOverflow(const Constraint& constraint) {
-  const std::size_t longest = LongestOf(mStore.List(constraint.arguments[0]));
-  return longest + LongestOf(mStore.List(constraint.arguments[1])) > kTextLimit;
+  std::size_t longest = 0;
+  for (const int input : constraint.arguments.first(constraint.Inputs())) longest += LongestOf(mStore.List(input));
+  return longest > kTextLimit;
 }
 
 const Value& Functions::AsSet(int variable, Value& set) {

@@ -22,7 +22,9 @@ class Functions {
   void MeetResult(const Constraint& constraint, const Answer& answer);
 
   bool ComputeSets(const Constraint& constraint);
-  bool CallSets(const Constraint& constraint, const Value& x, const Value& y, Value& result);
+  bool HasKnownInputs(const Constraint& constraint);
+  bool FoldSets(const Constraint& constraint, const Value& first);
+  bool CallSets(Meaning meaning, const Value& x, const Value& y, Value& result);
   bool MayOverflow(const Constraint& constraint);
   const Value& AsSet(int variable, Value& set);
   void MeetSet(int variable, const Value& set);
@@ -37,6 +39,7 @@ class Functions {
   Arithmetic mArithmetic;
   Value mX, mY, mZ;           // sets
   std::vector<Exact> mExact;  // inputs
+  std::vector<int> mInputs;
   std::vector<ZORString> mTexts;
 };
 

@@ -2,6 +2,9 @@
 
 #include <limits>
 #include <utility>
+#include <vector>
+
+#include "network/semantics.h"
 
 namespace zornet {
 
@@ -23,13 +26,13 @@ Status NumberRelations::Equal(int x, int y) {
 }
 
 void NumberRelations::Equate(int target, int other) {
-  if (IsInteger(mStore[target].Sort()) == IsInteger(mStore[other].Sort())) {
-    mStore.StartOperation(Operation::Equal);
-    mStore.Meet(target, mStore[other]);
-  } else {
+  if (IsInteger(mStore[target].Sort()) != IsInteger(mStore[other].Sort())) {
     mStore.StartOperation(Operation::Bounds);
-    mStore.Bound(target, mStore[other].LowestNumber(), mStore[other].HighestNumber());
+    return mStore.Bound(target, mStore.LowestNumber(other), mStore.HighestNumber(other));
   }
+  mStore.StartOperation(Operation::Equal);
+  if (mStore.HasCandidates(other)) return mStore.MeetNumbers(target, mStore.List(other).numbers);
+  mStore.Meet(target, mStore[other]);
 }
 
 Status NumberRelations::Unequal(int x, int y) {
@@ -39,32 +42,40 @@ Status NumberRelations::Unequal(int x, int y) {
 }
 
 void NumberRelations::Remove(int target, int other) {
-  Value& outcome = mStore.CopyOf(target);
   mStore.StartOperation(Operation::Unequal);
+  if (mStore.HasCandidates(target)) {
+    std::vector<ZORLong> numbers = mStore.List(target).numbers;
+    std::erase(numbers, mStore[other].LowestNumber());
+    return mStore.MeetNumbers(target, std::move(numbers));
+  }
+  Value& outcome = mStore.CopyOf(target);
   outcome.Any().CalcUnequalValue(mStore[other].Any());
   mStore.Meet(target, outcome);
 }
 
 // x + distance <= y
 Status NumberRelations::Ordered(int x, int y, std::int64_t distance) {
-  if (mStore[x].HighestNumber() + distance <= mStore[y].LowestNumber()) return Status::Subsumed;
+  if (mStore.HighestNumber(x) + distance <= mStore.LowestNumber(y)) return Status::Subsumed;
   mStore.StartOperation(Operation::Bounds);
-  mStore.Bound(x, std::numeric_limits<ZORLong>::min(), mStore[y].HighestNumber() - distance);
-  if (!mStore.HasFailed()) mStore.Bound(y, mStore[x].LowestNumber() + distance, std::numeric_limits<ZORLong>::max());
+  mStore.Bound(x, std::numeric_limits<ZORLong>::min(), mStore.HighestNumber(y) - distance);
+  if (!mStore.HasFailed()) mStore.Bound(y, mStore.LowestNumber(x) + distance, std::numeric_limits<ZORLong>::max());
   return Status::Fixpoint;
 }
 
-// x < y is not y <= x. The other relations are asked, or asked for their opposites.
 bool NumberRelations::Ask(Meaning meaning, int x, int y, Value& answer) {
-  if (meaning == Meaning::Less) std::swap(x, y);
-  const bool isEquality = meaning == Meaning::Equal || meaning == Meaning::Unequal;
-  mStore.StartOperation(isEquality ? Operation::IsEqual : Operation::IsLessOrEqual);
-  const ZORVaDoAny &left = mStore[x].Any(), &right = mStore[y].Any();
-  isEquality ? left.CalcIsEqual(right, answer.Boolean()) : left.CalcIsLessOrEqual(right, answer.Boolean());
-  if (!answer.IsOne()) return false;
-  const bool isOpposite = meaning == Meaning::Unequal || meaning == Meaning::Less;
-  if (isOpposite) answer.SetNumber(1 - answer.LowestNumber());
-  return true;
+  if (meaning == Meaning::Equal || meaning == Meaning::Unequal) {
+    mStore.StartOperation(Operation::IsEqual);
+    mStore[x].Any().CalcIsEqual(mStore[y].Any(), answer.Boolean());
+    if (answer.IsOne() && meaning == Meaning::Unequal) answer.SetNumber(1 - answer.LowestNumber());
+  } else {
+    mStore.StartOperation(Operation::Bounds);
+    if (Semantics::Relates(meaning, mStore.HighestNumber(x), mStore.LowestNumber(y))) {
+      answer.SetNumber(1);
+    } else if (!Semantics::Relates(meaning, mStore.LowestNumber(x), mStore.HighestNumber(y))) {
+      answer.SetNumber(0);
+    }
+  }
+  return answer.IsOne();
 }
 
 }  // namespace zornet

@@ -1,6 +1,8 @@
 #include "network/semantics.h"
 
 #include <algorithm>
+#include <limits>
+#include <string>
 
 namespace zornet {
 
@@ -10,6 +12,35 @@ ZORString Slice(const ZORString& text, std::int64_t from, std::int64_t to) {
   const std::int64_t last = std::min<std::int64_t>(to, text.GetLengthInChar() - 1);
   if (from < 0 || from > last) return {};
   return text.SubString(static_cast<std::size_t>(from), static_cast<std::size_t>(last - from + 1));
+}
+
+std::vector<Answer> WithCharacterBefore(const ZORString& text) {
+  std::vector<Answer> found;
+  for (char c = zor::kLeastCharacter; c <= zor::kGreatestCharacter; ++c)
+    found.push_back({ToZor(c + std::string(ToView(text))), 0});
+  return found;
+}
+
+bool IsLetter(char c) { return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z'); }
+
+// The text with each of its letters in both cases.
+std::optional<std::vector<Answer>> CaseVariants(const ZORString& text) {
+  const std::string_view view = ToView(text);
+  const auto letters = static_cast<std::size_t>(std::count_if(view.begin(), view.end(), IsLetter));
+  if (letters >= std::numeric_limits<std::size_t>::digits || std::size_t{1} << letters > zor::kSetLimit)
+    return std::nullopt;
+  std::vector<std::string> variants{std::string(view)};
+  for (std::size_t i = 0; i < view.size(); ++i) {
+    if (!IsLetter(view[i])) continue;
+    const std::size_t count = variants.size();
+    for (std::size_t v = 0; v < count; ++v) {
+      variants.push_back(variants[v]);
+      variants.back()[i] = static_cast<char>(view[i] ^ ('a' ^ 'A'));
+    }
+  }
+  std::vector<Answer> found;
+  for (const std::string& variant : variants) found.push_back({ToZor(variant), 0});
+  return found;
 }
 
 bool EndsWithSpace(const ZORString& text) { return ToView(text).ends_with(' '); }
@@ -107,18 +138,24 @@ std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, std::size
     case Meaning::Concatenation:
       if (*result.text == GreatestText()) return std::nullopt;  // every text that is too long gives it
       break;
-    case Meaning::Minimum:
-    case Meaning::Maximum:  // so does everything beyond it
+    case Meaning::Minimum:  // beside the same text stands everything beyond it
       if (values.size() > 2 && *result.text == FoldOthers(kind.meaning, values.first(values.size() - 1), position))
-        return std::nullopt;
+        return Between(*result.text, GreatestText());
+      break;
+    case Meaning::Maximum:
+      if (values.size() > 2 && *result.text == FoldOthers(kind.meaning, values.first(values.size() - 1), position))
+        return Between(ZORString(), *result.text);
       break;
     case Meaning::Lower:
-    case Meaning::Upper:  // a folded text is its own fold, and others may fold to it
-      if (Gives(kind, position, {*result.text, 0}, values)) return std::nullopt;
-      return proposals;
+    case Meaning::Upper:  // a folded text is its own fold, and others fold to it
+      if (!Gives(kind, position, {*result.text, 0}, values)) return proposals;
+      return CaseVariants(*result.text);
     case Meaning::Length:
-      if (result.number > 0 && result.number <= static_cast<ZORLong>(kTextLimit)) return std::nullopt;
+      if (result.number == 1) return WithCharacterBefore(ZORString());
+      if (result.number > 1 && result.number <= static_cast<ZORLong>(kTextLimit)) return std::nullopt;
       break;
+    case Meaning::Slice:
+      return InvertSlice(values);
     default:
       break;
   }
@@ -129,6 +166,37 @@ std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, std::size
     const bool again = std::find(found.begin(), found.end(), proposal) != found.end();
     if (!again && Gives(kind, position, proposal, values)) found.push_back(std::move(proposal));
   }
+  return found;
+}
+
+// The texts from one to another, both included.
+std::optional<std::vector<Answer>> Semantics::Between(const ZORString& lowest, const ZORString& highest) {
+  constexpr int kFewBehind = static_cast<int>(kTextLimit) - 2;  // behind a shorter text there are more than a set lists
+  const bool spaces = ToView(highest).find_first_not_of(' ') == std::string_view::npos;
+  if (!spaces && lowest.GetLengthInChar() <= kFewBehind) return std::nullopt;
+  std::vector<Answer> found{{lowest, 0}};
+  while (!(found.back().text == highest)) {
+    if (found.size() == zor::kSetLimit) return std::nullopt;
+    mX.Text().SetExactValue(found.back().text);
+    mZ.Reset();
+    mZ.Text().CalcNextValue(mX.Text());
+    found.push_back({mZ.Text().GetLowerBound(), 0});
+  }
+  return found;
+}
+
+// Where the slice ends before it should, it is the end of the text.
+std::optional<std::vector<Answer>> Semantics::InvertSlice(std::span<const Exact> values) {
+  const ZORString& slice = *values[3].text;
+  const std::int64_t from = values[1].number, length = slice.GetLengthInChar();
+  const std::int64_t wanted = std::int64_t{values[2].number} - from + 1;
+  if (from < 0 || wanted <= 0) return length == 0 ? std::nullopt : std::optional(std::vector<Answer>());
+  if (length > wanted || (length > 0 && from + length > static_cast<std::int64_t>(kTextLimit)))
+    return std::vector<Answer>();
+  if (length == wanted || from > 1) return std::nullopt;
+  std::vector<Answer> found;
+  if (from == 1) found = WithCharacterBefore(slice);
+  if (from == 0 || length == 0) found.push_back({slice, 0});
   return found;
 }
 

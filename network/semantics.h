@@ -43,12 +43,14 @@ class Semantics {
   // The value of a function; false when it has none.
   bool Compute(const Kind& kind, std::span<const Exact> inputs, Answer& result);
 
-  // All values of one input that give the result with the other inputs; nothing when they cannot be listed. Ignores
-  // values[position].
+  // All values of one input that give the result with the other inputs; nothing when they are too many to be listed.
+  // Ignores values[position].
   std::optional<std::vector<Answer>> Invert(const Kind& kind, std::size_t position, std::span<const Exact> values);
 
   // Whether Invert ever lists something for an input.
-  static bool CanInvert(const Kind& kind) { return kind.meaning != Meaning::Slice; }
+  static bool CanInvert(const Kind& kind, std::size_t position) {
+    return kind.meaning != Meaning::Slice || position == 0;
+  }
 
   template <class T>
   static bool Relates(Meaning meaning, const T& x, const T& y);
@@ -64,6 +66,9 @@ class Semantics {
   ZORString FoldOthers(Meaning meaning, std::span<const Exact> inputs, std::size_t except);
   Value& FormOf(Sort sort);
   bool Gives(const Kind& kind, std::size_t position, const Answer& input, std::span<const Exact> values);
+  std::optional<std::vector<Answer>> InvertFold(const Kind& kind, std::size_t position, std::span<const Exact> values);
+  static std::optional<std::vector<Answer>> InvertSlice(std::span<const Exact> values);
+  std::optional<std::vector<Answer>> Between(const ZORString& lowest, const ZORString& highest);
   void Propose(const Kind& kind, std::size_t position, std::span<const Exact> values, std::vector<Answer>& proposals);
   void ProposeByTextForm(const Exact& value, const ZORString& form, std::vector<Answer>& proposals);
   void Take(std::vector<Answer>& proposals, const Value& target);

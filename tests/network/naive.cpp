@@ -2,6 +2,8 @@
 
 #include <algorithm>
 #include <limits>
+#include <map>
+#include <numeric>
 #include <set>
 
 namespace naive {
@@ -41,24 +43,21 @@ std::string Form(Type type, const Value& value) {
   return '"' + value.text + '"';
 }
 
-struct NumberFunction {
-  const char* name;
-  std::int64_t (*fold)(std::int64_t x, std::int64_t y);
-};
+using NumberFold = std::int64_t (*)(std::int64_t x, std::int64_t y);
 
-const NumberFunction* FindNumberFunction(const std::string& name) {
-  static constexpr auto sum = [](std::int64_t x, std::int64_t y) { return x + y; };
-  static constexpr auto least = [](std::int64_t x, std::int64_t y) { return x < y ? x : y; };
-  static constexpr auto greatest = [](std::int64_t x, std::int64_t y) { return x < y ? y : x; };
-  static constexpr auto both = [](std::int64_t x, std::int64_t y) { return x * y; };
-  static constexpr auto either = [](std::int64_t x, std::int64_t y) { return x + y - x * y; };
-  static const NumberFunction kFunctions[] = {
-      {"int_plus", sum},     {"int_times", both},       {"int_min", least},
-      {"int_max", greatest}, {"bool_and", both},        {"array_bool_and", both},
-      {"bool_or", either},   {"array_bool_or", either}, {"int_sum", sum}};
-  const auto* found = std::find_if(std::begin(kFunctions), std::end(kFunctions),
-                                   [&](const NumberFunction& function) { return function.name == name; });
-  return found != std::end(kFunctions) ? found : nullptr;
+// Of a function of numbers what it makes of two; else null.
+NumberFold FoldOf(const std::string& name) {
+  const NumberFold sum = [](std::int64_t x, std::int64_t y) { return x + y; };
+  const NumberFold product = [](std::int64_t x, std::int64_t y) { return x * y; };
+  const NumberFold least = [](std::int64_t x, std::int64_t y) { return x < y ? x : y; };
+  const NumberFold greatest = [](std::int64_t x, std::int64_t y) { return x < y ? y : x; };
+  const NumberFold either = [](std::int64_t x, std::int64_t y) { return x + y - x * y; };
+  static const std::map<std::string, NumberFold> folds = {
+      {"int_plus", sum},         {"int_sum", sum},      {"int_times", product},
+      {"int_min", least},        {"int_max", greatest}, {"bool_or", either},
+      {"array_bool_or", either}, {"bool_and", product}, {"array_bool_and", product}};
+  const auto found = folds.find(name);
+  return found != folds.end() ? found->second : nullptr;
 }
 
 // The value of a function; nothing when it has none, or when the constraint is a relation.
@@ -67,23 +66,25 @@ std::optional<Value> Compute(const Network& network, const Constraint& constrain
     return values[static_cast<std::size_t>(constraint.arguments[i])];
   };
   const std::string& name = constraint.name;
-  if (const NumberFunction* function = FindNumberFunction(name)) {
+  if (const NumberFold fold = FoldOf(name)) {
     std::int64_t number = at(0).number;
-    for (std::size_t i = 1; i + 1 < constraint.arguments.size(); ++i) number = function->fold(number, at(i).number);
+    for (std::size_t i = 1; i + 1 < constraint.arguments.size(); ++i) number = fold(number, at(i).number);
     if (number != static_cast<std::int32_t>(number)) return std::nullopt;
     return Value{"", number};
   }
   const std::string& x = at(0).text;
+  std::vector<std::string> inputs;
+  for (std::size_t i = 0; i + 1 < constraint.arguments.size(); ++i) inputs.push_back(at(i).text);
   if (name == "str_concat") {
-    const std::string z = x + at(1).text;
+    const std::string z = std::accumulate(inputs.begin(), inputs.end(), std::string());
     return Value{z.size() > kLongest ? kGreatest : z, 0};
   }
   if (name == "str_substr") return Value{Slice(x, at(1).number, at(2).number), 0};
   if (name == "str_length") return Value{"", static_cast<std::int64_t>(x.size())};
   if (name == "str_lower") return Value{Fold(x, 'A', 'Z', 'a' - 'A'), 0};
   if (name == "str_upper") return Value{Fold(x, 'a', 'z', 'A' - 'a'), 0};
-  if (name == "str_min") return Value{std::min(x, at(1).text), 0};
-  if (name == "str_max") return Value{std::max(x, at(1).text), 0};
+  if (name == "str_min") return Value{*std::min_element(inputs.begin(), inputs.end()), 0};
+  if (name == "str_max") return Value{*std::max_element(inputs.begin(), inputs.end()), 0};
   if (name == "str_next") return Value{Next(x), 0};
   if (name == "str_text") {
     const std::string form = Form(network.variables[static_cast<std::size_t>(constraint.arguments[0])].type, at(0));
@@ -95,7 +96,7 @@ std::optional<Value> Compute(const Network& network, const Constraint& constrain
 bool IsFunction(const Constraint& constraint) {
   static const std::set<std::string> functions = {"str_concat", "str_substr", "str_length", "str_lower", "str_upper",
                                                   "str_min",    "str_max",    "str_next",   "str_text"};
-  return functions.contains(constraint.name) || FindNumberFunction(constraint.name) != nullptr;
+  return functions.contains(constraint.name) || FoldOf(constraint.name) != nullptr;
 }
 
 // A relation by its name behind the type.
@@ -208,12 +209,13 @@ zornet::Model Network::Build() const {
     model.Add(std::move(declared));
   }
   for (const Constraint& constraint : constraints) {
-    std::vector<zornet::Argument> list, arguments;
-    for (const int argument : constraint.arguments)
-      (list.size() < constraint.listed ? list : arguments).emplace_back(zornet::Var{argument});
-    const bool hasList = !list.empty();
-    if (hasList) arguments.emplace(arguments.begin(), std::move(list));
-    model.Post(*zornet::FindKind(constraint.name, hasList), arguments);
+    std::vector<zornet::Argument> arguments, members;
+    for (const int argument : constraint.arguments) {
+      auto& list = members.size() < constraint.members ? members : arguments;
+      list.emplace_back(zornet::Var{argument});
+    }
+    if (!members.empty()) arguments.insert(arguments.begin(), members);
+    model.Post(*zornet::FindKind(constraint.name, !members.empty()), arguments);
   }
   return model;
 }
@@ -303,37 +305,38 @@ class Maker {
   void AddConstraint() {
     struct Shape {
       const char* name;
-      const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything; T, I, B: a list of them
+      const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything; *: a list of what follows
     };
     static constexpr Shape kShapes[] = {
-        {"str_eq", "tt"},        {"str_ne", "tt"},       {"str_lt", "tt"},         {"str_le", "tt"},
-        {"str_gt", "tt"},        {"str_ge", "tt"},       {"str_eq_reif", "ttb"},   {"str_lt_reif", "ttb"},
-        {"str_le_reif", "ttb"},  {"str_concat", "ttt"},  {"str_concat", "ttt"},    {"str_concat", "ttt"},
-        {"str_substr", "tiit"},  {"str_substr", "tiit"}, {"str_length", "ti"},     {"str_lower", "tt"},
-        {"str_upper", "tt"},     {"str_min", "ttt"},     {"str_max", "ttt"},       {"str_next", "tt"},
-        {"str_text", "at"},      {"int_eq", "ii"},       {"int_ne", "ii"},         {"int_lt", "ii"},
-        {"int_le", "ii"},        {"int_eq_reif", "iib"}, {"int_ne_reif", "iib"},   {"int_lt_reif", "iib"},
-        {"int_le_reif", "iib"},  {"int_plus", "iii"},    {"int_plus", "iii"},      {"int_times", "iii"},
-        {"int_times", "iii"},    {"int_min", "iii"},     {"int_max", "iii"},       {"int_min", "Ii"},
-        {"int_max", "Ii"},       {"int_sum", "Ii"},      {"int_sum", "Ii"},        {"bool_eq", "bb"},
-        {"bool_not", "bb"},      {"bool_lt", "bb"},      {"bool_le", "bb"},        {"bool_imply", "bb"},
-        {"bool_eq_reif", "bbb"}, {"bool_xor", "bbb"},    {"bool_lt_reif", "bbb"},  {"bool_le_reif", "bbb"},
-        {"bool_and", "bbb"},     {"bool_or", "bbb"},     {"array_bool_and", "Bb"}, {"array_bool_or", "Bb"},
+        {"str_eq", "tt"},        {"str_ne", "tt"},       {"str_lt", "tt"},          {"str_le", "tt"},
+        {"str_gt", "tt"},        {"str_ge", "tt"},       {"str_eq_reif", "ttb"},    {"str_lt_reif", "ttb"},
+        {"str_le_reif", "ttb"},  {"str_concat", "ttt"},  {"str_concat", "ttt"},     {"str_concat", "ttt"},
+        {"str_substr", "tiit"},  {"str_substr", "tiit"}, {"str_length", "ti"},      {"str_lower", "tt"},
+        {"str_upper", "tt"},     {"str_min", "ttt"},     {"str_max", "ttt"},        {"str_next", "tt"},
+        {"str_text", "at"},      {"str_concat", "*tt"},  {"str_concat", "*tt"},     {"str_min", "*tt"},
+        {"str_max", "*tt"},      {"int_eq", "ii"},       {"int_ne", "ii"},          {"int_lt", "ii"},
+        {"int_le", "ii"},        {"int_eq_reif", "iib"}, {"int_ne_reif", "iib"},    {"int_lt_reif", "iib"},
+        {"int_le_reif", "iib"},  {"int_plus", "iii"},    {"int_plus", "iii"},       {"int_times", "iii"},
+        {"int_times", "iii"},    {"int_min", "iii"},     {"int_max", "iii"},        {"int_min", "*ii"},
+        {"int_max", "*ii"},      {"int_sum", "*ii"},     {"int_sum", "*ii"},        {"bool_eq", "bb"},
+        {"bool_not", "bb"},      {"bool_lt", "bb"},      {"bool_le", "bb"},         {"bool_imply", "bb"},
+        {"bool_eq_reif", "bbb"}, {"bool_xor", "bbb"},    {"bool_lt_reif", "bbb"},   {"bool_le_reif", "bbb"},
+        {"bool_and", "bbb"},     {"bool_or", "bbb"},     {"array_bool_and", "*bb"}, {"array_bool_or", "*bb"},
         {"bool2int", "bi"}};
     const Shape& shape = kShapes[Draw(std::size(kShapes))];
-    Constraint constraint{shape.name, {}, 0};
-    for (const char* takes = shape.takes; *takes != '\0'; ++takes) {
+    Constraint constraint{shape.name, {}};
+    if (*shape.takes == '*') constraint.members = 1 + Draw(4);
+    const std::string takes =
+        constraint.members == 0 ? shape.takes : std::string(constraint.members, shape.takes[1]) + (shape.takes + 2);
+    for (const char wanted : takes) {
       std::vector<int> fitting;
       for (std::size_t v = 0; v < mNetwork.variables.size(); ++v) {
         const Type type = mNetwork.variables[v].type;
         const char letter = IsText(type) ? 't' : type == Type::Boolean ? 'b' : 'i';
-        if (*takes == 'a' || (*takes | 0x20) == letter) fitting.push_back(static_cast<int>(v));
+        if (wanted == 'a' || wanted == letter) fitting.push_back(static_cast<int>(v));
       }
       if (fitting.empty()) return;
-      const bool list = *takes < 'a';
-      for (std::size_t members = list ? 1 + Draw(3) : 1; members != 0; --members)
-        constraint.arguments.push_back(fitting[Draw(fitting.size())]);
-      if (list) constraint.listed = constraint.arguments.size();
+      constraint.arguments.push_back(fitting[Draw(fitting.size())]);
     }
     mNetwork.constraints.push_back(std::move(constraint));
   }

@@ -34,7 +34,7 @@ struct Variable {
 struct Constraint {
   std::string name;
   std::vector<int> arguments;
-  std::size_t listed = 0;  // so many of them, from the first on, are a list
+  std::size_t members = 0;  // so many of the first arguments are a list
 };
 
 struct Network {

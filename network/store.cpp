@@ -80,6 +80,8 @@ Store::Measure Store::MeasureOf(const Value& value) {
 void Store::Meet(int variable, const Value& outcome) {
   Value& held = mValues[static_cast<std::size_t>(variable)];
   if (held.IsNil() || outcome.IsUndefined()) return;
+  if (Declared(variable).constant && !outcome.IsNil() && held.Any().IsIntersected(outcome.Any()) == 0)
+    return Fail(variable);
   if (HasCandidates(variable) && !outcome.IsNil() && outcome.Sort() != held.Sort())
     return MeetNumbers(variable, CandidatesIn(variable, outcome));
   if (HasCandidates(variable) && !IsCandidate(variable, outcome)) return Fail(variable);
@@ -225,7 +227,14 @@ std::string Store::Show(int variable) const {
   return "one of " + all.Show();
 }
 
+// A contradiction shows in a variable rather than in a constant.
 void Store::Fail(int variable) {
+  if (Declared(variable).constant && mConstraint != kNone) {
+    const auto arguments = mModel.Constraints()[static_cast<std::size_t>(mConstraint)].arguments;
+    const auto found =
+        std::find_if(arguments.rbegin(), arguments.rend(), [this](int other) { return !Declared(other).constant; });
+    if (found != arguments.rend()) variable = *found;
+  }
   Value& nil = FreshLike(variable);
   nil.Any().SetNilValue();
   Meet(variable, nil);

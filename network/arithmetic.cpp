@@ -150,11 +150,11 @@ bool Arithmetic::IsDecided(const Constraint& constraint) const {
   if (meaning == Meaning::Product && number != 0) return false;
   const auto inputs = constraint.arguments.first(constraint.Inputs());
   const bool isThere = std::any_of(inputs.begin(), inputs.end(), [&](int input) {
-    return mStore[input].IsOne() && mStore.LowestNumber(input) == number;
+    return mStore[input].IsOne() && mStore[input].LowestNumber() == number;
   });
   return isThere && std::all_of(inputs.begin(), inputs.end(), [&](int input) {
-           if (meaning == Meaning::Minimum) return mStore.LowestNumber(input) >= number;
-           return meaning == Meaning::Product || mStore.HighestNumber(input) <= number;
+           if (meaning == Meaning::Minimum) return mStore[input].LowestNumber() >= number;
+           return meaning == Meaning::Product || mStore[input].HighestNumber() <= number;
          });
 }
 

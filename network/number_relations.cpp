@@ -53,9 +53,9 @@ void NumberRelations::Remove(int target, int other) {
   mStore.Meet(target, outcome);
 }
 
-// x + distance <= y
+// x + distance <= y. Candidates do not make it hold for good: a single that is left with them shows as unknown.
 Status NumberRelations::Ordered(int x, int y, std::int64_t distance) {
-  if (mStore.HighestNumber(x) + distance <= mStore.LowestNumber(y)) return Status::Subsumed;
+  if (mStore[x].HighestNumber() + distance <= mStore[y].LowestNumber()) return Status::Subsumed;
   mStore.StartOperation(Operation::Bounds);
   mStore.Bound(x, std::numeric_limits<ZORLong>::min(), mStore.HighestNumber(y) - distance);
   if (!mStore.HasFailed()) mStore.Bound(y, mStore.LowestNumber(x) + distance, std::numeric_limits<ZORLong>::max());

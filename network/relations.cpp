@@ -202,7 +202,7 @@ Status Relations::Decide(Meaning meaning, int x, int y, int truth) {
     return Status::Fixpoint;
   }
   mStore.Meet(truth, mReified);
-  return Status::Subsumed;
+  return mStore.HasCandidates(x) || mStore.HasCandidates(y) ? Status::Fixpoint : Status::Subsumed;
 }
 
 // False while the relation is open.

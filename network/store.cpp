@@ -206,7 +206,10 @@ void Store::MeetCandidates(int variable, Listing candidates) {
                                          : MeetNumbers(variable, std::move(candidates.numbers));
   if (!held.known && candidates.count > zor::kSetLimit) return;
   const std::string shown = mWatcher != nullptr ? Show(variable) : "";
-  if (!mMarks.empty()) mTrail.push_back({variable, (*this)[variable], TakeCandidates(variable)});
+  if (!mMarks.empty()) {
+    Saved saved{variable, (*this)[variable], TakeCandidates(variable)};
+    mTrail.push_back(std::move(saved));
+  }
   mListings[static_cast<std::size_t>(variable)] = std::move(candidates);
   Changed(variable, shown);
 }

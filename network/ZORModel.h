@@ -63,7 +63,8 @@ struct Variable {
 };
 
 // What a constraint says: a relation between its arguments, or a function that gives the last one. A reified constraint
-// has one argument more, which tells whether that is so.
+// has one argument more, which tells whether that is so. Of truth values, which are 0 and 1 where numbers are asked
+// for, unequal is "not", less or equal is "implies", the minimum is "and" and the maximum "or".
 enum class Meaning {
   Equal,
   Unequal,
@@ -87,6 +88,8 @@ enum class Meaning {
   Position,  // of the first occurrence of the second text in the first, or -1
   ReplaceFirst,
   ReplaceAll,
+  Sum,
+  Product,
 };
 
 // What stands at one place of a constraint. The plural is a list, as str_concat([a, "-", b], z) has one; a constraint
@@ -104,6 +107,9 @@ enum class Takes {
 };
 constexpr bool IsList(Takes takes) { return takes >= Takes::Texts; }
 constexpr bool IsVariable(Takes takes) { return takes != Takes::Expression && takes != Takes::Rows; }
+constexpr bool IsNumber(Takes takes) {
+  return takes != Takes::Text && takes != Takes::Texts && takes != Takes::Anything;
+}
 ZOR_EXPORT Takes MemberOf(Takes list);  // what the list holds; of another place what stands there
 
 inline constexpr int kMostArguments = 5;
@@ -120,6 +126,7 @@ struct Kind {
 
   constexpr bool IsComparison() const { return meaning <= Meaning::Less; }
   constexpr bool IsRelation() const { return meaning <= Meaning::Row; }
+  constexpr bool IsOfNumbers() const { return IsNumber(takes[0]); }  // integers or truth values, no texts
   ZOR_EXPORT bool HasList() const;
 };
 

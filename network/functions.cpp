@@ -26,6 +26,10 @@ Operation ForwardOf(Meaning meaning) {
       return Operation::Maximum;
     case Meaning::Successor:
       return Operation::Successor;
+    case Meaning::Sum:
+      return Operation::Sum;
+    case Meaning::Product:
+      return Operation::Product;
     case Meaning::TextForm:
       return Operation::TextForm;
     default:
@@ -71,6 +75,7 @@ Functions::Functions(Store& store, std::size_t budget)
     : mStore(store),
       mSemantics(store.Types()),
       mSupports(store, mSemantics, budget),
+      mArithmetic(store),
       mX(store.Types(), Sort::TextSet),
       mY(store.Types(), Sort::TextSet),
       mZ(store.Types(), Sort::TextSet) {}
@@ -83,6 +88,7 @@ Status Functions::Narrow(const Constraint& constraint) {
     ComputeExact(constraint);
     return Status::Subsumed;
   }
+  if (constraint.kind->IsOfNumbers()) return NarrowNumbers(constraint);
   if (constraint.kind->meaning == Meaning::Length) BoundLength(constraint.Result());
   if (constraint.kind->meaning == Meaning::Position && !constraint.kind->reified) BoundPosition(constraint.Result());
   if (mStore.HasFailed()) return Status::Fixpoint;
@@ -97,6 +103,13 @@ Status Functions::Narrow(const Constraint& constraint) {
   if (mStore.HasFailed()) return Status::Fixpoint;
   ComputeSets(constraint);
   return Status::Again;  // the result may be an input too
+}
+
+// Bounds say all of intervals. Sets have holes beside, and what stands twice is bounded as if it were two.
+Status Functions::NarrowNumbers(const Constraint& constraint) {
+  const Status status = mArithmetic.Narrow(constraint);
+  if (mStore.HasFailed() || status != Status::Again || !mArithmetic.NeedsSupports(constraint)) return status;
+  return mSupports.Narrow(constraint) ? Status::Fixpoint : Status::Again;
 }
 
 // Nothing is computed: the values that are left must be related.
@@ -131,7 +144,9 @@ void Functions::TakeExact(std::span<const int> variables) {
 
 void Functions::ComputeExact(const Constraint& constraint) {
   TakeExact(constraint.arguments.first(constraint.Inputs()));
-  mStore.StartOperation(ForwardOf(constraint.kind->meaning));
+  const bool isExtreme = constraint.kind->IsOfNumbers() && constraint.kind->meaning != Meaning::Sum &&
+                         constraint.kind->meaning != Meaning::Product;
+  mStore.StartOperation(isExtreme ? Operation::Bounds : ForwardOf(constraint.kind->meaning));
   Answer answer;
   if (!mSemantics.Compute(constraint, mExact, answer)) return mStore.Fail(constraint.Result());
   MeetResult(constraint, answer);
@@ -243,12 +258,12 @@ void Functions::MeetSet(int variable, const Value& set) {
 // Even the length of an unknown text lies within the limit.
 void Functions::BoundLength(int number) {
   mStore.StartOperation(Operation::Length);
-  Bound(number, 0, kTextLimit);
+  mStore.Bound(number, 0, kTextLimit);
 }
 
 void Functions::BoundPosition(int number) {
   mStore.StartOperation(Operation::Supports);
-  Bound(number, -1, kLastPosition);
+  mStore.Bound(number, -1, kLastPosition);
 }
 
 // Narrows positions and slice by each other, whatever the text is. True when the slice must be empty.
@@ -270,9 +285,9 @@ bool Functions::BoundSlice(const Constraint& constraint) {
 // A slice that is not empty begins inside the longest text, and ends so many characters later.
 void Functions::BoundPositions(int from, int to, std::int64_t shortest) {
   if (shortest == 0) return;
-  Bound(from, 0, std::min(HighestOr(mStore[to], kLastPosition), kLastPosition) - shortest + 1);
+  mStore.Bound(from, 0, std::min(HighestOr(mStore[to], kLastPosition), kLastPosition) - shortest + 1);
   if (mStore.HasFailed()) return;
-  Bound(to, LowestOr(mStore[from], 0) + shortest - 1, std::numeric_limits<ZORLong>::max());
+  mStore.Bound(to, LowestOr(mStore[from], 0) + shortest - 1, std::numeric_limits<ZORLong>::max());
 }
 
 void Functions::DropLongTexts(int variable, std::int64_t longest) {
@@ -286,24 +301,6 @@ void Functions::DropLongTexts(int variable, std::int64_t longest) {
   Value& outcome = mStore.FreshLike(variable);
   outcome.SetTexts(kept);
   mStore.Meet(variable, outcome);
-}
-
-// Keeps the numbers from lowest to highest. An unknown single number stays unknown unless one number is left.
-void Functions::Bound(int number, std::int64_t lowest, std::int64_t highest) {
-  const Value& held = mStore[number];
-  if (held.IsKnown() && held.LowestNumber() >= lowest && held.HighestNumber() <= highest) return;
-  if (lowest > highest) return mStore.Fail(number);
-  Value& outcome = mStore.FreshLike(number);
-  if (held.Sort() == Sort::IntegerSet && held.IsKnown()) {
-    std::vector<ZORLong> possible = held.Numbers();
-    std::erase_if(possible, [&](ZORLong n) { return n < lowest || n > highest; });
-    outcome.SetNumbers(possible);
-  } else if (held.Sort() == Sort::Integer && held.IsKnown()) {
-    return mStore.Fail(number);
-  } else {
-    outcome.SetNumbers({static_cast<ZORLong>(lowest), static_cast<ZORLong>(highest)});
-  }
-  mStore.Meet(number, outcome);
 }
 
 }  // namespace zornet

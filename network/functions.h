@@ -1,8 +1,9 @@
 // Narrowing of the constraints whose last argument is a function of the others, and of those that only supports narrow.
 #pragma once
 
-#include "network/relations.h"
+#include "network/arithmetic.h"
 #include "network/semantics.h"
+#include "network/status.h"
 #include "network/store.h"
 #include "network/supports.h"
 
@@ -15,6 +16,7 @@ class Functions {
   Status Narrow(const Constraint& constraint);
 
  private:
+  Status NarrowNumbers(const Constraint& constraint);
   Status NarrowRelation(const Constraint& constraint);
   bool HasExact(std::span<const int> variables) const;
   void TakeExact(std::span<const int> variables);
@@ -33,11 +35,11 @@ class Functions {
   bool BoundSlice(const Constraint& constraint);
   void BoundPositions(int from, int to, std::int64_t shortest);
   void DropLongTexts(int variable, std::int64_t longest);
-  void Bound(int number, std::int64_t lowest, std::int64_t highest);
 
   Store& mStore;
   Semantics mSemantics;
   Supports mSupports;
+  Arithmetic mArithmetic;
   Value mX, mY, mZ;           // sets
   std::vector<Exact> mExact;  // inputs
   std::vector<int> mInputs;

@@ -7,21 +7,24 @@ namespace zornet {
 namespace {
 
 constexpr Takes T = Takes::Text, I = Takes::Integer, B = Takes::Boolean, V = Takes::Anything, Ts = Takes::Texts,
-                E = Takes::Expression, R = Takes::Rows;
+                Is = Takes::Integers, Bs = Takes::Booleans, E = Takes::Expression, R = Takes::Rows;
 
 // clang-format off
 constexpr Kind kKinds[] = {
   // name          meaning                mirrored reified arity takes         roles
   {"str_eq",       Meaning::Equal,         false, false,  2,    {T, T},       {"x", "y"}},
   {"str_ne",       Meaning::Unequal,       false, false,  2,    {T, T},       {"x", "y"}},
-  {"str_lt",       Meaning::Less,         false, false,  2,    {T, T},       {"x", "y"}},
-  {"str_le",       Meaning::LessOrEqual,      false, false,  2,    {T, T},       {"x", "y"}},
-  {"str_gt",       Meaning::Less,         true,  false,  2,    {T, T},       {"x", "y"}},
-  {"str_ge",       Meaning::LessOrEqual,      true,  false,  2,    {T, T},       {"x", "y"}},
+  {"str_lt",       Meaning::Less,          false, false,  2,    {T, T},       {"x", "y"}},
+  {"str_le",       Meaning::LessOrEqual,   false, false,  2,    {T, T},       {"x", "y"}},
+  {"str_gt",       Meaning::Less,          true,  false,  2,    {T, T},       {"x", "y"}},
+  {"str_ge",       Meaning::LessOrEqual,   true,  false,  2,    {T, T},       {"x", "y"}},
 
   {"str_eq_reif",  Meaning::Equal,         false, true,   3,    {T, T, B},    {"x", "y", "b"}},
-  {"str_lt_reif",  Meaning::Less,         false, true,   3,    {T, T, B},    {"x", "y", "b"}},
-  {"str_le_reif",  Meaning::LessOrEqual,      false, true,   3,    {T, T, B},    {"x", "y", "b"}},
+  {"str_lt_reif",  Meaning::Less,          false, true,   3,    {T, T, B},    {"x", "y", "b"}},
+  {"str_ne_reif",  Meaning::Unequal,       false, true,   3,    {T, T, B},    {"x", "y", "b"}},
+  {"str_le_reif",  Meaning::LessOrEqual,   false, true,   3,    {T, T, B},    {"x", "y", "b"}},
+  {"str_gt_reif",  Meaning::Less,          true,  true,   3,    {T, T, B},    {"x", "y", "b"}},
+  {"str_ge_reif",  Meaning::LessOrEqual,   true,  true,   3,    {T, T, B},    {"x", "y", "b"}},
 
   {"str_prefix",   Meaning::Prefix,        false, false,  2,    {T, T},       {"x", "y"}},
   {"str_suffix",   Meaning::Suffix,        false, false,  2,    {T, T},       {"x", "y"}},
@@ -52,6 +55,37 @@ constexpr Kind kKinds[] = {
   {"str_max",      Meaning::Maximum,       false, false,  2,    {Ts, T},      {"xs", "z"}},
   {"str_next",     Meaning::Successor,     false, false,  2,    {T, T},       {"x", "z"}},
   {"str_text",     Meaning::TextForm,      false, false,  2,    {V, T},       {"v", "x"}},
+
+  {"int_eq",       Meaning::Equal,         false, false,  2,    {I, I},       {"x", "y"}},
+  {"int_ne",       Meaning::Unequal,       false, false,  2,    {I, I},       {"x", "y"}},
+  {"int_lt",       Meaning::Less,           false, false,  2,    {I, I},       {"x", "y"}},
+  {"int_le",       Meaning::LessOrEqual,   false, false,  2,    {I, I},       {"x", "y"}},
+  {"int_eq_reif",  Meaning::Equal,         false, true,   3,    {I, I, B},    {"x", "y", "b"}},
+  {"int_ne_reif",  Meaning::Unequal,       false, true,   3,    {I, I, B},    {"x", "y", "b"}},
+  {"int_lt_reif",  Meaning::Less,           false, true,   3,    {I, I, B},    {"x", "y", "b"}},
+  {"int_le_reif",  Meaning::LessOrEqual,   false, true,   3,    {I, I, B},    {"x", "y", "b"}},
+  {"int_plus",     Meaning::Sum,           false, false,  3,    {I, I, I},    {"x", "y", "z"}},
+  {"int_times",    Meaning::Product,       false, false,  3,    {I, I, I},    {"x", "y", "z"}},
+  {"int_min",      Meaning::Minimum,       false, false,  3,    {I, I, I},    {"x", "y", "z"}},
+  {"int_max",      Meaning::Maximum,       false, false,  3,    {I, I, I},    {"x", "y", "z"}},
+  {"int_min",      Meaning::Minimum,       false, false,  2,    {Is, I},      {"xs", "z"}},
+  {"int_max",      Meaning::Maximum,       false, false,  2,    {Is, I},      {"xs", "z"}},
+  {"int_sum",      Meaning::Sum,           false, false,  2,    {Is, I},      {"xs", "s"}},
+
+  {"bool_eq",      Meaning::Equal,         false, false,  2,    {B, B},       {"a", "b"}},
+  {"bool_not",     Meaning::Unequal,       false, false,  2,    {B, B},       {"a", "b"}},
+  {"bool_lt",      Meaning::Less,           false, false,  2,    {B, B},       {"a", "b"}},
+  {"bool_le",      Meaning::LessOrEqual,   false, false,  2,    {B, B},       {"a", "b"}},
+  {"bool_imply",   Meaning::LessOrEqual,   false, false,  2,    {B, B},       {"a", "b"}},
+  {"bool_eq_reif", Meaning::Equal,         false, true,   3,    {B, B, B},    {"a", "b", "r"}},
+  {"bool_xor",     Meaning::Unequal,       false, true,   3,    {B, B, B},    {"a", "b", "r"}},
+  {"bool_lt_reif", Meaning::Less,           false, true,   3,    {B, B, B},    {"a", "b", "r"}},
+  {"bool_le_reif", Meaning::LessOrEqual,   false, true,   3,    {B, B, B},    {"a", "b", "r"}},
+  {"bool_and",     Meaning::Minimum,       false, false,  3,    {B, B, B},    {"a", "b", "r"}},
+  {"bool_or",      Meaning::Maximum,       false, false,  3,    {B, B, B},    {"a", "b", "r"}},
+  {"array_bool_and", Meaning::Minimum,     false, false,  2,    {Bs, B},      {"as", "r"}},
+  {"array_bool_or",  Meaning::Maximum,     false, false,  2,    {Bs, B},      {"as", "r"}},
+  {"bool2int",     Meaning::Equal,         false, false,  2,    {B, I},       {"b", "n"}},
 };
 // clang-format on
 

@@ -21,6 +21,7 @@ Propagation::Propagation(Store& store, const Limits& limits)
       mAllDifferent(store),
       mTables(store) {
   Connect();
+  mShavings.resize(mModel.Variables().size(), 0);
   mStates.resize(mModel.Constraints().size(), Idle);
   mQueue.resize(mModel.Constraints().size());
   for (std::size_t i = 0; i < mModel.Constraints().size(); ++i) Wake(static_cast<int>(i));
@@ -42,6 +43,8 @@ void Propagation::Connect() {
 }
 
 Outcome Propagation::Run() {
+  for (const int variable : mShaved) mShavings[static_cast<std::size_t>(variable)] = 0;
+  mShaved.clear();
   if (mSteps == 0) FailOrderCycle();
   if (mStore.HasFailed()) return Outcome::Contradiction;
   WakeReaders(kNone);
@@ -92,11 +95,21 @@ Status Propagation::Narrow(const Constraint& constraint) {
 // A constraint that finds in one pass all that it can find is not woken by its own changes.
 void Propagation::WakeReaders(int except) {
   for (const int variable : mStore.Touched()) {
+    if (IsShaved(variable)) continue;
     for (const int reader : ReadersOf(variable)) {
       if (reader != except) Wake(reader);
     }
   }
   mStore.Touched().clear();
+}
+
+// Whether the readers of a changed variable are left alone. Those of one that has become a single number are not.
+bool Propagation::IsShaved(int variable) {
+  const Value& value = mStore[variable];
+  if (value.Sort() != Sort::Interval || value.IsOne()) return false;
+  unsigned& shavings = mShavings[static_cast<std::size_t>(variable)];
+  if (shavings++ == 0) mShaved.push_back(variable);
+  return shavings > kMostShavings;
 }
 
 std::span<const int> Propagation::ReadersOf(int variable) const {

@@ -1,5 +1,7 @@
 // Narrows a network until nothing changes any more: constraints wait in a queue and are woken by the variables that
 // they read. It ends, since every change leaves less in a variable, and it loses no solution (see Store and Semantics).
+// Two constraints such as x + 1 = y and y + 1 = x take one number a pass from an interval, which may have 2^32: an
+// interval that has changed kMostShavings times in one run is shaved no further.
 #pragma once
 
 #include <cstdint>
@@ -41,6 +43,7 @@ class Propagation {
   void Connect();
   void Wake(int constraint);
   void WakeReaders(int except);
+  bool IsShaved(int variable);
   void FailOrderCycle();
   Status Narrow(int constraint);
   Status Narrow(const Constraint& constraint);
@@ -58,6 +61,10 @@ class Propagation {
   // Constraints that read a variable: mReaders[mFirstReader[v]] and those up to mFirstReader[v + 1].
   std::vector<int> mReaders;
   std::vector<std::size_t> mFirstReader;
+
+  static constexpr unsigned kMostShavings = 4096;
+  std::vector<unsigned> mShavings;  // by variable: changes of an interval in this run
+  std::vector<int> mShaved;         // the variables that have some
 
   enum State : char { Idle, Waiting, Finished };
   std::vector<State> mStates;  // of the constraints

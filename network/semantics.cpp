@@ -121,6 +121,7 @@ bool Semantics::Compute(const Constraint& constraint, std::span<const Exact> inp
 
 // Operands are Exact, the greatest text too: the module would fold a Max by its state.
 bool Semantics::ComputeFunction(const Kind& kind, std::span<const Exact> inputs, Answer& result) {
+  if (kind.IsOfNumbers()) return ComputeNumber(kind, inputs, result);
   if (kind.meaning == Meaning::TextForm) return ComputeTextForm(inputs[0], result);
   const ZORString& x = *inputs[0].text;
   switch (kind.meaning) {
@@ -237,6 +238,7 @@ Semantics::Answers Semantics::InvertTrue(const Constraint& constraint, std::size
     if (!ComputeFunction(kind, values.first(position), proposals.back())) proposals.clear();
     return proposals;
   }
+  if (kind.IsOfNumbers()) return InvertNumber(kind, position, values);
   proposals.reserve(2);
   switch (kind.meaning) {
     case Meaning::Prefix:
@@ -421,22 +423,7 @@ void Semantics::Take(std::vector<Answer>& proposals, const Value& target) {
   proposals.push_back(text ? Answer{target.LowestText(), 0} : Answer{ZORString(), target.LowestNumber()});
 }
 
-bool Semantics::Relates(Meaning meaning, const ZORString& x, const ZORString& y) {
-  switch (meaning) {
-    case Meaning::Equal:
-      return x == y;
-    case Meaning::Unequal:
-      return !(x == y);
-    case Meaning::LessOrEqual:
-      return x <= y;
-    case Meaning::Less:
-      return x < y;
-    default:
-      return false;
-  }
-}
-
-// Of texts, truly related by what is neither equality nor order.
+// Of what is neither equality nor order.
 bool Semantics::RelatesTexts(const Constraint& constraint, std::span<const Exact> values) {
   const std::string_view x = ToView(*values[0].text);
   const auto y = [&] { return ToView(*values[1].text); };
@@ -459,8 +446,10 @@ bool Semantics::RelatesTexts(const Constraint& constraint, std::span<const Exact
 // Whether the relation holds, or the function gives its last value.
 bool Semantics::IsTrue(const Constraint& constraint, std::span<const Exact> values) {
   const Kind& kind = *constraint.kind;
-  if (kind.IsComparison())
-    return Relates(kind.meaning, *values[kind.mirrored ? 1 : 0].text, *values[kind.mirrored ? 0 : 1].text);
+  if (kind.IsComparison()) {
+    const Exact &x = values[kind.mirrored ? 1 : 0], &y = values[kind.mirrored ? 0 : 1];
+    return kind.IsOfNumbers() ? Relates(kind.meaning, x.number, y.number) : Relates(kind.meaning, *x.text, *y.text);
+  }
   if (kind.IsRelation()) return RelatesTexts(constraint, values);
   Answer answer;
   if (!ComputeFunction(kind, values.first(values.size() - 1), answer)) return false;

@@ -12,6 +12,7 @@
 //   position       of the empty text: 0
 //   replacement    of the empty text: it stands before the first character and, where all are replaced, nowhere; of
 //                  more than 255 characters: the greatest text
+//   sum, product   outside the 32-bit integers: none
 #pragma once
 
 #include <optional>
@@ -53,7 +54,8 @@ class Semantics {
   // Whether Invert ever lists something for an argument.
   static bool CanInvert(const Kind& kind, std::size_t position);
 
-  static bool Relates(Meaning meaning, const ZORString& x, const ZORString& y);
+  template <class T>
+  static bool Relates(Meaning meaning, const T& x, const T& y);
   bool Holds(const Constraint& constraint, std::span<const Exact> values);
 
  private:
@@ -62,8 +64,10 @@ class Semantics {
   bool IsTrue(const Constraint& constraint, std::span<const Exact> values);
   static bool RelatesTexts(const Constraint& constraint, std::span<const Exact> values);
   bool ComputeFunction(const Kind& kind, std::span<const Exact> inputs, Answer& result);
+  static bool ComputeNumber(const Kind& kind, std::span<const Exact> inputs, Answer& result);
   Answers InvertTrue(const Constraint& constraint, std::size_t position, std::span<const Exact> values);
   Answers InvertReplacement(const Constraint& constraint, std::size_t position, std::span<const Exact> values);
+  static Answers InvertNumber(const Kind& kind, std::size_t position, std::span<const Exact> values);
   Answers Filter(const Constraint& constraint, std::size_t position, std::span<const Exact> values,
                  std::vector<Answer>& proposals);
   bool ComputeTextForm(const Exact& value, Answer& result);
@@ -82,5 +86,21 @@ class Semantics {
   std::vector<Value> mForms;  // one of each sort, for text forms
   std::vector<Exact> mGiven;  // what Gives looks at
 };
+
+template <class T>
+bool Semantics::Relates(Meaning meaning, const T& x, const T& y) {
+  switch (meaning) {
+    case Meaning::Equal:
+      return x == y;
+    case Meaning::Unequal:
+      return !(x == y);
+    case Meaning::LessOrEqual:
+      return x <= y;
+    case Meaning::Less:
+      return x < y;
+    default:
+      return false;
+  }
+}
 
 }  // namespace zornet

@@ -80,6 +80,10 @@ Store::Measure Store::MeasureOf(const Value& value) {
 void Store::Meet(int variable, const Value& outcome) {
   Value& held = mValues[static_cast<std::size_t>(variable)];
   if (held.IsNil() || outcome.IsUndefined()) return;
+  if (Declared(variable).constant && !outcome.IsNil() && held.Any().IsIntersected(outcome.Any()) == 0)
+    return Fail(variable);
+  if (HasCandidates(variable) && !outcome.IsNil() && outcome.Sort() != held.Sort())
+    return MeetNumbers(variable, CandidatesIn(variable, outcome));
   if (HasCandidates(variable) && !IsCandidate(variable, outcome)) return Fail(variable);
   const Measure before = MeasureOf(held);
   const std::string shown = mWatcher != nullptr ? Show(variable) : "";
@@ -117,6 +121,32 @@ void Store::Narrow(int variable, const Value& outcome) {
   if (held.Sort() == Sort::Text && held.IsKnown() && held.LowestText() == GreatestText()) held.Text().CalcMaxValue();
 }
 
+// A single of which little enough is left gets candidates.
+void Store::Bound(int variable, std::int64_t lowest, std::int64_t highest) {
+  const Value& held = (*this)[variable];
+  if (held.IsNil()) return;
+  const std::int64_t from = LowestNumber(variable), to = HighestNumber(variable);
+  lowest = std::max(lowest, from);
+  highest = std::min(highest, to);
+  if (lowest > highest) return Fail(variable);
+  if (lowest == from && highest == to) return;
+  Value& range = Fresh(held.Sort() == Sort::Boolean ? Sort::Boolean : Sort::Interval);
+  range.SetRange(static_cast<ZORLong>(lowest), static_cast<ZORLong>(highest));
+  const bool unlisted = held.Sort() == Sort::Integer && !HasCandidates(variable);
+  if (!unlisted || lowest == highest) return Meet(variable, range);
+  if (highest - lowest < static_cast<std::int64_t>(zor::kSetLimit)) MeetNumbers(variable, range.Numbers());
+}
+
+std::int64_t Store::LowestNumber(int variable) const {
+  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)].numbers.front();
+  return (*this)[variable].LowestNumber();
+}
+
+std::int64_t Store::HighestNumber(int variable) const {
+  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)].numbers.back();
+  return (*this)[variable].HighestNumber();
+}
+
 bool Store::HasCandidates(int variable) const {
   const auto at = static_cast<std::size_t>(variable);
   const Sort sort = mValues[at].Sort();
@@ -130,6 +160,13 @@ bool Store::IsCandidate(int variable, const Value& outcome) const {
   if (outcome.Sort() == Sort::Text)
     return std::binary_search(candidates.texts.begin(), candidates.texts.end(), outcome.LowestText());
   return std::binary_search(candidates.numbers.begin(), candidates.numbers.end(), outcome.LowestNumber());
+}
+
+// Of a single integer, by an outcome of another sort of integers.
+std::vector<ZORLong> Store::CandidatesIn(int variable, const Value& outcome) const {
+  std::vector<ZORLong> numbers = mListings[static_cast<std::size_t>(variable)].numbers;
+  std::erase_if(numbers, [&](ZORLong n) { return outcome.Integer().FindAtLeast(n) != n; });
+  return numbers;
 }
 
 void Store::MeetTexts(int variable, std::vector<ZORString> texts) {
@@ -169,7 +206,10 @@ void Store::MeetCandidates(int variable, Listing candidates) {
                                          : MeetNumbers(variable, std::move(candidates.numbers));
   if (!held.known && candidates.count > zor::kSetLimit) return;
   const std::string shown = mWatcher != nullptr ? Show(variable) : "";
-  if (!mMarks.empty()) mTrail.push_back({variable, (*this)[variable], TakeCandidates(variable)});
+  if (!mMarks.empty()) {
+    Saved saved{variable, (*this)[variable], TakeCandidates(variable)};
+    mTrail.push_back(std::move(saved));
+  }
   mListings[static_cast<std::size_t>(variable)] = std::move(candidates);
   Changed(variable, shown);
 }
@@ -190,7 +230,14 @@ std::string Store::Show(int variable) const {
   return "one of " + all.Show();
 }
 
+// A contradiction shows in a variable rather than in a constant.
 void Store::Fail(int variable) {
+  if (Declared(variable).constant && mConstraint != kNone) {
+    const auto arguments = mModel.Constraints()[static_cast<std::size_t>(mConstraint)].arguments;
+    const auto found =
+        std::find_if(arguments.rbegin(), arguments.rend(), [this](int other) { return !Declared(other).constant; });
+    if (found != arguments.rend()) variable = *found;
+  }
   Value& nil = FreshLike(variable);
   nil.Any().SetNilValue();
   Meet(variable, nil);

@@ -50,6 +50,8 @@ class Store {
   const zornet::Model& Model() const { return mModel; }
   const Value& operator[](int variable) const { return mValues[static_cast<std::size_t>(variable)]; }
   const Variable& Declared(int variable) const { return mModel.Variables()[static_cast<std::size_t>(variable)]; }
+  std::int64_t LowestNumber(int variable) const;   // of integers and truth values; the least of all where nothing
+  std::int64_t HighestNumber(int variable) const;  // is known, and the greatest
   const Listing& List(int variable);  // good until the variable changes; of an Undefined single its candidates
 
   // A value of the variable's type that is Undefined, good until the next call for the same type.
@@ -61,9 +63,12 @@ class Store {
   void StartConstraint(int constraint) { mConstraint = constraint; }
   void StartOperation(Operation operation);
   void Meet(int variable, const Value& outcome);
-  void MeetTexts(int variable, std::vector<ZORString> texts);    // ascending; none is a contradiction
-  void MeetNumbers(int variable, std::vector<ZORLong> numbers);  // so are these; of an interval both ends
+  void MeetTexts(int variable, std::vector<ZORString> texts);           // ascending; none is a contradiction
+  void MeetNumbers(int variable, std::vector<ZORLong> numbers);         // so are these; of an interval both ends
+  void Bound(int variable, std::int64_t lowest, std::int64_t highest);  // keeps the numbers from one to the other
   void Fail(int variable);
+
+  bool HasCandidates(int variable) const;  // an Undefined single that is one of those that List answers
 
   bool HasFailed() const { return mFailed != kNone; }
   int Failed() const { return mFailed; }  // the variable that became Nil, or kNone
@@ -94,8 +99,8 @@ class Store {
 
   static Measure MeasureOf(const Value& value);
   void Narrow(int variable, const Value& outcome);
-  bool HasCandidates(int variable) const;
   bool IsCandidate(int variable, const Value& outcome) const;
+  std::vector<ZORLong> CandidatesIn(int variable, const Value& outcome) const;
   void MeetCandidates(int variable, Listing candidates);
   std::unique_ptr<Listing> TakeCandidates(int variable);
   void Changed(int variable, const std::string& before);

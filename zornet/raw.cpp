@@ -148,6 +148,7 @@ void RunRaw(Network& network, const Names& names, const std::function<void(const
   for (int c = 0; c < static_cast<int>(constraints.size()); ++c) {
     const Constraint& constraint = constraints[static_cast<std::size_t>(c)];
     const Kind& kind = *constraint.kind;
+    if (kind.IsOfNumbers()) continue;  // the module's operations are those of texts
     for (const Row& row : kRows) {
       if (row.meaning == kind.meaning && row.mirrored == kind.mirrored && row.reified == kind.reified &&
           row.order.size() == constraint.arguments.size())

@@ -28,6 +28,11 @@ class Check {
     }
     for (const naive::Assignment& solution : mExpected) ASSERT_NO_FATAL_FAILURE(CheckKept(solution));
     ASSERT_NO_FATAL_FAILURE(CheckExact());
+    const auto& variables = mNetwork.variables;
+    const bool hasAllNumbers = std::any_of(variables.begin(), variables.end(), [](const naive::Variable& variable) {
+      return variable.type == naive::Type::Interval && variable.domain.empty();
+    });
+    if (hasAllNumbers) return;  // the search would try them
     ASSERT_NO_FATAL_FAILURE(CheckSearch());
   }
 

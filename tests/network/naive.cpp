@@ -66,12 +66,35 @@ std::string Form(Type type, const Value& value) {
   return '"' + value.text + '"';
 }
 
+using NumberFold = std::int64_t (*)(std::int64_t x, std::int64_t y);
+
+// Of a function of numbers what it makes of two; else null.
+NumberFold FoldOf(const std::string& name) {
+  const NumberFold sum = [](std::int64_t x, std::int64_t y) { return x + y; };
+  const NumberFold product = [](std::int64_t x, std::int64_t y) { return x * y; };
+  const NumberFold least = [](std::int64_t x, std::int64_t y) { return x < y ? x : y; };
+  const NumberFold greatest = [](std::int64_t x, std::int64_t y) { return x < y ? y : x; };
+  const NumberFold either = [](std::int64_t x, std::int64_t y) { return x + y - x * y; };
+  static const std::map<std::string, NumberFold> folds = {
+      {"int_plus", sum},         {"int_sum", sum},      {"int_times", product},
+      {"int_min", least},        {"int_max", greatest}, {"bool_or", either},
+      {"array_bool_or", either}, {"bool_and", product}, {"array_bool_and", product}};
+  const auto found = folds.find(name);
+  return found != folds.end() ? found->second : nullptr;
+}
+
 // The value of a function; nothing when it has none, or when the constraint is a relation.
 std::optional<Value> Compute(const Network& network, const Constraint& constraint, const Assignment& values) {
   const auto at = [&](std::size_t i) -> const Value& {
     return values[static_cast<std::size_t>(constraint.arguments[i])];
   };
   const std::string& name = constraint.name;
+  if (const NumberFold fold = FoldOf(name)) {
+    std::int64_t number = at(0).number;
+    for (std::size_t i = 1; i + 1 < constraint.arguments.size(); ++i) number = fold(number, at(i).number);
+    if (number != static_cast<std::int32_t>(number)) return std::nullopt;
+    return Value{"", number};
+  }
   const std::string& x = at(0).text;
   std::vector<std::string> inputs;
   for (std::size_t i = 0; i + 1 < constraint.arguments.size(); ++i) inputs.push_back(at(i).text);
@@ -100,7 +123,7 @@ bool IsFunction(const Constraint& constraint) {
   static const std::set<std::string> functions = {"str_concat", "str_substr", "str_length",  "str_lower",
                                                   "str_upper",  "str_min",    "str_max",     "str_next",
                                                   "str_text",   "str_find",   "str_replace", "str_replace_all"};
-  return functions.contains(constraint.name);
+  return functions.contains(constraint.name) || FoldOf(constraint.name) != nullptr;
 }
 
 bool Matches(const std::string& text, const std::string& expression) {
@@ -108,27 +131,31 @@ bool Matches(const std::string& text, const std::string& expression) {
   return std::regex_match(text, compiled.try_emplace(expression, expression).first->second);
 }
 
-// Whether the relation holds, or the function gives its last value.
+// Whether the relation holds, or the function gives its last value. Relations go by their name behind the type.
 bool IsTrue(const Network& network, const Constraint& constraint, const Assignment& values) {
   if (IsFunction(constraint)) {
     const auto image = Compute(network, constraint, values);
     return image && *image == values[static_cast<std::size_t>(constraint.arguments.back())];
   }
-  std::vector<std::string> texts;
-  for (const int argument : constraint.arguments) texts.push_back(values[static_cast<std::size_t>(argument)].text);
-  const std::string &relation = constraint.name, &x = texts.front(), &y = texts.back();
-  if (relation == "str_eq") return x == y;
-  if (relation == "str_ne") return x != y;
-  if (relation == "str_lt") return x < y;
-  if (relation == "str_le") return x <= y;
-  if (relation == "str_gt") return x > y;
-  if (relation == "str_ge") return x >= y;
-  if (relation == "str_prefix") return x == y.substr(0, x.size());
-  if (relation == "str_suffix") return x.size() <= y.size() && x == y.substr(y.size() - x.size());
-  if (relation == "str_contains") return Find(x, y) >= 0;
-  if (relation == "str_matches") return Matches(x, constraint.expression);
-  if (relation == "str_all_different") return std::set<std::string>(texts.begin(), texts.end()).size() == texts.size();
-  return std::find(constraint.rows.begin(), constraint.rows.end(), texts) != constraint.rows.end();
+  std::vector<Value> all;
+  for (const int argument : constraint.arguments) all.push_back(values[static_cast<std::size_t>(argument)]);
+  const Value &x = all.front(), &y = all.back();
+  const std::string relation = constraint.name.substr(constraint.name.find('_') + 1);
+  if (relation == "eq" || relation == "bool2int") return x == y;
+  if (relation == "ne" || relation == "not" || relation == "xor") return x != y;
+  if (relation == "lt") return x < y;
+  if (relation == "le" || relation == "imply") return x <= y;
+  if (relation == "gt") return x > y;
+  if (relation == "ge") return x >= y;
+  if (relation == "prefix") return x.text == y.text.substr(0, x.text.size());
+  if (relation == "suffix") return Find(y.text + '\n', x.text + '\n') >= 0;
+  if (relation == "contains") return Find(x.text, y.text) >= 0;
+  if (relation == "matches") return Matches(x.text, constraint.expression);
+  if (relation == "all_different") return std::set<Value>(all.begin(), all.end()).size() == all.size();
+  return std::any_of(constraint.rows.begin(), constraint.rows.end(), [&](const std::vector<std::string>& row) {
+    return std::equal(all.begin(), all.end(), row.begin(),
+                      [](const Value& v, const std::string& t) { return v.text == t; });
+  });
 }
 
 class Solver {
@@ -200,10 +227,10 @@ class Solver {
 }  // namespace
 
 bool Holds(const Network& network, const Constraint& constraint, const Assignment& values) {
-  const std::string reified = "_reif";
-  if (!constraint.name.ends_with(reified)) return IsTrue(network, constraint, values);
+  const bool reified = constraint.name.ends_with("_reif") || constraint.name == "bool_xor";
+  if (!reified) return IsTrue(network, constraint, values);
   Constraint plain = constraint;
-  plain.name.resize(plain.name.size() - reified.size());
+  plain.name.resize(std::min(plain.name.size(), plain.name.find("_reif")));
   plain.arguments.pop_back();
   return IsTrue(network, plain, values) == (values[static_cast<std::size_t>(constraint.arguments.back())].number != 0);
 }
@@ -221,7 +248,8 @@ zornet::Model Network::Build() const {
       if (IsText(variable.type)) declared.texts.push_back(value.text);
       if (!IsText(variable.type)) declared.numbers.push_back(static_cast<std::int32_t>(value.number));
     }
-    if (variable.type == Type::Interval) declared.numbers = {declared.numbers.front(), declared.numbers.back()};
+    if (!declared.numbers.empty() && variable.type == Type::Interval)
+      declared.numbers = {declared.numbers.front(), declared.numbers.back()};
     model.Add(std::move(declared));
   }
   for (const Constraint& constraint : constraints) {
@@ -246,7 +274,10 @@ class Maker {
 
   Network Make() {
     MakeUniverse();
-    const std::size_t texts = 2 + Draw(3), numbers = Draw(3), truths = Draw(2);
+    const bool isOfNumbers = Draw(2) != 0;
+    const std::size_t texts = isOfNumbers ? Draw(2) : 2 + Draw(3);
+    const std::size_t numbers = isOfNumbers ? 1 + Draw(4) : Draw(3);
+    const std::size_t truths = isOfNumbers ? 1 + Draw(4) : Draw(2);
     for (std::size_t i = 0; i < texts; ++i) AddText();
     for (std::size_t i = 0; i < numbers; ++i) AddNumber();
     for (std::size_t i = 0; i < truths; ++i) mNetwork.variables.push_back({Type::Boolean, MaybeTruth()});
@@ -297,6 +328,7 @@ class Maker {
     const std::int64_t from = end == 0 ? least : end == 1 ? greatest - 5 : static_cast<std::int64_t>(Draw(5)) - 2;
     Variable variable{Type::Integer, {}};
     const std::size_t kind = Draw(4);
+    if (kind == 0 && Draw(3) == 0) variable.type = Draw(2) == 0 ? Type::Interval : Type::IntegerSet;
     if (kind == 1) variable.domain = {{"", from}};
     if (kind == 2) {
       variable.type = Type::Interval;
@@ -338,7 +370,8 @@ class Maker {
     // clang-format off
     static constexpr Shape kShapes[] = {
         {"str_eq", "tt"}, {"str_ne", "tt"}, {"str_lt", "tt"}, {"str_le", "tt"}, {"str_gt", "tt"}, {"str_ge", "tt"},
-        {"str_eq_reif", "ttb"}, {"str_lt_reif", "ttb"}, {"str_le_reif", "ttb"},
+        {"str_eq_reif", "ttb"}, {"str_ne_reif", "ttb"}, {"str_lt_reif", "ttb"}, {"str_le_reif", "ttb"},
+        {"str_gt_reif", "ttb"}, {"str_ge_reif", "ttb"},
         {"str_concat", "ttt"}, {"str_concat", "ttt"}, {"str_concat", "ttt"}, {"str_concat", "*tt"},
         {"str_concat", "*tt"}, {"str_substr", "tiit"}, {"str_substr", "tiit"}, {"str_length", "ti"},
         {"str_lower", "tt"}, {"str_upper", "tt"}, {"str_min", "ttt"}, {"str_max", "ttt"}, {"str_min", "*tt"},
@@ -348,7 +381,17 @@ class Maker {
         {"str_prefix_reif", "ttb"}, {"str_suffix_reif", "ttb"}, {"str_contains_reif", "ttb"},
         {"str_matches_reif", "teb"}, {"str_find_reif", "ttib"}, {"str_replace_reif", "ttttb"},
         {"str_replace_all_reif", "ttttb"}, {"str_all_different", "*t"}, {"str_all_different", "*t"},
-        {"str_table", "*tr"}};
+        {"str_table", "*tr"},
+
+        {"int_eq", "ii"}, {"int_ne", "ii"}, {"int_lt", "ii"}, {"int_le", "ii"}, {"int_eq_reif", "iib"},
+        {"int_ne_reif", "iib"}, {"int_lt_reif", "iib"}, {"int_le_reif", "iib"}, {"int_plus", "iii"},
+        {"int_plus", "iii"}, {"int_times", "iii"}, {"int_times", "iii"}, {"int_min", "iii"}, {"int_max", "iii"},
+        {"int_min", "*ii"}, {"int_max", "*ii"}, {"int_sum", "*ii"}, {"int_sum", "*ii"},
+
+        {"bool_eq", "bb"}, {"bool_not", "bb"}, {"bool_lt", "bb"}, {"bool_le", "bb"}, {"bool_imply", "bb"},
+        {"bool_eq_reif", "bbb"}, {"bool_xor", "bbb"}, {"bool_lt_reif", "bbb"}, {"bool_le_reif", "bbb"},
+        {"bool_and", "bbb"}, {"bool_or", "bbb"}, {"array_bool_and", "*bb"}, {"array_bool_or", "*bb"},
+        {"bool2int", "bi"}};
     // clang-format on
     const Shape& shape = kShapes[Draw(std::size(kShapes))];
     Constraint constraint{shape.name, {}};

@@ -40,6 +40,10 @@ std::string_view Describe(Takes takes) {
       return "a truth value";
     case Takes::Anything:
       return "anything";
+    case Takes::Expression:
+      return "a regular expression";
+    case Takes::Rows:
+      return "the rows of a table";
     case Takes::Texts:
       return "a list of texts";
     case Takes::Integers:

@@ -5,6 +5,8 @@
 
 #include "host/ZORNumbers.h"
 #include "network/ZORModel.h"
+#include "network/expression.h"
+#include "network/tables.h"
 #include "network/texts.h"
 
 namespace zornet {
@@ -106,18 +108,22 @@ int Model::Post(const Kind& kind, std::span<const Argument> arguments) {
     mVariables.resize(before);
     throw;
   }
-  mConstraints.push_back({&kind, Keep(mPosted)});
+  mConstraints.push_back({&kind, Keep(mPosted), mExpression, mTable});
   return static_cast<int>(mConstraints.size()) - 1;
 }
 
 void Model::Flatten(const Kind& kind, std::span<const Argument> arguments) {
   mPosted.clear();
+  mExpression = nullptr;
+  mTable = nullptr;
   for (std::size_t place = 0; place < arguments.size(); ++place) {
     const auto* const list = std::get_if<std::vector<Argument>>(&arguments[place].mValue);
     if ((list != nullptr) != IsList(kind.takes[place]))
       Refuse(std::string(kind.name) + " takes " + (list != nullptr ? "no list" : "a list") + " for " +
              std::string(kind.roles[place]));
-    if (list == nullptr) {
+    if (!IsVariable(kind.takes[place]) && list == nullptr) {
+      TakeExtra(kind, place, arguments[place]);
+    } else if (list == nullptr) {
       Take(kind, place, arguments[place]);
     } else if (list->empty()) {
       Refuse(std::string(kind.name) + " takes at least one member in " + std::string(kind.roles[place]));
@@ -127,8 +133,24 @@ void Model::Flatten(const Kind& kind, std::span<const Argument> arguments) {
   }
 }
 
+// What is no variable.
+void Model::TakeExtra(const Kind& kind, std::size_t place, const Argument& argument) {
+  const auto* const text = std::get_if<std::string>(&argument.mValue);
+  const auto* const rows = std::get_if<Rows>(&argument.mValue);
+  if (kind.takes[place] == Takes::Expression && text != nullptr) {
+    mExpression = mExpressions.emplace_back(std::make_shared<Expression>(*text)).get();
+  } else if (kind.takes[place] == Takes::Rows && rows != nullptr) {
+    for (const auto& row : rows->rows) std::for_each(row.begin(), row.end(), CheckText);
+    mTable = mTables.emplace_back(std::make_shared<Table>(*rows, mPosted.size())).get();
+  } else {
+    Refuse(std::string(kind.name) + " cannot take this for " + std::string(kind.roles[place]));
+  }
+}
+
 void Model::Take(const Kind& kind, std::size_t place, const Argument& argument) {
   if (argument.IsList()) Refuse("a list holds no list");
+  if (std::holds_alternative<Rows>(argument.mValue))
+    Refuse(std::string(kind.name) + " takes no table for " + std::string(kind.roles[place]));
   const Var variable = AddConstant(argument);
   const auto at = static_cast<std::size_t>(variable.index);
   if (at >= mVariables.size()) Refuse("no variable of this model");
@@ -151,7 +173,11 @@ std::span<const int> Model::Keep(std::span<const int> numbers) {
 }
 
 Model::Model(const Model& other)
-    : mVariables(other.mVariables), mConstraints(other.mConstraints), mWanted(other.mWanted) {
+    : mVariables(other.mVariables),
+      mConstraints(other.mConstraints),
+      mExpressions(other.mExpressions),
+      mTables(other.mTables),
+      mWanted(other.mWanted) {
   for (Constraint& constraint : mConstraints) constraint.arguments = Keep(constraint.arguments);
 }
 
@@ -159,6 +185,8 @@ Model& Model::operator=(Model other) noexcept {
   mVariables.swap(other.mVariables);
   mConstraints.swap(other.mConstraints);
   mArguments.swap(other.mArguments);
+  mExpressions.swap(other.mExpressions);
+  mTables.swap(other.mTables);
   mWanted.swap(other.mWanted);
   return *this;
 }

@@ -11,7 +11,7 @@ namespace {
 constexpr std::int64_t kLeast = std::numeric_limits<ZORLong>::min();
 constexpr std::int64_t kGreatest = std::numeric_limits<ZORLong>::max();
 constexpr std::int64_t kBeyond = kGreatest + 2;  // no integer, nor its opposite
-constexpr std::ptrdiff_t kMostOpen = 20;  // beyond, two numbers each are too many combinations
+constexpr std::ptrdiff_t kMostOpen = 20;         // beyond, two numbers each are too many combinations
 
 std::int64_t DivideDown(std::int64_t a, std::int64_t b) { return a / b - (a % b != 0 && (a < 0) != (b < 0) ? 1 : 0); }
 std::int64_t DivideUp(std::int64_t a, std::int64_t b) { return -DivideDown(-a, b); }

@@ -30,9 +30,16 @@ Operation ForwardOf(Meaning meaning) {
       return Operation::Sum;
     case Meaning::Product:
       return Operation::Product;
-    default:
+    case Meaning::TextForm:
       return Operation::TextForm;
+    default:
+      return Operation::Supports;
   }
+}
+
+// Whether the module has an operation for it that takes sets.
+bool TakesSets(Meaning meaning) {
+  return meaning >= Meaning::Concatenation && meaning < Meaning::TextForm && meaning != Meaning::Slice;
 }
 
 // Whether it takes any number of inputs.
@@ -76,12 +83,14 @@ Functions::Functions(Store& store, std::size_t budget)
 // Inputs with one value each give the result by one forward operation. An Undefined result takes what the module makes
 // of the sets of inputs. Everything else needs supports, or the module's sets again where these exceed the budget.
 Status Functions::Narrow(const Constraint& constraint) {
-  if (HasExactInputs(constraint)) {
+  if (constraint.kind->IsRelation() && !constraint.kind->reified) return NarrowRelation(constraint);
+  if (HasExact(constraint.arguments.first(constraint.Inputs()))) {
     ComputeExact(constraint);
     return Status::Subsumed;
   }
   if (constraint.kind->IsOfNumbers()) return NarrowNumbers(constraint);
   if (constraint.kind->meaning == Meaning::Length) BoundLength(constraint.Result());
+  if (constraint.kind->meaning == Meaning::Position && !constraint.kind->reified) BoundPosition(constraint.Result());
   if (mStore.HasFailed()) return Status::Fixpoint;
   if (constraint.kind->meaning == Meaning::Successor && constraint.arguments[0] == constraint.Result()) {
     mStore.StartOperation(Operation::Successor);
@@ -103,16 +112,27 @@ Status Functions::NarrowNumbers(const Constraint& constraint) {
   return mSupports.Narrow(constraint) ? Status::Fixpoint : Status::Again;
 }
 
-bool Functions::HasExactInputs(const Constraint& constraint) const {
-  const auto inputs = constraint.arguments.first(constraint.Inputs());
-  return std::all_of(inputs.begin(), inputs.end(), [this](int input) { return mStore[input].IsOne(); });
+// Nothing is computed: the values that are left must be related.
+Status Functions::NarrowRelation(const Constraint& constraint) {
+  if (!HasExact(constraint.arguments)) {
+    mSupports.Narrow(constraint);
+    return Status::Fixpoint;
+  }
+  TakeExact(constraint.arguments);
+  mStore.StartOperation(Operation::Supports);
+  if (!mSemantics.Holds(constraint, mExact)) mStore.Fail(constraint.arguments.front());
+  return Status::Subsumed;
 }
 
-void Functions::ComputeExact(const Constraint& constraint) {
-  mExact.resize(constraint.Inputs());
-  mTexts.resize(std::max(mTexts.size(), constraint.Inputs()));
-  for (std::size_t i = 0; i < constraint.Inputs(); ++i) {
-    const Value& value = mStore[constraint.arguments[i]];
+bool Functions::HasExact(std::span<const int> variables) const {
+  return std::all_of(variables.begin(), variables.end(), [this](int variable) { return mStore[variable].IsOne(); });
+}
+
+void Functions::TakeExact(std::span<const int> variables) {
+  mExact.resize(variables.size());
+  mTexts.resize(std::max(mTexts.size(), variables.size()));
+  for (std::size_t i = 0; i < variables.size(); ++i) {
+    const Value& value = mStore[variables[i]];
     if (IsText(value.Sort())) {
       mTexts[i] = value.LowestText();
       mExact[i] = {&mTexts[i], 0, value.Sort()};
@@ -120,11 +140,15 @@ void Functions::ComputeExact(const Constraint& constraint) {
       mExact[i] = {nullptr, value.LowestNumber(), value.Sort()};
     }
   }
+}
+
+void Functions::ComputeExact(const Constraint& constraint) {
+  TakeExact(constraint.arguments.first(constraint.Inputs()));
   const bool isExtreme = constraint.kind->IsOfNumbers() && constraint.kind->meaning != Meaning::Sum &&
                          constraint.kind->meaning != Meaning::Product;
   mStore.StartOperation(isExtreme ? Operation::Bounds : ForwardOf(constraint.kind->meaning));
   Answer answer;
-  if (!mSemantics.Compute(*constraint.kind, mExact, answer)) return mStore.Fail(constraint.Result());
+  if (!mSemantics.Compute(constraint, mExact, answer)) return mStore.Fail(constraint.Result());
   MeetResult(constraint, answer);
 }
 
@@ -141,7 +165,7 @@ void Functions::MeetResult(const Constraint& constraint, const Answer& answer) {
 // False when the module has no such operation on sets, or when it would lose results.
 bool Functions::ComputeSets(const Constraint& constraint) {
   const Meaning meaning = constraint.kind->meaning;
-  if (meaning == Meaning::Slice || meaning == Meaning::TextForm || !HasKnownInputs(constraint)) return false;
+  if (!TakesSets(meaning) || !HasKnownInputs(constraint)) return false;
   const Value& first = AsSet(constraint.arguments[0], mX);
   if (meaning == Meaning::Length) {
     Value& lengths = mStore.FreshLike(constraint.Result());
@@ -235,6 +259,11 @@ void Functions::MeetSet(int variable, const Value& set) {
 void Functions::BoundLength(int number) {
   mStore.StartOperation(Operation::Length);
   mStore.Bound(number, 0, kTextLimit);
+}
+
+void Functions::BoundPosition(int number) {
+  mStore.StartOperation(Operation::Supports);
+  mStore.Bound(number, -1, kLastPosition);
 }
 
 // Narrows positions and slice by each other, whatever the text is. True when the slice must be empty.

@@ -1,4 +1,4 @@
-// Narrowing of the constraints whose last argument is a function of the others.
+// Narrowing of the constraints whose last argument is a function of the others, and of those that only supports narrow.
 #pragma once
 
 #include "network/arithmetic.h"
@@ -17,7 +17,9 @@ class Functions {
 
  private:
   Status NarrowNumbers(const Constraint& constraint);
-  bool HasExactInputs(const Constraint& constraint) const;
+  Status NarrowRelation(const Constraint& constraint);
+  bool HasExact(std::span<const int> variables) const;
+  void TakeExact(std::span<const int> variables);
   void ComputeExact(const Constraint& constraint);
   void MeetResult(const Constraint& constraint, const Answer& answer);
 
@@ -29,6 +31,7 @@ class Functions {
   const Value& AsSet(int variable, Value& set);
   void MeetSet(int variable, const Value& set);
   void BoundLength(int number);
+  void BoundPosition(int number);
   bool BoundSlice(const Constraint& constraint);
   void BoundPositions(int from, int to, std::int64_t shortest);
   void DropLongTexts(int variable, std::int64_t longest);

@@ -39,8 +39,7 @@ bool Semantics::ComputeNumber(const Kind& kind, std::span<const Exact> inputs, A
   return IsInteger(number);
 }
 
-std::optional<std::vector<Answer>> Semantics::InvertNumber(const Kind& kind, std::size_t position,
-                                                           std::span<const Exact> values) {
+Semantics::Answers Semantics::InvertNumber(const Kind& kind, std::size_t position, std::span<const Exact> values) {
   const std::int64_t result = values.back().number;
   std::optional<std::int64_t> others;
   for (std::size_t i = 0; i + 1 < values.size(); ++i) {

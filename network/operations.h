@@ -28,6 +28,7 @@ enum class Operation {
   Sum,
   Product,
   Bounds,
+  Matching,
   Supports,
   Choice,
 };
@@ -55,6 +56,7 @@ constexpr std::string_view NameOf(Operation operation) {
                                                                 "sum",
                                                                 "product",
                                                                 "bounds",
+                                                                "matching",
                                                                 "supports",
                                                                 "choice"};
   return kNames[static_cast<std::size_t>(operation)];

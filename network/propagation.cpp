@@ -14,7 +14,13 @@ constexpr std::uint64_t kProgressSteps = 256;
 }  // namespace
 
 Propagation::Propagation(Store& store, const Limits& limits)
-    : mStore(store), mModel(store.Model()), mLimits(limits), mRelations(store), mFunctions(store, limits.budget) {
+    : mStore(store),
+      mModel(store.Model()),
+      mLimits(limits),
+      mRelations(store),
+      mFunctions(store, limits.budget),
+      mAllDifferent(store),
+      mTables(store) {
   Connect();
   mShavings.resize(mModel.Variables().size(), 0);
   mStates.resize(mModel.Constraints().size(), Idle);
@@ -72,14 +78,20 @@ bool Propagation::CountStep() {
 }
 
 Status Propagation::Narrow(int constraint) {
-  const Constraint& what = mModel.Constraints()[static_cast<std::size_t>(constraint)];
   mStore.StartConstraint(constraint);
-  const Status status = what.kind->IsRelation() ? mRelations.Narrow(what) : mFunctions.Narrow(what);
+  const Status status = Narrow(mModel.Constraints()[static_cast<std::size_t>(constraint)]);
   if (status == Status::Subsumed) {
     mStates[static_cast<std::size_t>(constraint)] = Finished;
     mFinished.push_back(constraint);
   }
   return status;
+}
+
+Status Propagation::Narrow(const Constraint& constraint) {
+  if (constraint.kind->IsComparison()) return mRelations.Narrow(constraint);
+  if (constraint.kind->meaning == Meaning::AllDifferent) return mAllDifferent.Narrow(constraint);
+  if (constraint.kind->meaning == Meaning::Row) return mTables.Narrow(constraint);
+  return mFunctions.Narrow(constraint);
 }
 
 // A constraint that finds in one pass all that it can find is not woken by its own changes.

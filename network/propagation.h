@@ -9,9 +9,11 @@
 #include <span>
 #include <vector>
 
+#include "network/all_different.h"
 #include "network/functions.h"
 #include "network/relations.h"
 #include "network/store.h"
+#include "network/tables.h"
 
 namespace zornet {
 
@@ -44,6 +46,7 @@ class Propagation {
   bool IsShaved(int variable);
   void FailCycle();
   Status Narrow(int constraint);
+  Status Narrow(const Constraint& constraint);
   int Next();
 
   Store& mStore;
@@ -51,6 +54,8 @@ class Propagation {
   Limits mLimits;
   Relations mRelations;
   Functions mFunctions;
+  AllDifferent mAllDifferent;
+  Tables mTables;
   Teller mTeller;
 
   // Constraints that read a variable: mReaders[mFirstReader[v]] and those up to mFirstReader[v + 1].

@@ -208,7 +208,11 @@ Status Relations::Decide(Meaning meaning, int x, int y, int truth) {
 // False while the relation is open.
 bool Relations::Ask(Meaning meaning, int x, int y, Value& answer) {
   if (!IsText(mStore[x].Sort())) return mNumbers.Ask(meaning, x, y, answer);
-  return mStore[x].IsKnown() && mStore[y].IsKnown() && AskTexts(meaning, x, y, answer);
+  if (!mStore[x].IsKnown() || !mStore[y].IsKnown()) return false;
+  if (meaning != Meaning::Unequal) return AskTexts(meaning, x, y, answer);
+  if (!AskTexts(Meaning::Equal, x, y, answer)) return false;
+  answer.SetNumber(1 - answer.LowestNumber());
+  return true;
 }
 
 // Where the module would judge least texts by their state, their texts decide.

@@ -2,7 +2,12 @@
 
 #include <algorithm>
 #include <limits>
+#include <set>
 #include <string>
+#include <string_view>
+
+#include "network/expression.h"
+#include "network/tables.h"
 
 namespace zornet {
 
@@ -43,6 +48,62 @@ std::optional<std::vector<Answer>> CaseVariants(const ZORString& text) {
   return found;
 }
 
+std::int32_t PositionOf(std::string_view text, std::string_view part) {
+  const std::size_t at = text.find(part);
+  return at == std::string_view::npos ? -1 : static_cast<std::int32_t>(at);
+}
+
+std::size_t CountReplaced(std::string_view text, std::string_view from, Meaning meaning) {
+  if (meaning == Meaning::ReplaceFirst) return text.find(from) == std::string_view::npos ? 0 : 1;
+  std::size_t count = 0;
+  for (std::size_t at = text.find(from); !from.empty() && at != std::string_view::npos;
+       at = text.find(from, at + from.size()))
+    ++count;
+  return count;
+}
+
+ZORString Replace(std::string_view text, std::string_view from, std::string_view to, Meaning meaning) {
+  std::string replaced;
+  for (std::size_t count = CountReplaced(text, from, meaning); count > 0; --count) {
+    const std::size_t at = text.find(from);
+    replaced.append(text.substr(0, at)).append(to);
+    text.remove_prefix(at + from.size());
+  }
+  replaced.append(text);
+  return replaced.size() > kTextLimit ? GreatestText() : ToZor(replaced);
+}
+
+// All beginnings or all ends of a text.
+std::vector<Answer> Ends(std::string_view text, Meaning meaning) {
+  std::vector<Answer> found;
+  for (std::size_t length = 0; length <= text.size(); ++length)
+    found.push_back({ToZor(text.substr(meaning == Meaning::Prefix ? 0 : text.size() - length, length)), 0});
+  return found;
+}
+
+// What begins there.
+std::vector<Answer> Starts(std::string_view text, std::int64_t from) {
+  if (from < 0 || from > static_cast<std::int64_t>(text.size())) return {};
+  return Ends(text.substr(static_cast<std::size_t>(from)), Meaning::Prefix);
+}
+
+std::optional<std::vector<Answer>> Parts(std::string_view text) {
+  std::set<std::string_view> parts{std::string_view()};
+  for (std::size_t from = 0; from < text.size(); ++from) {
+    for (std::size_t length = 1; length <= text.size() - from; ++length) parts.insert(text.substr(from, length));
+    if (parts.size() > zor::kSetLimit) return std::nullopt;
+  }
+  std::vector<Answer> found;
+  for (const std::string_view part : parts) found.push_back({ToZor(part), 0});
+  return found;
+}
+
+bool AreDifferent(std::span<const Exact> values) {
+  std::set<std::string_view> texts;
+  return std::all_of(values.begin(), values.end(),
+                     [&](const Exact& value) { return texts.insert(ToView(*value.text)).second; });
+}
+
 bool EndsWithSpace(const ZORString& text) { return ToView(text).ends_with(' '); }
 
 }  // namespace
@@ -52,8 +113,14 @@ Semantics::Semantics(const Types& types)
   for (int i = 0; i < kSorts; ++i) mForms.emplace_back(types, static_cast<Sort>(i));
 }
 
+bool Semantics::Compute(const Constraint& constraint, std::span<const Exact> inputs, Answer& result) {
+  if (!constraint.kind->reified) return ComputeFunction(*constraint.kind, inputs, result);
+  result.number = IsTrue(constraint, inputs) ? 1 : 0;
+  return true;
+}
+
 // Operands are Exact, the greatest text too: the module would fold a Max by its state.
-bool Semantics::Compute(const Kind& kind, std::span<const Exact> inputs, Answer& result) {
+bool Semantics::ComputeFunction(const Kind& kind, std::span<const Exact> inputs, Answer& result) {
   if (kind.IsOfNumbers()) return ComputeNumber(kind, inputs, result);
   if (kind.meaning == Meaning::TextForm) return ComputeTextForm(inputs[0], result);
   const ZORString& x = *inputs[0].text;
@@ -66,6 +133,13 @@ bool Semantics::Compute(const Kind& kind, std::span<const Exact> inputs, Answer&
     case Meaning::Maximum:
       result.text = inputs.size() == 1 ? x : Fold(kind.meaning, x, *inputs[1].text);
       for (std::size_t i = 2; i < inputs.size(); ++i) result.text = Fold(kind.meaning, result.text, *inputs[i].text);
+      return true;
+    case Meaning::Position:
+      result.number = PositionOf(ToView(x), ToView(*inputs[1].text));
+      return true;
+    case Meaning::ReplaceFirst:
+    case Meaning::ReplaceAll:
+      result.text = Replace(ToView(x), ToView(*inputs[1].text), ToView(*inputs[2].text), kind.meaning);
       return true;
     default:
       break;
@@ -128,13 +202,57 @@ bool Semantics::ComputeTextForm(const Exact& value, Answer& result) {
 // A number has one text form, whatever its sort; the module would put a set of one number in braces.
 Value& Semantics::FormOf(Sort sort) { return mForms[static_cast<std::size_t>(IsInteger(sort) ? Sort::Integer : sort)]; }
 
-std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, std::size_t position,
-                                                     std::span<const Exact> values) {
-  if (kind.IsOfNumbers()) return InvertNumber(kind, position, values);
+bool Semantics::CanInvert(const Kind& kind, std::size_t position) {
+  switch (kind.meaning) {
+    case Meaning::Slice:
+    case Meaning::Prefix:
+    case Meaning::Suffix:
+      return position == 0;
+    case Meaning::Contains:
+      return position == 1;
+    case Meaning::Position:
+    case Meaning::ReplaceAll:
+      return position > 0;
+    case Meaning::Matches:
+      return false;
+    default:
+      return true;
+  }
+}
+
+Semantics::Answers Semantics::Invert(const Constraint& constraint, std::size_t position,
+                                     std::span<const Exact> values) {
+  if (!constraint.kind->reified) return InvertTrue(constraint, position, values);
+  if (values.back().number == 0) return std::nullopt;
+  return InvertTrue(constraint, position, values.first(values.size() - 1));
+}
+
+// Of what is true.
+Semantics::Answers Semantics::InvertTrue(const Constraint& constraint, std::size_t position,
+                                         std::span<const Exact> values) {
+  const Kind& kind = *constraint.kind;
   const Exact& result = values.back();
   std::vector<Answer> proposals;
+  if (!kind.IsRelation() && position + 1 == values.size()) {
+    proposals.emplace_back();
+    if (!ComputeFunction(kind, values.first(position), proposals.back())) proposals.clear();
+    return proposals;
+  }
+  if (kind.IsOfNumbers()) return InvertNumber(kind, position, values);
   proposals.reserve(2);
   switch (kind.meaning) {
+    case Meaning::Prefix:
+    case Meaning::Suffix:
+      return Ends(ToView(*values[1].text), kind.meaning);
+    case Meaning::Contains:
+      return Parts(ToView(*values[0].text));
+    case Meaning::Position:
+      if (result.number == -1) return std::nullopt;
+      proposals = Starts(ToView(*values[0].text), result.number);
+      return Filter(constraint, position, values, proposals);
+    case Meaning::ReplaceFirst:
+    case Meaning::ReplaceAll:
+      return InvertReplacement(constraint, position, values);
     case Meaning::Concatenation:
       if (*result.text == GreatestText()) return std::nullopt;  // every text that is too long gives it
       break;
@@ -148,7 +266,7 @@ std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, std::size
       break;
     case Meaning::Lower:
     case Meaning::Upper:  // a folded text is its own fold, and others fold to it
-      if (!Gives(kind, position, {*result.text, 0}, values)) return proposals;
+      if (!Gives(constraint, position, {*result.text, 0}, values)) return proposals;
       return CaseVariants(*result.text);
     case Meaning::Length:
       if (result.number == 1) return WithCharacterBefore(ZORString());
@@ -160,17 +278,56 @@ std::optional<std::vector<Answer>> Semantics::Invert(const Kind& kind, std::size
       break;
   }
   Propose(kind, position, values, proposals);
+  return Filter(constraint, position, values, proposals);
+}
+
+// Those of the proposals that give the result, each once.
+Semantics::Answers Semantics::Filter(const Constraint& constraint, std::size_t position, std::span<const Exact> values,
+                                     std::vector<Answer>& proposals) {
   std::vector<Answer> found;
   found.reserve(proposals.size());
   for (Answer& proposal : proposals) {
     const bool again = std::find(found.begin(), found.end(), proposal) != found.end();
-    if (!again && Gives(kind, position, proposal, values)) found.push_back(std::move(proposal));
+    if (!again && Gives(constraint, position, proposal, values)) found.push_back(std::move(proposal));
   }
   return found;
 }
 
+// What is replaced stood where the replacement stands now, or nowhere.
+Semantics::Answers Semantics::InvertReplacement(const Constraint& constraint, std::size_t position,
+                                                std::span<const Exact> values) {
+  const ZORString& result = *values[3].text;
+  const std::string_view z = ToView(result);
+  if (result == GreatestText()) return std::nullopt;  // every text that is too long gives it
+  std::vector<Answer> proposals;
+  if (position == 0) {
+    const std::string_view from = ToView(*values[1].text), to = ToView(*values[2].text);
+    proposals.push_back({result, 0});
+    for (std::size_t at = z.find(to); at != std::string_view::npos; at = z.find(to, at + 1)) {
+      if (z.size() - to.size() + from.size() <= kTextLimit)
+        proposals.push_back({ToZor(std::string(z.substr(0, at)).append(from).append(z.substr(at + to.size()))), 0});
+    }
+    return Filter(constraint, position, values, proposals);
+  }
+  const std::string_view x = ToView(*values[0].text);
+  if (position == 1) {
+    if (x == z) return std::nullopt;
+    auto parts = Parts(x);
+    if (!parts) return std::nullopt;
+    proposals = std::move(*parts);
+  } else {
+    const std::string_view from = ToView(*values[1].text);
+    const std::size_t count = CountReplaced(x, from, constraint.kind->meaning);
+    if (count == 0) return x == z ? std::nullopt : std::optional(proposals);
+    const std::size_t rest = x.size() - count * from.size();
+    if (z.size() < rest) return proposals;
+    proposals.push_back({ToZor(z.substr(x.find(from), (z.size() - rest) / count)), 0});
+  }
+  return Filter(constraint, position, values, proposals);
+}
+
 // The texts from one to another, both included.
-std::optional<std::vector<Answer>> Semantics::Between(const ZORString& lowest, const ZORString& highest) {
+Semantics::Answers Semantics::Between(const ZORString& lowest, const ZORString& highest) {
   constexpr int kFewBehind = static_cast<int>(kTextLimit) - 2;  // behind a shorter text there are more than a set lists
   const bool spaces = ToView(highest).find_first_not_of(' ') == std::string_view::npos;
   if (!spaces && lowest.GetLengthInChar() <= kFewBehind) return std::nullopt;
@@ -186,7 +343,7 @@ std::optional<std::vector<Answer>> Semantics::Between(const ZORString& lowest, c
 }
 
 // Where the slice ends before it should, it is the end of the text.
-std::optional<std::vector<Answer>> Semantics::InvertSlice(std::span<const Exact> values) {
+Semantics::Answers Semantics::InvertSlice(std::span<const Exact> values) {
   const ZORString& slice = *values[3].text;
   const std::int64_t from = values[1].number, length = slice.GetLengthInChar();
   const std::int64_t wanted = std::int64_t{values[2].number} - from + 1;
@@ -210,11 +367,12 @@ ZORString Semantics::FoldOthers(Meaning meaning, std::span<const Exact> inputs, 
 }
 
 // Whether this input gives the result with the others.
-bool Semantics::Gives(const Kind& kind, std::size_t position, const Answer& input, std::span<const Exact> values) {
+bool Semantics::Gives(const Constraint& constraint, std::size_t position, const Answer& input,
+                      std::span<const Exact> values) {
   mGiven.assign(values.begin(), values.end());
   mGiven[position].text = &input.text;
   mGiven[position].number = input.number;
-  return Holds(kind, mGiven);
+  return IsTrue(constraint, mGiven);
 }
 
 // Inputs among which all are that give the result: of the module's inverses, and those that it misses.
@@ -265,18 +423,43 @@ void Semantics::Take(std::vector<Answer>& proposals, const Value& target) {
   proposals.push_back(text ? Answer{target.LowestText(), 0} : Answer{ZORString(), target.LowestNumber()});
 }
 
-bool Semantics::Holds(const Kind& kind, std::span<const Exact> values) {
-  if (kind.IsRelation()) {
-    const Exact& x = values[kind.mirrored ? 1 : 0];
-    const Exact& y = values[kind.mirrored ? 0 : 1];
-    const bool holds =
-        kind.IsOfNumbers() ? Relates(kind.meaning, x.number, y.number) : Relates(kind.meaning, *x.text, *y.text);
-    return kind.reified ? holds == (values[2].number != 0) : holds;
+// Of what is neither equality nor order.
+bool Semantics::RelatesTexts(const Constraint& constraint, std::span<const Exact> values) {
+  const std::string_view x = ToView(*values[0].text);
+  const auto y = [&] { return ToView(*values[1].text); };
+  switch (constraint.kind->meaning) {
+    case Meaning::Prefix:
+      return y().starts_with(x);
+    case Meaning::Suffix:
+      return y().ends_with(x);
+    case Meaning::Contains:
+      return x.find(y()) != std::string_view::npos;
+    case Meaning::Matches:
+      return constraint.expression->Matches(x);
+    case Meaning::AllDifferent:
+      return AreDifferent(values);
+    default:
+      return constraint.table->Has(values);
   }
+}
+
+// Whether the relation holds, or the function gives its last value.
+bool Semantics::IsTrue(const Constraint& constraint, std::span<const Exact> values) {
+  const Kind& kind = *constraint.kind;
+  if (kind.IsComparison()) {
+    const Exact &x = values[kind.mirrored ? 1 : 0], &y = values[kind.mirrored ? 0 : 1];
+    return kind.IsOfNumbers() ? Relates(kind.meaning, x.number, y.number) : Relates(kind.meaning, *x.text, *y.text);
+  }
+  if (kind.IsRelation()) return RelatesTexts(constraint, values);
   Answer answer;
-  if (!Compute(kind, values.first(values.size() - 1), answer)) return false;
+  if (!ComputeFunction(kind, values.first(values.size() - 1), answer)) return false;
   const Exact& result = values.back();
-  return result.text != nullptr ? answer.text == *result.text : answer.number == result.number;
+  return IsText(result.sort) ? answer.text == *result.text : answer.number == result.number;
+}
+
+bool Semantics::Holds(const Constraint& constraint, std::span<const Exact> values) {
+  if (!constraint.kind->reified) return IsTrue(constraint, values);
+  return IsTrue(constraint, values.first(values.size() - 1)) == (values.back().number != 0);
 }
 
 }  // namespace zornet

@@ -9,6 +9,9 @@
 //                  below 0, behind the text, or behind its own end
 //   successor      of the greatest text: itself
 //   text form      of more than 255 characters: none
+//   position       of the empty text: 0
+//   replacement    of the empty text: it stands before the first character and, where all are replaced, nowhere; of
+//                  more than 255 characters: the greatest text
 //   sum, product   outside the 32-bit integers: none
 #pragma once
 
@@ -40,35 +43,40 @@ class Semantics {
  public:
   explicit Semantics(const Types& types);
 
-  // The value of a function; false when it has none.
-  bool Compute(const Kind& kind, std::span<const Exact> inputs, Answer& result);
+  // The value of a function, or the truth of what is reified; false when there is none.
+  bool Compute(const Constraint& constraint, std::span<const Exact> inputs, Answer& result);
 
   // All values of one input that give the result with the other inputs; nothing when they are too many to be listed.
   // Ignores values[position].
-  std::optional<std::vector<Answer>> Invert(const Kind& kind, std::size_t position, std::span<const Exact> values);
+  std::optional<std::vector<Answer>> Invert(const Constraint& constraint, std::size_t position,
+                                            std::span<const Exact> values);
 
-  // Whether Invert ever lists something for an input.
-  static bool CanInvert(const Kind& kind, std::size_t position) {
-    return kind.meaning != Meaning::Slice || position == 0;
-  }
+  // Whether Invert ever lists something for an argument.
+  static bool CanInvert(const Kind& kind, std::size_t position);
 
   template <class T>
   static bool Relates(Meaning meaning, const T& x, const T& y);
-  bool Holds(const Constraint& constraint, std::span<const Exact> values) { return Holds(*constraint.kind, values); }
-  bool Holds(const Kind& kind, std::span<const Exact> values);
+  bool Holds(const Constraint& constraint, std::span<const Exact> values);
 
  private:
+  using Answers = std::optional<std::vector<Answer>>;
+
+  bool IsTrue(const Constraint& constraint, std::span<const Exact> values);
+  static bool RelatesTexts(const Constraint& constraint, std::span<const Exact> values);
+  bool ComputeFunction(const Kind& kind, std::span<const Exact> inputs, Answer& result);
   static bool ComputeNumber(const Kind& kind, std::span<const Exact> inputs, Answer& result);
-  static std::optional<std::vector<Answer>> InvertNumber(const Kind& kind, std::size_t position,
-                                                         std::span<const Exact> values);
+  Answers InvertTrue(const Constraint& constraint, std::size_t position, std::span<const Exact> values);
+  Answers InvertReplacement(const Constraint& constraint, std::size_t position, std::span<const Exact> values);
+  static Answers InvertNumber(const Kind& kind, std::size_t position, std::span<const Exact> values);
+  Answers Filter(const Constraint& constraint, std::size_t position, std::span<const Exact> values,
+                 std::vector<Answer>& proposals);
   bool ComputeTextForm(const Exact& value, Answer& result);
   ZORString Fold(Meaning meaning, const ZORString& x, const ZORString& y);
   ZORString FoldOthers(Meaning meaning, std::span<const Exact> inputs, std::size_t except);
   Value& FormOf(Sort sort);
-  bool Gives(const Kind& kind, std::size_t position, const Answer& input, std::span<const Exact> values);
-  std::optional<std::vector<Answer>> InvertFold(const Kind& kind, std::size_t position, std::span<const Exact> values);
-  static std::optional<std::vector<Answer>> InvertSlice(std::span<const Exact> values);
-  std::optional<std::vector<Answer>> Between(const ZORString& lowest, const ZORString& highest);
+  bool Gives(const Constraint& constraint, std::size_t position, const Answer& input, std::span<const Exact> values);
+  static Answers InvertSlice(std::span<const Exact> values);
+  Answers Between(const ZORString& lowest, const ZORString& highest);
   void Propose(const Kind& kind, std::size_t position, std::span<const Exact> values, std::vector<Answer>& proposals);
   void ProposeByTextForm(const Exact& value, const ZORString& form, std::vector<Answer>& proposals);
   void Take(std::vector<Answer>& proposals, const Value& target);

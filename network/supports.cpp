@@ -62,12 +62,12 @@ Supports::Supports(Store& store, Semantics& semantics, std::size_t budget)
 bool Supports::Narrow(const Constraint& constraint) {
   Prepare(constraint);
   mTargets.clear();
-  for (std::size_t position = constraint.arguments.size(); position-- > 0;) {
-    const bool result = position == constraint.Inputs();
-    if (!result && !Semantics::CanInvert(*constraint.kind, position)) continue;
+  for (std::size_t position = mForward + 1; position-- > 0;) {
+    const bool forward = position == mForward;
+    if (!forward && !Semantics::CanInvert(*constraint.kind, position)) continue;
     const double combinations = Combinations(constraint, position);
     if (combinations <= static_cast<double>(mBudget)) {
-      mTargets.emplace_back(combinations * (result ? 1 : kInversionCost), position);
+      mTargets.emplace_back(combinations * (forward ? 1 : kInversionCost), position);
     }
   }
   std::sort(mTargets.begin(), mTargets.end(),
@@ -84,6 +84,8 @@ void Supports::Prepare(const Constraint& constraint) {
   const std::size_t arity = constraint.arguments.size();
   for (Column* column : mTried) column->tried = false;
   mTried.clear();
+  const bool posted = constraint.kind->IsRelation() && !constraint.kind->reified;
+  mForward = posted ? arity : arity - 1;
   mCount = 0;
   mColumns.resize(std::max(mColumns.size(), arity));
   mColumnOf.resize(arity);
@@ -177,12 +179,14 @@ void Supports::Start() {
 
 bool Supports::TryOne(const Constraint& constraint, std::size_t target) {
   bool accepted = false;
-  if (target == constraint.Inputs()) {
+  if (target == mExact.size()) {
+    accepted = mSemantics.Holds(constraint, mExact);
+  } else if (target == mForward) {
     Answer answer;
-    accepted = mSemantics.Compute(*constraint.kind, std::span(mExact).first(target), answer) &&
-               Accept(target, std::move(answer));
+    accepted =
+        mSemantics.Compute(constraint, std::span(mExact).first(target), answer) && Accept(target, std::move(answer));
   } else {
-    auto answers = mSemantics.Invert(*constraint.kind, target, mExact);
+    auto answers = mSemantics.Invert(constraint, target, mExact);
     if (!answers && At(target).IsListed()) return false;
     if (!answers) accepted = At(target).open = true;
     if (answers) {

@@ -88,8 +88,9 @@ class Supports {
   Store& mStore;
   Semantics& mSemantics;
   std::size_t mBudget;
-  std::size_t mCount = 0;                                // of the columns in use
-  std::vector<Column> mColumns;                          // one for each different variable
+  std::size_t mForward = 0;      // the position of the result, or behind all when there is none: a relation is posted
+  std::size_t mCount = 0;        // of the columns in use
+  std::vector<Column> mColumns;  // one for each different variable
   std::vector<std::size_t> mColumnOf;                    // by position
   std::vector<std::size_t> mColumnOfVariable;            // good where that column has the variable
   std::vector<Exact> mExact;                             // what is tried, by position

@@ -123,6 +123,11 @@ class Check {
     for (const naive::Constraint& constraint : mNetwork.constraints) {
       text += constraint.name;
       for (const int argument : constraint.arguments) text += " v" + std::to_string(argument);
+      if (!constraint.expression.empty()) text += " \"" + constraint.expression + '"';
+      for (const auto& row : constraint.rows) {
+        text += " |";
+        for (const std::string& cell : row) text += " \"" + cell + '"';
+      }
       text += "\n";
     }
     return text;

@@ -4,6 +4,7 @@
 #include <limits>
 #include <map>
 #include <numeric>
+#include <regex>
 #include <set>
 
 namespace naive {
@@ -33,6 +34,28 @@ std::string Next(std::string text) {
   while (text.back() == 'z') text.pop_back();
   ++text.back();
   return text;
+}
+
+std::int64_t Find(const std::string& text, const std::string& part) {
+  for (std::size_t i = 0; i + part.size() <= text.size(); ++i) {
+    if (text.compare(i, part.size(), part) == 0) return static_cast<std::int64_t>(i);
+  }
+  return -1;
+}
+
+std::string Replace(const std::string& text, const std::string& from, const std::string& to, bool all) {
+  std::string replaced;
+  bool done = all && from.empty();
+  for (std::size_t i = 0; i <= text.size();) {
+    if (!done && i + from.size() <= text.size() && text.compare(i, from.size(), from) == 0) {
+      replaced += to;
+      i += from.size();
+      done = !all;
+    } else {
+      replaced += text.substr(i++, 1);
+    }
+  }
+  return replaced.size() > kLongest ? kGreatest : replaced;
 }
 
 std::string Form(Type type, const Value& value) {
@@ -86,6 +109,9 @@ std::optional<Value> Compute(const Network& network, const Constraint& constrain
   if (name == "str_min") return Value{*std::min_element(inputs.begin(), inputs.end()), 0};
   if (name == "str_max") return Value{*std::max_element(inputs.begin(), inputs.end()), 0};
   if (name == "str_next") return Value{Next(x), 0};
+  if (name == "str_find") return Value{"", Find(x, at(1).text)};
+  if (name == "str_replace" || name == "str_replace_all")
+    return Value{Replace(x, at(1).text, at(2).text, name == "str_replace_all"), 0};
   if (name == "str_text") {
     const std::string form = Form(network.variables[static_cast<std::size_t>(constraint.arguments[0])].type, at(0));
     if (form.size() <= kLongest) return Value{form, 0};
@@ -94,19 +120,42 @@ std::optional<Value> Compute(const Network& network, const Constraint& constrain
 }
 
 bool IsFunction(const Constraint& constraint) {
-  static const std::set<std::string> functions = {"str_concat", "str_substr", "str_length", "str_lower", "str_upper",
-                                                  "str_min",    "str_max",    "str_next",   "str_text"};
+  static const std::set<std::string> functions = {"str_concat", "str_substr", "str_length",  "str_lower",
+                                                  "str_upper",  "str_min",    "str_max",     "str_next",
+                                                  "str_text",   "str_find",   "str_replace", "str_replace_all"};
   return functions.contains(constraint.name) || FoldOf(constraint.name) != nullptr;
 }
 
-// A relation by its name behind the type.
-bool Compare(const std::string& relation, const Value& x, const Value& y) {
+bool Matches(const std::string& text, const std::string& expression) {
+  static std::map<std::string, std::regex> compiled;
+  return std::regex_match(text, compiled.try_emplace(expression, expression).first->second);
+}
+
+// Whether the relation holds, or the function gives its last value. Relations go by their name behind the type.
+bool IsTrue(const Network& network, const Constraint& constraint, const Assignment& values) {
+  if (IsFunction(constraint)) {
+    const auto image = Compute(network, constraint, values);
+    return image && *image == values[static_cast<std::size_t>(constraint.arguments.back())];
+  }
+  std::vector<Value> all;
+  for (const int argument : constraint.arguments) all.push_back(values[static_cast<std::size_t>(argument)]);
+  const Value &x = all.front(), &y = all.back();
+  const std::string relation = constraint.name.substr(constraint.name.find('_') + 1);
   if (relation == "eq" || relation == "bool2int") return x == y;
   if (relation == "ne" || relation == "not" || relation == "xor") return x != y;
   if (relation == "lt") return x < y;
   if (relation == "le" || relation == "imply") return x <= y;
   if (relation == "gt") return x > y;
-  return x >= y;
+  if (relation == "ge") return x >= y;
+  if (relation == "prefix") return x.text == y.text.substr(0, x.text.size());
+  if (relation == "suffix") return Find(y.text + '\n', x.text + '\n') >= 0;
+  if (relation == "contains") return Find(x.text, y.text) >= 0;
+  if (relation == "matches") return Matches(x.text, constraint.expression);
+  if (relation == "all_different") return std::set<Value>(all.begin(), all.end()).size() == all.size();
+  return std::any_of(constraint.rows.begin(), constraint.rows.end(), [&](const std::vector<std::string>& row) {
+    return std::equal(all.begin(), all.end(), row.begin(),
+                      [](const Value& v, const std::string& t) { return v.text == t; });
+  });
 }
 
 class Solver {
@@ -178,17 +227,12 @@ class Solver {
 }  // namespace
 
 bool Holds(const Network& network, const Constraint& constraint, const Assignment& values) {
-  const auto at = [&](std::size_t i) -> const Value& {
-    return values[static_cast<std::size_t>(constraint.arguments[i])];
-  };
-  if (IsFunction(constraint)) {
-    const auto image = Compute(network, constraint, values);
-    return image && *image == values[static_cast<std::size_t>(constraint.arguments.back())];
-  }
-  std::string relation = constraint.name.substr(constraint.name.find('_') + 1);
-  relation = relation.substr(0, relation.find("_reif"));
-  const bool holds = Compare(relation, at(0), at(1));
-  return constraint.arguments.size() == 2 ? holds : holds == (at(2).number != 0);
+  const bool reified = constraint.name.ends_with("_reif") || constraint.name == "bool_xor";
+  if (!reified) return IsTrue(network, constraint, values);
+  Constraint plain = constraint;
+  plain.name.resize(std::min(plain.name.size(), plain.name.find("_reif")));
+  plain.arguments.pop_back();
+  return IsTrue(network, plain, values) == (values[static_cast<std::size_t>(constraint.arguments.back())].number != 0);
 }
 
 void Solve(const Network& network, const std::vector<std::string>& universe,
@@ -215,6 +259,8 @@ zornet::Model Network::Build() const {
       list.emplace_back(zornet::Var{argument});
     }
     if (!members.empty()) arguments.insert(arguments.begin(), members);
+    if (!constraint.expression.empty()) arguments.insert(arguments.begin() + 1, constraint.expression);
+    if (!constraint.rows.empty()) arguments.emplace_back(zornet::Rows{constraint.rows});
     model.Post(*zornet::FindKind(constraint.name, !members.empty()), arguments);
   }
   return model;
@@ -302,33 +348,60 @@ class Maker {
     return kind == 2 ? std::vector<Value>{} : std::vector<Value>{{"", static_cast<std::int64_t>(kind)}};
   }
 
+  const char* Expression() {
+    static const char* const kExpressions[] = {"a*", "[ab]?z*", ".", "(a|b| )+", "[^a]*", "a.*|z", "..?", "A+b*"};
+    return kExpressions[Draw(std::size(kExpressions))];
+  }
+
+  std::vector<std::vector<std::string>> MakeRows(std::size_t columns) {
+    std::vector<std::vector<std::string>> rows(1 + Draw(12));
+    for (auto& row : rows) {
+      while (row.size() < columns) row.push_back(Text());
+    }
+    return rows;
+  }
+
   void AddConstraint() {
     struct Shape {
       const char* name;
-      const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything; *: a list of what follows
+      const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything; *: a list of what follows,
+                          // e: an expression, r: rows
     };
+    // clang-format off
     static constexpr Shape kShapes[] = {
-        {"str_eq", "tt"},        {"str_ne", "tt"},       {"str_lt", "tt"},          {"str_le", "tt"},
-        {"str_gt", "tt"},        {"str_ge", "tt"},       {"str_eq_reif", "ttb"},    {"str_lt_reif", "ttb"},
-        {"str_le_reif", "ttb"},  {"str_concat", "ttt"},  {"str_concat", "ttt"},     {"str_concat", "ttt"},
-        {"str_substr", "tiit"},  {"str_substr", "tiit"}, {"str_length", "ti"},      {"str_lower", "tt"},
-        {"str_upper", "tt"},     {"str_min", "ttt"},     {"str_max", "ttt"},        {"str_next", "tt"},
-        {"str_text", "at"},      {"str_concat", "*tt"},  {"str_concat", "*tt"},     {"str_min", "*tt"},
-        {"str_max", "*tt"},      {"int_eq", "ii"},       {"int_ne", "ii"},          {"int_lt", "ii"},
-        {"int_le", "ii"},        {"int_eq_reif", "iib"}, {"int_ne_reif", "iib"},    {"int_lt_reif", "iib"},
-        {"int_le_reif", "iib"},  {"int_plus", "iii"},    {"int_plus", "iii"},       {"int_times", "iii"},
-        {"int_times", "iii"},    {"int_min", "iii"},     {"int_max", "iii"},        {"int_min", "*ii"},
-        {"int_max", "*ii"},      {"int_sum", "*ii"},     {"int_sum", "*ii"},        {"bool_eq", "bb"},
-        {"bool_not", "bb"},      {"bool_lt", "bb"},      {"bool_le", "bb"},         {"bool_imply", "bb"},
-        {"bool_eq_reif", "bbb"}, {"bool_xor", "bbb"},    {"bool_lt_reif", "bbb"},   {"bool_le_reif", "bbb"},
-        {"bool_and", "bbb"},     {"bool_or", "bbb"},     {"array_bool_and", "*bb"}, {"array_bool_or", "*bb"},
+        {"str_eq", "tt"}, {"str_ne", "tt"}, {"str_lt", "tt"}, {"str_le", "tt"}, {"str_gt", "tt"}, {"str_ge", "tt"},
+        {"str_eq_reif", "ttb"}, {"str_ne_reif", "ttb"}, {"str_lt_reif", "ttb"}, {"str_le_reif", "ttb"},
+        {"str_gt_reif", "ttb"}, {"str_ge_reif", "ttb"},
+        {"str_concat", "ttt"}, {"str_concat", "ttt"}, {"str_concat", "ttt"}, {"str_concat", "*tt"},
+        {"str_concat", "*tt"}, {"str_substr", "tiit"}, {"str_substr", "tiit"}, {"str_length", "ti"},
+        {"str_lower", "tt"}, {"str_upper", "tt"}, {"str_min", "ttt"}, {"str_max", "ttt"}, {"str_min", "*tt"},
+        {"str_max", "*tt"}, {"str_next", "tt"}, {"str_text", "at"},
+        {"str_prefix", "tt"}, {"str_suffix", "tt"}, {"str_contains", "tt"}, {"str_matches", "te"},
+        {"str_find", "tti"}, {"str_replace", "tttt"}, {"str_replace_all", "tttt"},
+        {"str_prefix_reif", "ttb"}, {"str_suffix_reif", "ttb"}, {"str_contains_reif", "ttb"},
+        {"str_matches_reif", "teb"}, {"str_find_reif", "ttib"}, {"str_replace_reif", "ttttb"},
+        {"str_replace_all_reif", "ttttb"}, {"str_all_different", "*t"}, {"str_all_different", "*t"},
+        {"str_table", "*tr"},
+
+        {"int_eq", "ii"}, {"int_ne", "ii"}, {"int_lt", "ii"}, {"int_le", "ii"}, {"int_eq_reif", "iib"},
+        {"int_ne_reif", "iib"}, {"int_lt_reif", "iib"}, {"int_le_reif", "iib"}, {"int_plus", "iii"},
+        {"int_plus", "iii"}, {"int_times", "iii"}, {"int_times", "iii"}, {"int_min", "iii"}, {"int_max", "iii"},
+        {"int_min", "*ii"}, {"int_max", "*ii"}, {"int_sum", "*ii"}, {"int_sum", "*ii"},
+
+        {"bool_eq", "bb"}, {"bool_not", "bb"}, {"bool_lt", "bb"}, {"bool_le", "bb"}, {"bool_imply", "bb"},
+        {"bool_eq_reif", "bbb"}, {"bool_xor", "bbb"}, {"bool_lt_reif", "bbb"}, {"bool_le_reif", "bbb"},
+        {"bool_and", "bbb"}, {"bool_or", "bbb"}, {"array_bool_and", "*bb"}, {"array_bool_or", "*bb"},
         {"bool2int", "bi"}};
+    // clang-format on
     const Shape& shape = kShapes[Draw(std::size(kShapes))];
     Constraint constraint{shape.name, {}};
     if (*shape.takes == '*') constraint.members = 1 + Draw(4);
     const std::string takes =
         constraint.members == 0 ? shape.takes : std::string(constraint.members, shape.takes[1]) + (shape.takes + 2);
     for (const char wanted : takes) {
+      if (wanted == 'e') constraint.expression = Expression();
+      if (wanted == 'r') constraint.rows = MakeRows(constraint.members);
+      if (wanted == 'e' || wanted == 'r') continue;
       std::vector<int> fitting;
       for (std::size_t v = 0; v < mNetwork.variables.size(); ++v) {
         const Type type = mNetwork.variables[v].type;

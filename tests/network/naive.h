@@ -34,7 +34,9 @@ struct Variable {
 struct Constraint {
   std::string name;
   std::vector<int> arguments;
-  std::size_t members = 0;  // so many of the first arguments are a list
+  std::size_t members = 0;                          // so many of the first arguments are a list
+  std::string expression = {};                      // of a constraint that takes one
+  std::vector<std::vector<std::string>> rows = {};  // of a table
 };
 
 struct Network {

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "network/offsets.h"
 #include "network/order_cycles.h"
 
 namespace zornet {
@@ -45,7 +46,7 @@ void Propagation::Connect() {
 Outcome Propagation::Run() {
   for (const int variable : mShaved) mShavings[static_cast<std::size_t>(variable)] = 0;
   mShaved.clear();
-  if (mSteps == 0) FailOrderCycle();
+  if (mSteps == 0) FailCycle();
   if (mStore.HasFailed()) return Outcome::Contradiction;
   WakeReaders(kNone);
   while (mWaiting != 0) {
@@ -59,13 +60,14 @@ Outcome Propagation::Run() {
 }
 
 // Once, before the first pass.
-void Propagation::FailOrderCycle() {
-  const int constraint = FindOrderCycle(mModel);
+void Propagation::FailCycle() {
+  int constraint = FindOrderCycle(mModel);
+  if (constraint == kNone) constraint = FindOffsetConflict(mModel);
   if (constraint == kNone) return;
-  const Constraint& order = mModel.Constraints()[static_cast<std::size_t>(constraint)];
+  const Constraint& found = mModel.Constraints()[static_cast<std::size_t>(constraint)];
   mStore.StartConstraint(constraint);
-  mStore.StartOperation(Operation::LessOrEqual);
-  mStore.Fail(order.arguments[order.kind->mirrored ? 1 : 0]);
+  mStore.StartOperation(found.kind->IsRelation() ? Operation::LessOrEqual : Operation::Sum);
+  mStore.Fail(found.arguments[found.kind->mirrored ? 1 : 0]);
 }
 
 bool Propagation::CountStep() {

@@ -1,7 +1,7 @@
 // Narrows a network until nothing changes any more: constraints wait in a queue and are woken by the variables that
 // they read. It ends, since every change leaves less in a variable, and it loses no solution (see Store and Semantics).
-// Two constraints such as x + 1 = y and y + 1 = x take one number a pass from an interval, which may have 2^32: an
-// interval that has changed kMostShavings times in one run is shaved no further.
+// Constraints in a circle, such as x + y = z and z + y = x, may take one number a pass from an interval, which may have
+// 2^32: an interval that has changed kMostShavings times in one run is shaved no further.
 #pragma once
 
 #include <cstdint>
@@ -44,7 +44,7 @@ class Propagation {
   void Wake(int constraint);
   void WakeReaders(int except);
   bool IsShaved(int variable);
-  void FailOrderCycle();
+  void FailCycle();
   Status Narrow(int constraint);
   Status Narrow(const Constraint& constraint);
   int Next();

@@ -110,6 +110,11 @@ const Row kNetworks[] = {
   {"orders of integers in a circle",
    "var 0..2147483647: x; var 0..2147483647: y; constraint int_lt(x, y); constraint int_le(y, x);",
    "Nil, 0..2147483647"},
+  {"distances in a circle",
+   "var 0..2147483647: x; var int: y; var int: z; constraint int_plus(1, x, y); constraint int_eq(y, z); constraint int_plus(z, 1, x);",
+   "0..2147483647, Any, Nil"},
+  {"an order against a distance",
+   "var 0..2147483647: x; var int: y; constraint int_plus(x, 1, y); constraint int_le(y, x);", "0..2147483647, Nil"},
   {"sums and products of one number twice",
    "var int: x; var -9..9: y; var int: z; constraint int_plus(x, x, 10); constraint int_times(y, y, 49); constraint int_lt(0, y);"
    "constraint int_plus(y, z, y);", "5, 7, 0"},
@@ -225,7 +230,8 @@ TEST(Propagation, WorkGrowsWithTheNetwork) {
 // Each pass would take one number from an interval.
 TEST(Propagation, ShavesNoIntervalToItsEnd) {
   Solved solved(
-      "var 0..2147483647: x; var 0..2147483647: y; constraint int_plus(x, 1, y); constraint int_plus(y, 1, x);",
+      "var 0..2147483647: x; var 1..2: by; var 0..2147483647: y; constraint int_plus(x, by, y);"
+      "constraint int_plus(y, by, x);",
       {65536, 10000});
   EXPECT_EQ(solved.Narrow(), zornet::Outcome::Settled);
 }

@@ -73,6 +73,7 @@ class OneRun {
   const Names& mNames;
   Report& mReport;
   std::vector<Var> mExplained;
+  Explanation mDrawn;  // all that was explained, for pictures
   Summary mSummary;
 };
 
@@ -120,7 +121,12 @@ void OneRun::Solve() {
 
 void OneRun::Tell() {
   if (!mSummary.search) mReport.Variables(mNetwork);
-  for (const Var variable : mExplained) mReport.Explain(mNetwork, variable, mNetwork.Explain(variable));
+  for (const Var variable : mExplained) {
+    const Explanation explanation = mNetwork.Explain(variable);
+    mReport.Explain(mNetwork, variable, explanation);
+    mDrawn.declared.insert(mDrawn.declared.end(), explanation.declared.begin(), explanation.declared.end());
+    mDrawn.narrowings.insert(mDrawn.narrowings.end(), explanation.narrowings.begin(), explanation.narrowings.end());
+  }
   if (mOptions.stats) mReport.Statistics(mNetwork);
   WritePictures();
   if (!mOptions.raw) mReport.Finish(mNetwork, mSummary);
@@ -128,8 +134,10 @@ void OneRun::Tell() {
 
 void OneRun::WritePictures() const {
   try {
-    if (!mOptions.dot.empty()) WriteGraph(mOptions.dot, Graph(mNetwork, mNames));
-    if (!mOptions.svg.empty()) WritePicture(mOptions.svg, Graph(mNetwork, mNames));
+    if (mOptions.dot.empty() && mOptions.svg.empty()) return;
+    const std::string graph = Graph(mNetwork, mNames, mExplained.empty() ? nullptr : &mDrawn);
+    if (!mOptions.dot.empty()) WriteGraph(mOptions.dot, graph);
+    if (!mOptions.svg.empty()) WritePicture(mOptions.svg, graph);
   } catch (const std::runtime_error& error) {
     throw UsageError(error.what());
   }

@@ -259,6 +259,11 @@ TEST(Program, Graph) {
   EXPECT_NE(graph.find("<b>found</b><br/>Nil"), std::string::npos);
   EXPECT_NE(graph.find("color=\"#b3261e\", penwidth=2, label=<<b>found</b>"), std::string::npos);
   EXPECT_NE(graph.find("fontcolor=\"#b3261e\", penwidth=2, label=\"str_eq\""), std::string::npos);
+
+  const std::string folded = Zornet("-q --explain label --dot - " + Example("hello")).out;
+  EXPECT_NE(folded.find("v0 -> v2"), std::string::npos);
+  EXPECT_NE(folded.find("label=\"str_concat(\u00b7, \\\"-\\\")\""), std::string::npos);
+  EXPECT_EQ(folded.find("<b>banner</b>"), std::string::npos);
 }
 
 }  // namespace

@@ -9,7 +9,8 @@ Search::Search(Store& store, Propagation& propagation)
     : mStore(store),
       mPropagation(propagation),
       mSemantics(store.Types()),
-      mStamps(store.Model().Variables().size(), 0) {
+      mStamps(store.Model().Variables().size(), 0),
+      mFailures(store.Model().Constraints().size(), 0) {
   std::vector<char> taken(mStamps.size(), 0);
   const auto take = [&](int variable) {
     if (std::exchange(taken[static_cast<std::size_t>(variable)], 1) == 0) mOrder.push_back(variable);
@@ -45,6 +46,7 @@ Outcome Search::Look(std::uint64_t limit, const Solution& solution) {
     Choose(mFrames.back());
     const Outcome outcome = mPropagation.Run();
     if (outcome == Outcome::Settled && Visit(solution)) continue;
+    if (outcome == Outcome::Contradiction) CountFailure();
     Retract();
     if (outcome == Outcome::StepLimit) return outcome;
   }
@@ -68,20 +70,31 @@ bool Search::Visit(const Solution& solution) {
   return true;
 }
 
-// The place of the variable with the fewest values, a wanted one if there is one. Where nothing is stuck, one is
-// listed.
+// The place of the variable with the fewest values for the contradictions of its constraints, a wanted one if there is
+// one. Where nothing is stuck, one is listed.
 std::size_t Search::Pick(std::size_t first) {
-  std::size_t chosen = mOrder.size(), fewest = 0;
+  std::size_t chosen = mOrder.size();
+  double least = 0;
   for (std::size_t place = first; place < mOrder.size(); ++place) {
     const bool found = chosen != mOrder.size();
-    if (found && (fewest == 2 || place == mWanted)) break;
+    if (found && place == mWanted) break;
     if (!Needs(place)) continue;
     const Listing& listing = mStore.List(mOrder[place]);
-    if (!listing.known || (found && listing.count >= fewest)) continue;
+    if (!listing.known) continue;
+    const double size = static_cast<double>(listing.count) / static_cast<double>(WeightOf(mOrder[place]));
+    if (found && size >= least) continue;
     chosen = place;
-    fewest = listing.count;
+    least = size;
   }
   return chosen;
+}
+
+std::uint64_t Search::WeightOf(int variable) const {
+  std::uint64_t weight = 1;
+  for (const int constraint : mPropagation.ReadersOf(variable)) {
+    if (!mPropagation.IsFinished(constraint)) weight += mFailures[static_cast<std::size_t>(constraint)];
+  }
+  return weight;
 }
 
 void Search::Push(std::size_t first, std::size_t place) {
@@ -115,6 +128,12 @@ void Search::Choose(Frame& frame) {
   mStore.StartConstraint(kNone);
   mStore.StartOperation(Operation::Choice);
   mStore.Meet(frame.variable, value);
+}
+
+// A choice itself fails nothing: its value is one of the domain.
+void Search::CountFailure() {
+  if (const int constraint = mStore.FailedConstraint(); constraint != kNone)
+    ++mFailures[static_cast<std::size_t>(constraint)];
 }
 
 void Search::Mark() {

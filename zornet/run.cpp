@@ -19,6 +19,7 @@
 #include "zornet/picture.h"
 #include "zornet/progress.h"
 #include "zornet/raw.h"
+#include "zornet/split.h"
 
 namespace zornet {
 
@@ -157,6 +158,20 @@ int OneRun::ExitCode() const {
   return kSettled;
 }
 
+// The names of the files are told on standard output, so that the next program can read them.
+int WriteParts(const Options& options, const Source& source, const Model& model) {
+  const std::vector<Part> parts = Split(model, options.limits, options.modulePaths, options.split);
+  for (std::size_t i = 0; i < parts.size(); ++i) {
+    const std::string file = fmt::format("{}.{}.szn", options.parts.empty() ? "part" : options.parts, i + 1);
+    std::ofstream out(file, std::ios::binary);
+    out << source.Text() << "\n" << parts[i];
+    out.close();
+    if (!out) throw UsageError(fmt::format("{}: {}", file, std::strerror(errno)));
+    std::cout << file << '\n';
+  }
+  return parts.empty() ? kContradiction : kSettled;
+}
+
 }  // namespace
 
 int Run(const Options& options) {
@@ -178,6 +193,7 @@ int Run(const Options& options) {
       reportOn(source, {}, {})->Errors(source, diagnostics);
       return kModelError;
     }
+    if (options.split != 0) return WriteParts(options, source, read.model);
     Network network(std::move(read.model), options.limits, options.modulePaths);
     const Names names(source, read.places, network.GetModel());
     const auto report = reportOn(source, read.places, network.GetModel());

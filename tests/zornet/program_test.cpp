@@ -254,6 +254,29 @@ TEST(Program, Colours) {
   EXPECT_EQ(Zornet("-q --color=never " + hello).out.find('\x1b'), std::string::npos);
 }
 
+TEST(Program, PartsOfASplitHaveTheSolutionsOfTheWhole) {
+  const fs::path folder = fs::path(testing::TempDir()) / "zornet-split";
+  const auto solutions = [](const std::string& file) {
+    std::multiset<std::string> found;
+    std::istringstream lines(Zornet("-q --json-stream --solutions 100000 " + file).out);
+    for (std::string line; std::getline(lines, line);) {
+      const auto event = nlohmann::json::parse(line);
+      if (event["event"] == "solution") found.insert(event["values"].dump());
+    }
+    return found;
+  };
+  for (const char* example : {"plates", "shelves", "logins"}) {
+    fs::create_directories(folder);
+    std::istringstream files(Zornet("--split 3 --parts " + Quoted(folder / "part") + " " + Example(example)).out);
+    std::multiset<std::string> merged;
+    std::size_t parts = 0;
+    for (std::string file; std::getline(files, file); ++parts) merged.merge(solutions(Quoted(file)));
+    EXPECT_GE(parts, 3U) << example;
+    EXPECT_EQ(merged, solutions(Example(example))) << example;
+    fs::remove_all(folder);
+  }
+}
+
 TEST(Program, Graph) {
   const std::string graph = Zornet("-q --dot - " + Example("clash")).out;
   EXPECT_NE(graph.find("<b>found</b><br/>Nil"), std::string::npos);

@@ -74,10 +74,11 @@ bool Search::Visit(const Solution& solution) {
 // one. Where nothing is stuck, one is listed.
 std::size_t Search::Pick(std::size_t first) {
   std::size_t chosen = mOrder.size();
+  const double enough = 2.0 / static_cast<double>(1 + mFailed);  // hardly any is below
   double least = 0;
   for (std::size_t place = first; place < mOrder.size(); ++place) {
     const bool found = chosen != mOrder.size();
-    if (found && place == mWanted) break;
+    if (found && (least <= enough || place == mWanted)) break;
     if (!Needs(place)) continue;
     const Listing& listing = mStore.List(mOrder[place]);
     if (!listing.known) continue;
@@ -132,8 +133,10 @@ void Search::Choose(Frame& frame) {
 
 // A choice itself fails nothing: its value is one of the domain.
 void Search::CountFailure() {
-  if (const int constraint = mStore.FailedConstraint(); constraint != kNone)
-    ++mFailures[static_cast<std::size_t>(constraint)];
+  const int constraint = mStore.FailedConstraint();
+  if (constraint == kNone) return;
+  ++mFailures[static_cast<std::size_t>(constraint)];
+  ++mFailed;
 }
 
 void Search::Mark() {

@@ -75,6 +75,7 @@ class Search {
   std::vector<std::uint64_t> mStamps;  // when CanBecomeKnown reached each variable last
   std::uint64_t mStamp = 0;
   std::vector<std::uint64_t> mFailures;  // contradictions of each constraint so far
+  std::uint64_t mFailed = 0;             // of all
   std::vector<Frame> mFrames;
   std::vector<Exact> mExact;     // arguments of the constraint that is confirmed
   std::set<std::string> mShown;  // solutions below the first loose frame

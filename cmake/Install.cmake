@@ -3,6 +3,7 @@ set(CMAKE_INSTALL_LIBDIR lib)  # zornet looks for its libraries in lib beside it
 set(CMAKE_INSTALL_DOCDIR share/doc/zorvadstrings)
 include(GNUInstallDirs)
 include(CMakePackageConfigHelpers)
+include(cmake/Interface.cmake)
 set(header_dir ${CMAKE_INSTALL_INCLUDEDIR}/zorvadstrings)
 set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/ZORVadStrings)
 
@@ -13,6 +14,7 @@ function(install_library name)
     SOVERSION ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR}
     INSTALL_RPATH "\$ORIGIN")
   target_compile_features(${name} PUBLIC cxx_std_20)
+  export_interface(${name} ${ARGN})
   target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES ${ARGN})
   install(TARGETS ${name} EXPORT ZORVadStrings
     LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR}
@@ -31,6 +33,7 @@ endfunction()
 install_library(ZORHost
   host/ZORExport.h
   host/ZORNumbers.h
+  host/ZORPrint.h
   host/ZORSolver.h
   host/ZORText.h)
 install_library(ZORVadStrings
@@ -90,9 +93,10 @@ case, concatenation and parts, each in both directions.
 The program zornet narrows the variables of whole models, explains how it
 came to a result and searches for solutions. The libraries behind it, their
 headers and what CMake and pkg-config need are in this package too.")
-set(CPACK_STRIP_FILES ON)
+set(CPACK_PROJECT_CONFIG_FILE ${PROJECT_SOURCE_DIR}/cmake/Packages.cmake)
 set(CPACK_PRE_BUILD_SCRIPTS ${PROJECT_SOURCE_DIR}/cmake/debian/Debian.cmake)
 set(CPACK_POST_BUILD_SCRIPTS ${PROJECT_SOURCE_DIR}/cmake/debian/Debian.cmake)
+set(CPACK_DEBIAN_DEBUGINFO_PACKAGE ON)
 set(CPACK_DEBIAN_PACKAGE_SECTION math)
 set(CPACK_DEBIAN_PACKAGE_RECOMMENDS graphviz)
 set(CPACK_DEBIAN_PACKAGE_CONTROL_EXTRA ${PROJECT_SOURCE_DIR}/cmake/debian/triggers)

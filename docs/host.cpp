@@ -2,6 +2,7 @@
 #include <iostream>
 #include <memory>
 
+#include "host/ZORPrint.h"
 #include "module/ZORVaDoString.h"
 
 // A value of any string type, made in memory of the host's.
@@ -32,17 +33,13 @@ class Value {
   ZORVaDoString* mString;
 };
 
-static void Print(const char* name, const ZORVaDoObject& value) {
-  ZORostrstream out;
-  value.PrintOn(out);
-  std::cout << name << " = " << out.View() << '\n';
-}
+static void Print(const char* name, const ZORVaDoObject& value) { std::cout << name << " = " << value << '\n'; }
 
 int main() {
   ZORVaDoModuleManager manager;  // goes last: values and what was read die before it
   const ZORVaDoModule* const module = manager.OpenModule("ZORVadStrings");
   if (module == nullptr) {
-    std::cerr << manager.GetFailure().CastToCharPtr() << '\n';
+    std::cerr << manager.GetFailure() << '\n';
     return 1;
   }
   const ZORVaDoObjectDescriptor* const set = module->FindDescriptor("enum string");

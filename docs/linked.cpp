@@ -2,12 +2,11 @@
 #include <iostream>
 
 #include "enum/ZORVadEnumString.h"
+#include "host/ZORPrint.h"
 #include "module/InitModule.h"
 
 static void Print(const char* what, int answer, const ZORVaDoObject& value) {
-  ZORostrstream out;
-  value.PrintOn(out);
-  std::cout << what << ": " << answer << ", " << out.View() << '\n';
+  std::cout << what << ": " << answer << ", " << value << '\n';
 }
 
 int main() {

@@ -168,12 +168,12 @@ class ZOR_EXPORT ZORVadEnumString : public ZORVaDoString {
   Texts::Equals OfEquals() const { return IsUndefined() || IsNil() ? Texts::Equals::Accepted : Texts::Equals::Refused; }
   bool CanMark(std::size_t candidates) const { return !IsUndefined() && mTexts.CanMark(candidates); }
   template <class Wanted>
-  int Keep(const Wanted& wanted);
+  ZOR_INTERNAL int Keep(const Wanted& wanted);
   int Narrow(Texts&& candidates);
   void InputSet(ZORistrstream& in);
 
   template <class X>
-  int CalcFoldValue(const X& x, zor::Fold fold);
+  ZOR_INTERNAL int CalcFoldValue(const X& x, zor::Fold fold);
   int MeetFolds(const Enum& x, zor::Fold fold);
   int MeetFolds(const Single& x, zor::Fold fold);
 

@@ -8,7 +8,6 @@
 namespace {
 
 using zor::TextSet;
-using zor::View;
 
 // Marks the texts that are a head followed by a tail. Texts with the same head are adjacent and ordered by what follows
 // it, so one pass compares them with the tails. Of equal texts only the first is marked.
@@ -16,15 +15,15 @@ TextSet::Marks MarkPairs(const TextSet& texts, const TextSet& heads, const TextS
   const unsigned int count = texts.Count(), tailCount = tails.Count();
   TextSet::Marks marks;
   for (const ZORString* const first : heads.All()) {
-    const std::string_view head = View(*first);
+    const std::string_view head = first->View();
     unsigned int t = 0;
     for (unsigned int i = texts.CountLess(*first); i < count; ++i) {
-      const std::string_view text = View(texts[i]);
+      const std::string_view text = texts[i].View();
       if (text.substr(0, head.size()) != head) break;
       const std::string_view rest = text.substr(head.size());
-      while (t < tailCount && View(tails[t]) < rest) ++t;
+      while (t < tailCount && tails[t].View() < rest) ++t;
       if (t == tailCount) break;
-      if (View(tails[t]) == rest && (i == 0 || texts[i - 1] != texts[i])) marks.set(i);
+      if (tails[t].View() == rest && (i == 0 || texts[i - 1] != texts[i])) marks.set(i);
     }
   }
   return marks;

@@ -4,6 +4,7 @@
 #include "enum/entries.h"
 #include "module/characters.h"
 #include "module/classdefinition.h"
+#include "module/readiness.h"
 #include "module/valuetypes.h"
 
 ZOR_DEFINE_STRING_CLASS(ZORVadEnumString, ZORVaDoString, "enum string", ZORVaDoString::sDescriptor, 1);
@@ -14,11 +15,17 @@ ZORVadEnumString* ZORVadEnumString::Build(ZORStreamable* object) {
   return static_cast<ZORVadEnumString*>(zor::BuildForRead<ZORVadEnumString>(object));
 }
 
-ZORVadEnumString::ZORVadEnumString(ZORStringStateTag state) { mState = state; }
+ZORVadEnumString::ZORVadEnumString(ZORStringStateTag state) {
+  zor::CheckReadiness();
+  mState = state;
+}
+
 ZORVadEnumString::ZORVadEnumString() : ZORVadEnumString(ZorStringAny) {}
 ZORVadEnumString::ZORVadEnumString(const ZORVadEnumString& other) : ZORVadEnumString(other.mState) { Append(other); }
 ZORVadEnumString::ZORVadEnumString(const ZORVadSingleString& other) : ZORVadEnumString() { Copy(other); }
-ZORVadEnumString::ZORVadEnumString(const ZORString& text) { Become(ZorStringExact, text); }
+ZORVadEnumString::ZORVadEnumString(const ZORString& text) : ZORVadEnumString(ZorStringExact) {
+  mTexts.Insert(ZORString(text));
+}
 ZORVadEnumString::ZORVadEnumString(const void* text) : ZORVadEnumString(ZORString(static_cast<const char*>(text))) {}
 ZORVadEnumString::ZORVadEnumString(ZORStreamableInit) : ZORVaDoString(ZorStreamableInit) {}
 

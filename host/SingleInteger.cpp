@@ -8,6 +8,7 @@ const ZORLong ZORVadSingleInteger::sNC_INT_ANY = std::numeric_limits<ZORLong>::m
 
 ZORVadSingleInteger::ZORVadSingleInteger() = default;
 ZORVadSingleInteger::ZORVadSingleInteger(ZORStreamableInit) {}
+ZORVadSingleInteger::ZORVadSingleInteger(ZORLong value) : mState(kExact), mValue(value) {}
 
 void ZORVadSingleInteger::Become(State state, ZORLong value) {
   mState = state;

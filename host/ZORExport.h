@@ -1,4 +1,5 @@
-// Marks what a library exports; everything else is hidden.
+// Marks what a library exports; everything else is hidden. A class is exported with all its members, but for templates
+// and classes of its own that are marked as internal.
 #pragma once
 
 #if __cplusplus <= 201703L
@@ -6,3 +7,4 @@
 #endif
 
 #define ZOR_EXPORT __attribute__((visibility("default")))
+#define ZOR_INTERNAL __attribute__((visibility("hidden")))

@@ -11,6 +11,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <type_traits>
 #include <vector>
 
 #include "host/ZORSolver.h"
@@ -155,6 +156,12 @@ class ZOR_EXPORT ZORVadSingleInteger : public ZORVaDoInteger {
 
  public:
   static const ZORLong sNC_INT_ANY;  // the least number; GetValue of a Nil or Undefined integer
+
+  explicit ZORVadSingleInteger(ZORLong value);
+  // No number of another type, which may not fit, and no tag.
+  template <class Other>
+  requires std::is_arithmetic_v<Other> || std::is_enum_v<Other>
+  explicit ZORVadSingleInteger(Other) = delete;
 
   ZORLong GetValue() const { return mValue; }
   void SetExactValue(ZORLong value) override;  // replaces the value

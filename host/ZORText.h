@@ -45,6 +45,8 @@ class ZOR_EXPORT ZORString {
   ZORString(ZORString&& other) noexcept { Take(other); }  // other is empty afterwards
   ZORString(const char* text);  // NOLINT(google-explicit-constructor): zero-terminated, copied; null is empty
   ZORString(const ZORChar& c, std::size_t count);
+  ZORString(std::string_view text) : ZORString(text.data(), text.size()) {}    // NOLINT(google-explicit-constructor)
+  ZORString(const std::string& text) : ZORString(text.data(), text.size()) {}  // NOLINT(google-explicit-constructor)
   ZORString(const char* text, std::size_t length);
   ~ZORString() { Release(); }
   ZORString& operator=(const ZORString& other);
@@ -61,6 +63,8 @@ class ZOR_EXPORT ZORString {
   const ZORChar operator[](int position) const;  // zero outside the string
   int GetLengthInChar() const { return static_cast<int>(mLength); }
   const char* CastToCharPtr() const { return mCapacity == kInside ? mInside : mOutside; }  // zero-terminated
+  std::string_view View() const { return {CastToCharPtr(), mLength}; }  // until it changes; orders as the text does
+  explicit operator std::string_view() const { return View(); }
 
   static ZORString Concatenation(const ZORString& head, const ZORString& tail);  // at most one allocation
   bool IsConcatenation(const ZORString& head, const ZORString& tail) const;      // no allocation
@@ -83,7 +87,6 @@ class ZOR_EXPORT ZORString {
   static int OrderRooms(const char* a, const char* b);
   static void JoinRooms(const ZORString& head, const ZORString& tail, char* joined);
   static bool AreInside(const ZORString& a, const ZORString& b) { return (a.mCapacity | b.mCapacity) == kInside; }
-  std::string_view View() const { return {CastToCharPtr(), mLength}; }
   bool IsOwner() const { return mCapacity != kInside && mCapacity != kShared; }
   void CopyBlock(const ZORString& other);
   void Extend(std::string_view text);

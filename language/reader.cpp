@@ -91,6 +91,7 @@ class Resolver {
   bool IsAllowed(const Variable& variable, const Word& word) const;
   bool Collect(std::span<const Word> words, Word::Type expected, Variable& variable);
   void Add(const ConstraintSyntax& constraint);
+  void RefuseExpression(const Kind& kind, std::span<const Word> arguments, const ExpressionError& error);
   const Kind* FindKindFor(const ConstraintSyntax& constraint);
   int AddArgument(const Word& word, Takes takes, std::string_view constraint, std::string_view role);
   int AddConstant(const Word& word);
@@ -199,13 +200,30 @@ void Resolver::Add(const ConstraintSyntax& syntax) {
   bool good = true;
   const std::span<const Word> arguments = mSyntax.ArgumentsOf(syntax);
   for (std::size_t i = 0; i < arguments.size(); ++i) {
+    if (kind->takes[i] == Takes::Expression && arguments[i].type == Word::Text) {
+      mArguments.emplace_back(std::string(arguments[i].token.text));
+      continue;
+    }
     const int variable = AddArgument(arguments[i], kind->takes[i], kind->name, kind->roles[i]);
     mArguments.emplace_back(Var{variable});
     good = good && variable != kUnknown;
   }
   if (!good) return;
-  mModel.Post(*kind, mArguments);
+  try {
+    mModel.Post(*kind, mArguments);
+  } catch (const ExpressionError& error) {
+    RefuseExpression(*kind, arguments, error);
+  }
   mRead.places.constraints.push_back(syntax.extent);
+}
+
+void Resolver::RefuseExpression(const Kind& kind, std::span<const Word> arguments, const ExpressionError& error) {
+  for (std::size_t i = 0; i < arguments.size(); ++i) {
+    if (kind.takes[i] != Takes::Expression) continue;
+    const Extent quoted = arguments[i].token.extent;
+    const std::size_t begin = quoted.begin + 1 + error.offset;
+    mDiagnostics.Error({begin, quoted.End() - 1 - begin}, fmt::format("no regular expression: {}", error.what()));
+  }
 }
 
 // Null when there is no constraint of that name, or when it takes another number of arguments.

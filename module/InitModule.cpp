@@ -1,7 +1,10 @@
 #include "module/InitModule.h"
 
+#include <cstdio>
+
 #include "module/ZORVaDoString.h"
 #include "module/characters.h"
+#include "module/readiness.h"
 #include "module/valuetypes.h"
 
 int InitModule(ZORVaDoModule* module, ZORVaDoModuleManager* manager) {
@@ -23,3 +26,12 @@ void InitStrings() {
   ZORVaDoString::ZorVaDoStringMax = ZORString(ZorVaDoCharMax, zor::kLengthLimit);
   ZORVaDoString::ZorVaDoStringAny = ZORString(ZorVaDoCharMax, zor::kLengthLimit + 1);
 }
+
+#ifndef NDEBUG
+void zor::CheckReadiness() {
+  static bool told = false;
+  if (told || ZORVaDoString::ZorVaDoStringMin.GetLengthInChar() != 0) return;
+  told = true;
+  std::fputs("ZORVadStrings: a value is made before InitStrings() or InitModule was called\n", stderr);
+}
+#endif

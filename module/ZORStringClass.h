@@ -11,7 +11,9 @@
  public:                                                                                                  \
   class ZOR_EXPORT Descriptor : public ZORVaDoObjectDescriptor {                                          \
    public:                                                                                                \
-    using ZORVaDoObjectDescriptor::ZORVaDoObjectDescriptor;                                               \
+    Descriptor(const ZORString& name, const ZORVaDoObjectDescriptor* parent, int flag)                    \
+        : ZORVaDoObjectDescriptor(name, parent, flag) {}                                                  \
+    explicit Descriptor(ZORStreamableInit) : ZORVaDoObjectDescriptor(ZorStreamableInit) {}                \
     ~Descriptor() override;                                                                               \
     const char* CastableID() const override;                                                              \
     ZORVaDoObject* CreateObject(void* place, const void* text) const override;                            \

@@ -1,6 +1,7 @@
 #include "module/texts.h"
 
 #include <algorithm>
+#include <string_view>
 
 namespace {
 
@@ -9,7 +10,7 @@ ZORString Character(char c) { return {ZORChar(c), 1}; }
 }  // namespace
 
 std::optional<ZORString> zor::Successor(const ZORString& text) {
-  const std::string_view characters = View(text);
+  const std::string_view characters = text.View();
   if (characters.size() < kLengthLimit) {
     ZORString next(text);
     next.Append(Character(kLeastCharacter));

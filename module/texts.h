@@ -3,7 +3,6 @@
 
 #include <cstddef>
 #include <optional>
-#include <string_view>
 
 #include "host/ZORText.h"
 
@@ -15,11 +14,6 @@ constexpr bool IsInAlphabet(char c) { return c >= kLeastCharacter && c <= kGreat
 constexpr int kLengthLimit = 255;             // characters of the longest text
 constexpr unsigned int kReadableLimit = 254;  // characters of the longest text that can be read
 constexpr std::size_t kSetLimit = 256;        // texts of a set that grows through InsertExactValue
-
-// The characters of text, valid until it changes. Views order like the texts.
-inline std::string_view View(const ZORString& text) {
-  return {text.CastToCharPtr(), static_cast<std::size_t>(text.GetLengthInChar())};
-}
 
 // ZORString::ToLower or ZORString::ToUpper.
 using Fold = void (ZORString::*)();

@@ -115,7 +115,7 @@ ZOR_EXPORT Takes MemberOf(Takes list);  // what the list holds; of another place
 inline constexpr int kMostArguments = 5;
 
 // A constraint that can be posted. Two forms may share a name: one with a list and one without.
-struct Kind {
+struct ZOR_EXPORT Kind {
   std::string_view name;
   Meaning meaning;
   bool mirrored;  // the relation with first and second exchanged
@@ -127,7 +127,7 @@ struct Kind {
   constexpr bool IsComparison() const { return meaning <= Meaning::Less; }
   constexpr bool IsRelation() const { return meaning <= Meaning::Row; }
   constexpr bool IsOfNumbers() const { return IsNumber(takes[0]); }  // integers or truth values, no texts
-  ZOR_EXPORT bool HasList() const;
+  bool HasList() const;
 };
 
 ZOR_EXPORT std::span<const Kind> Kinds();
@@ -151,7 +151,7 @@ class Expression;
 class Table;
 
 // A constraint of a model, to which all that it points at belongs.
-struct Constraint {
+struct ZOR_EXPORT Constraint {
   const Kind* kind = nullptr;
   std::span<const int> arguments = {};  // variables by number; a list's members stand in its place one by one
   const Expression* expression = nullptr;
@@ -161,7 +161,7 @@ struct Constraint {
   int Result() const { return arguments.back(); }
 
   // Where arguments[position] stands as the constraint is written: an index into takes and roles.
-  ZOR_EXPORT std::size_t Place(std::size_t position) const;
+  std::size_t Place(std::size_t position) const;
   std::string_view RoleOf(std::size_t position) const { return kind->roles[Place(position)]; }
 };
 
@@ -231,7 +231,7 @@ class ZOR_EXPORT Model {
   void Reserve(std::size_t variables, std::size_t constraints);  // room, for large models
 
  private:
-  struct Block {
+  struct ZOR_INTERNAL Block {
     std::unique_ptr<int[]> numbers;
     std::size_t used = 0, size = 0;
   };

@@ -138,7 +138,7 @@ class ZOR_EXPORT Network {
   std::vector<OperationCount> Counts() const;  // of the operations that were called
 
  private:
-  struct Inside;
+  struct ZOR_INTERNAL Inside;
   std::unique_ptr<Inside> mInside;
 };
 

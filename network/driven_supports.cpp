@@ -1,4 +1,4 @@
-// Supports that are driven from the listed results of a concatenation or a slice.
+// Supports that are driven from the listed results of a concatenation, a slice, a minimum or a maximum.
 #include <algorithm>
 #include <limits>
 #include <string_view>
@@ -61,13 +61,21 @@ bool ForEachBeginning(const Listing& listing, std::string_view text, Visit visit
   }
 }
 
+bool IsExtreme(Meaning meaning) { return meaning == Meaning::Minimum || meaning == Meaning::Maximum; }
+
+bool Has(const Listing& listing, std::string_view text) {
+  const std::size_t i = LowerBound(listing, text);
+  return i < listing.count && TextAt(listing, i) == text;
+}
+
 }  // namespace
 
 // An estimate, to be compared with a number of combinations; infinity when it cannot be driven.
 double Supports::DrivenCost(const Constraint& constraint) {
   const Meaning meaning = constraint.kind->meaning;
-  if (meaning != Meaning::Concatenation && meaning != Meaning::Slice) return kNever;
-  const Column& result = At(constraint.Inputs());
+  const bool isExtreme = IsExtreme(meaning) && !constraint.kind->IsOfNumbers();
+  if (meaning != Meaning::Concatenation && meaning != Meaning::Slice && !isExtreme) return kNever;
+  const Column& result = Result();
   if (!result.IsListed()) return kNever;
   if (meaning == Meaning::Slice) {
     if (!At(0).IsListed() || !At(1).IsListed() || !At(2).IsListed()) return kNever;
@@ -75,6 +83,10 @@ double Supports::DrivenCost(const Constraint& constraint) {
   }
   if (constraint.Inputs() > kMostParts) return kNever;
   const bool isRepeated = mCount < constraint.arguments.size();
+  if (isExtreme) {
+    if (isRepeated || constraint.Inputs() < 2) return kNever;
+    return static_cast<double>(result.listing->count) * static_cast<double>(constraint.Inputs()) * kSearchCost;
+  }
   if (isRepeated && result.listing->texts.back() == GreatestText()) return kNever;
   return static_cast<double>(result.listing->count) * kSearchCost * static_cast<double>(constraint.Inputs() + 1) / 3;
 }
@@ -84,6 +96,8 @@ bool Supports::Drive(const Constraint& constraint) {
   if (DrivenCost(constraint) == kNever) return false;
   Start();
   mTries = mBudget;
+  mLeast = constraint.kind->meaning == Meaning::Minimum;
+  if (IsExtreme(constraint.kind->meaning)) return DriveExtreme();
   return constraint.kind->meaning == Meaning::Slice ? DriveSlice() : DriveConcatenation();
 }
 
@@ -241,6 +255,58 @@ void Supports::KeepOverflow(std::size_t greatest) {
     for (std::size_t i = 0; column.IsListed() && i < column.listing->count; ++i) {
       if (TextAt(*column.listing, i).size() + others > kTextLimit) column.Keep(i);
     }
+  }
+}
+
+// A result is had by an input, and every other input has something beyond it.
+bool Supports::DriveExtreme() {
+  const std::size_t results = Result().listing->count;
+  mExtremes.clear();
+  for (std::size_t i = 0; i < results; ++i) {
+    if (!Attain(mLeast ? i : results - 1 - i)) return false;
+  }
+  for (const Extreme& extreme : mExtremes) Result().Keep(extreme.index);
+  for (std::size_t input = 0; input < Inputs(); ++input) {
+    At(input).open = !At(input).IsListed();
+    if (At(input).IsListed()) KeepBesideExtreme(input);
+  }
+  return true;
+}
+
+bool Supports::Attain(std::size_t result) {
+  const std::string_view text = TextAt(*Result().listing, result);
+  std::size_t owner = 0, owners = 0;
+  for (std::size_t input = 0; input < Inputs(); ++input) {
+    if (!Spend()) return false;
+    const Column& column = At(input);
+    if (column.IsListed()) {
+      const std::string_view last = TextAt(*column.listing, mLeast ? column.listing->count - 1 : 0);
+      if (mLeast ? last < text : text < last) return true;  // this input is always nearer to the end
+      if (!Has(*column.listing, text)) continue;
+    }
+    owner = input;
+    ++owners;
+  }
+  if (owners > 0) mExtremes.push_back({result, owner, owners > 1});
+  return true;
+}
+
+// Keeps what the input has as the extreme, or beyond one of another input.
+void Supports::KeepBesideExtreme(std::size_t input) {
+  Column& column = At(input);
+  const Column& result = Result();
+  const auto other = std::find_if(mExtremes.begin(), mExtremes.end(),
+                                  [&](const Extreme& extreme) { return extreme.shared || extreme.owner != input; });
+  for (std::size_t i = 0; i < column.listing->count; ++i) {
+    const std::string_view text = TextAt(*column.listing, i);
+    bool kept = false;
+    if (other != mExtremes.end()) {
+      const std::string_view extreme = TextAt(*result.listing, other->index);
+      kept = mLeast ? extreme <= text : text <= extreme;
+    }
+    const std::size_t at = kept ? 0 : LowerBound(*result.listing, text);
+    if (!kept && at < result.listing->count) kept = TextAt(*result.listing, at) == text && result.kept[at] != 0;
+    if (kept) column.Keep(i);
   }
 }
 

@@ -14,7 +14,7 @@ RE2::Options Quiet() {
 
 }  // namespace
 
-// The engine tells the faulty part; where that is all of it, the fault shows at its end at the latest.
+// The engine tells the faulty part, which at times is all of it.
 Expression::Expression(const std::string& written) : mExpression(written, Quiet()) {
   if (mExpression.ok()) return;
   const std::size_t at = written.find(mExpression.error_arg());

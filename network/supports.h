@@ -72,6 +72,9 @@ class Supports {
   bool CutFrom(std::size_t input, std::string_view rest);
   void KeepChosen();
   void KeepOverflow(std::size_t greatest);
+  bool DriveExtreme();
+  bool Attain(std::size_t result);
+  void KeepBesideExtreme(std::size_t input);
   bool DriveSlice();
   bool Slice(std::size_t text, std::size_t from);
   void KeepSlice(std::size_t text, std::size_t from, std::size_t result, std::size_t first, std::size_t last);
@@ -108,6 +111,13 @@ class Supports {
     std::string_view text;
     std::size_t index = 0;
   };
+  // A text that is the least or the greatest of the inputs, with an input that has it.
+  struct Extreme {
+    std::size_t index, owner;
+    bool shared;  // others have it too
+  };
+  std::vector<Extreme> mExtremes;           // the nearest to the end of the order first
+  bool mLeast = true;                       // of the extremes
   std::vector<std::vector<char>> mReached;  // by input, the places where it can begin
   std::vector<char> mLeads, mLeadsNext;     // places from which the end is reached
   std::vector<Part> mParts;

@@ -13,7 +13,7 @@ namespace zornet {
 inline constexpr std::size_t kTextLimit = zor::kLengthLimit;
 
 inline ZORString ToZor(std::string_view text) { return {text.data(), text.size()}; }
-inline std::string_view ToView(const ZORString& text) { return zor::View(text); }
+inline std::string_view ToView(const ZORString& text) { return text.View(); }
 
 const ZORString& GreatestText();
 

@@ -119,7 +119,7 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
 
   int Become(ZORStringStateTag state, const ZORString& text);
   template <class Text>
-  int Settle(Text&& text);
+  ZOR_INTERNAL int Settle(Text&& text);
 
   static int NarrowOrder(const Single& a, const Single& b, Single& target, bool strict);
   int TestChoice(Single& x, const Single& y, const ZORString& chosen) const;
@@ -131,7 +131,7 @@ class ZOR_EXPORT ZORVadSingleString : public ZORVaDoString {
   ZORString mText;
 };
 
-ZOR_EXPORT inline int ZORVadSingleString::IsFull() const { return mState == ZorStringMax; }
+inline int ZORVadSingleString::IsFull() const { return mState == ZorStringMax; }
 
 template <class Text>
 int ZORVadSingleString::Settle(Text&& text) {

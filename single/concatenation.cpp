@@ -7,7 +7,7 @@ int ZORVadSingleString::CalcConcatenation(const ZORVadSingleString& x, const ZOR
   if (IsNil() || x.IsNil() || y.IsNil()) return Nil();
   if (x.IsUndefined() || y.IsUndefined()) return Any();  // overwrites a known value
   if (x.IsFull() || y.IsFull()) return CalcMaxValue();
-  const std::size_t length = zor::View(x.mText).size() + zor::View(y.mText).size();
+  const std::size_t length = x.mText.View().size() + y.mText.View().size();
   if (length > zor::kLengthLimit) return CalcMaxValue();
   if (!IsUndefined()) return mText.IsConcatenation(x.mText, y.mText) ? 0 : Nil();
   return Settle(ZORString::Concatenation(x.mText, y.mText));

@@ -2,6 +2,7 @@
 #include "host/Guard.h"
 #include "module/characters.h"
 #include "module/classdefinition.h"
+#include "module/readiness.h"
 #include "module/valuetypes.h"
 #include "single/ZORVadSingleString.h"
 
@@ -13,11 +14,18 @@ ZORVadSingleString* ZORVadSingleString::Build(ZORStreamable* object) {
   return static_cast<ZORVadSingleString*>(zor::BuildForRead<ZORVadSingleString>(object));
 }
 
-ZORVadSingleString::ZORVadSingleString() : mText(ZorVaDoStringAny) { mState = ZorStringAny; }
+ZORVadSingleString::ZORVadSingleString() : mText(ZorVaDoStringAny) {
+  zor::CheckReadiness();
+  mState = ZorStringAny;
+}
 
-ZORVadSingleString::ZORVadSingleString(const ZORString& text) : mText(text) { mState = ZorStringExact; }
+ZORVadSingleString::ZORVadSingleString(const ZORString& text) : mText(text) {
+  zor::CheckReadiness();
+  mState = ZorStringExact;
+}
 
 ZORVadSingleString::ZORVadSingleString(const void* text) : mText(static_cast<const char*>(text)) {
+  zor::CheckReadiness();
   mState = ZorStringExact;
 }
 

@@ -112,16 +112,15 @@ class ZOR_EXPORT ZORISVectorImp_String {
   int mGood;
 };
 
-// Inline, and exported for programs that do not inline them.
-ZOR_EXPORT inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) { return mItems[pos]; }
-ZOR_EXPORT inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) const { return mItems[pos]; }
-ZOR_EXPORT inline int ZORISVectorImp_String::Good() const { return mGood; }
-ZOR_EXPORT inline int ZORISVectorImp_String::Good() { return mGood; }
-ZOR_EXPORT inline int ZORISVectorImp_String::IsEmpty() const { return mTop == 0; }
-ZOR_EXPORT inline unsigned int ZORISVectorImp_String::Limit() const { return mLimit; }
-ZOR_EXPORT inline unsigned int ZORISVectorImp_String::Top() const { return mTop; }
-ZOR_EXPORT inline unsigned int ZORISVectorImp_String::Count() const { return mTop; }
-ZOR_EXPORT inline unsigned int ZORISVectorImp_String::GetDelta() const { return mDelta; }
+inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) { return mItems[pos]; }
+inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) const { return mItems[pos]; }
+inline int ZORISVectorImp_String::Good() const { return mGood; }
+inline int ZORISVectorImp_String::Good() { return mGood; }
+inline int ZORISVectorImp_String::IsEmpty() const { return mTop == 0; }
+inline unsigned int ZORISVectorImp_String::Limit() const { return mLimit; }
+inline unsigned int ZORISVectorImp_String::Top() const { return mTop; }
+inline unsigned int ZORISVectorImp_String::Count() const { return mTop; }
+inline unsigned int ZORISVectorImp_String::GetDelta() const { return mDelta; }
 
 // An iterator over a vector that must outlive it. The range is fixed when it is constructed or restarted, must be
 // within the vector's limit, and does not grow with the vector.

@@ -5,7 +5,7 @@ set -euo pipefail
 build=$1
 here=$(cd "$(dirname "$0")" && pwd)
 scratch=$build/install-test
-tree=$scratch/tree
+tree=${ZOR_TREE:-$scratch/tree}  # what is installed, by the part named tree or elsewhere
 
 fail() { echo "$*" >&2; exit 1; }
 fresh() { rm -rf "$1" && mkdir -p "$1"; }
@@ -71,11 +71,31 @@ hardening() {
   [[ $called == *cpy_chk* ]] || fail "copies unchecked"
 }
 
-# The printers are found beside the library and show what the program prints.
-gdb() {
-  command gdb -nx -batch -iex "add-auto-load-safe-path $tree" -x "$here/consumer/values.gdb" \
-    "$scratch/consumer/linked" >"$scratch/gdb.log" 2>&1 || { cat "$scratch/gdb.log" >&2; exit 1; }
-  diff <("$scratch/consumer/linked") <(sed -n 's/^(const ZOR[A-Za-z]* &) //p' "$scratch/gdb.log")
+# Whether gdb shows what a program prints: shown_by_gdb PROGRAM GDB_OPTION...
+shown_by_gdb() {
+  local program=$1
+  shift
+  command gdb -nx -batch "$@" -x "$here/consumer/values.gdb" "$program" >"$scratch/gdb.log" 2>&1 ||
+    { cat "$scratch/gdb.log" >&2; exit 1; }
+  diff <("$program") <(sed -n 's/^(const ZOR[A-Za-z]* &) //p' "$scratch/gdb.log")
+}
+
+# The printers are found beside the library.
+gdb() { shown_by_gdb "$scratch/consumer/linked" -iex "add-auto-load-safe-path $tree"; }
+
+# Programs of others, with each compiler, standard and kind of type information that they may use.
+deriving() {
+  local compiler standard flag flags
+  flags=$(PKG_CONFIG_PATH=$tree/lib/pkgconfig pkg-config --cflags --libs zorvadstrings)
+  for compiler in g++ clang++-14; do
+    for standard in c++20 c++2b; do
+      for flag in -frtti -fno-rtti -fsanitize=undefined; do
+        # shellcheck disable=SC2086  # flags are words
+        "$compiler" -std=$standard $flag "$here/consumer/deriving.cpp" $flags -Wl,-rpath,"$tree/lib" \
+          -o "$scratch/deriving" && "$scratch/deriving" || fail "$compiler -std=$standard $flag"
+      done
+    done
+  done
 }
 
 # Runs a program of a root folder there: nothing else is to be seen, no /proc either. Where nobody may change the root,
@@ -114,7 +134,7 @@ offered_by_bash() {
 }
 offered_by_zsh() {
   # shellcheck disable=SC2016  # zsh expands it
-  zsh -fc '_arguments() { print -rl -- $@ }; source $1' zsh "$tree/share/zsh/site-functions/_zornet" |
+  zsh -fc '_arguments() { print -rl -- $@ }; source $1' zsh "$(find "$tree/share/zsh" -name _zornet)" |
     grep -oE '^(\([^)]*\)|\*)*--[a-z-]+' | grep -oE -- '--[a-z-]+$'
 }
 offered_by_fish() {
@@ -153,7 +173,10 @@ packages() {
   cpack --config "$build/CPackConfig.cmake" -B "$scratch/packages" >"$scratch/cpack.log"
   cd "$scratch/packages"
   clean_root
-  ls bare/usr/share/gdb/auto-load/usr/lib/libZORHost.so.*-gdb.py
+  dpkg-deb -x ./*.ddeb bare
+  LD_LIBRARY_PATH=$PWD/bare/usr/lib shown_by_gdb bare/opt/app/bin/linked \
+    -iex "set debug-file-directory $PWD/bare/usr/lib/debug" \
+    -x bare/usr/share/gdb/auto-load/usr/lib/libZORHost.so.*-gdb.py
   [[ $(dpkg-deb -f ./*.deb Depends) == *libstdc++6* ]] || fail "the .deb does not tell what it needs"
   [[ $(zcat bare/usr/share/doc/zorvadstrings/changelog.gz) == "zorvadstrings ($(dpkg-deb -f ./*.deb Version))"* ]] ||
     fail "CHANGELOG.md does not begin with this version"

@@ -59,6 +59,11 @@ const Row kBroken[] = {
    "constraint str_concat(\"a\", \"b\");\n",
    "1:12: error: str_concat(x, y, z) takes 3 arguments, not 2\n"
    "constraint str_concat(\"a\", \"b\");\n           ^~~~~~~~~~~~~~~~~~~~\n"},
+  {"an expression that cannot be read, at its fault",
+   "var string: x;\nconstraint str_matches(x, \"ab[c\");\n",
+   "2:30: error: no regular expression: missing ]: [c\n"
+   "constraint str_matches(x, \"ab[c\");\n"
+   "                             ^~\n"},
   {"more arguments than any constraint takes",
    "constraint str_eq(\"a\", \"b\", 1, 2, 3);\n",
    "1:12: error: str_eq(x, y) takes 2 arguments, not 5\n"

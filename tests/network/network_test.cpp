@@ -49,6 +49,14 @@ TEST(Model, RefusesWhatItCannotHold) {
          m.Post("str_eq", {{x, "a"}, x});
        },
        "str_eq takes no list for x"},
+      {[](Model& m, Var x, Var) {
+         m.Post("str_matches", {x, "a(b"});
+       },
+       "missing ): a(b"},
+      {[](Model& m, Var x, Var) {
+         m.Post("str_table", {{x, x}, zornet::Rows{{{"a", "b"}, {"a"}}}});
+       },
+       "a row has 2 texts here, not 1"},
   };
   for (const auto& row : rows) {
     Model model;
@@ -124,6 +132,111 @@ TEST(Network, SearchesAndComesBack) {
   EXPECT_TRUE(all.complete);
   EXPECT_FALSE(network.Search(2, [] { return true; }).complete);
   EXPECT_EQ(network[x].Print() + network[y].Print(), "{ \"a\", \"b\" }{ \"b\", \"c\" }");
+}
+
+// A model in which x, y and z are sets or singles; what is left of them, and the solutions where they are counted.
+TEST(Network, NarrowsListsAndParts) {
+  struct {
+    void (*build)(Model& model);
+    const char* left;  // x and those behind it
+    std::uint64_t solutions;
+  } const rows[] = {
+      {[](Model& m) {
+         m.Post("str_concat", {m.Text("x"), m.Text("y"), "abc"});
+       },
+       "Any Any", 4},
+      {[](Model& m) {
+         m.Post("str_concat", {{m.TextSet("x"), "-", m.TextSet("y")}, "a-b-c"});
+       },
+       "{ \"a\", \"a-b\" } { \"b-c\", \"c\" }", 2},
+      {[](Model& m) {
+         const Var x = m.Text("x");
+         m.Post("str_concat", {{x, "-", x}, m.TextSet("z", {"a-a", "a-b", "ab-ab"})});
+       },
+       "Any { \"a-a\", \"ab-ab\" }", 2},
+      {[](Model& m) {
+         m.Post("str_lower", {m.Text("x"), "a-b"});
+       },
+       "Any", 4},
+      {[](Model& m) {
+         m.Post("str_substr", {"abc", m.Interval("x", 1, 9), m.Interval("y", 0, 1), m.Text("z")});
+       },
+       "1..9 0..1 Any", 18},
+      {[](Model& m) {
+         m.Post("str_max", {m.Text("x"), "  ", "  "});
+       },
+       "Any", 3},
+      {[](Model& m) {
+         m.Post("str_min", {{m.TextSet("x", {"a", "c"}), m.TextSet("y", {"b", "d"}), "d"}, m.TextSet("z", {"b", "d"})});
+       },
+       "\"c\" \"b\" \"b\"", 1},
+
+      {[](Model& m) {
+         m.Post("str_prefix", {m.TextSet("x"), "ab"});
+       },
+       "{ \"\", \"a\", \"ab\" }", 3},
+      {[](Model& m) {
+         m.Post("str_contains", {"aab", m.TextSet("x")});
+       },
+       "{ \"\", \"a\", \"aa\", \"aab\", \"ab\", \"b\" }", 6},
+      {[](Model& m) {
+         m.Post("str_find", {"banana", m.TextSet("x", {"a", "na", "x", ""}), m.Interval("y", 1, 9)});
+       },
+       "{ \"a\", \"na\" } 1..2", 2},
+      {[](Model& m) {
+         m.Post("str_replace", {m.TextSet("x"), "a", "b", "bab"});
+       },
+       "\"aab\"", 1},
+      {[](Model& m) {
+         m.Post("str_replace_all", {"a-b-c", "-", m.Text("x"), "a, b, c"});
+       },
+       "\", \"", 1},
+      {[](Model& m) {
+         m.Post("str_matches_reif", {m.TextSet("x", {"a1", "ab", "b22"}), "[a-z][0-9]+", false});
+       },
+       "\"ab\"", 1},
+
+      {[](Model& m) {
+         const Var x = m.TextSet("x", {"a", "b"}), y = m.TextSet("y", {"a", "b"}),
+                   z = m.TextSet("z", {"a", "b", "c", "d"});
+         m.Post("str_all_different", {{x, y, z}});
+       },
+       "{ \"a\", \"b\" } { \"a\", \"b\" } { \"c\", \"d\" }", 4},
+      {[](Model& m) {
+         m.Post("str_table", {{m.TextSet("x", {"a", "b"}), m.Text("y"), m.TextSet("z")},
+                              zornet::Rows{{{"a", "p", "1"}, {"c", "q", "2"}, {"b", "p", "3"}}}});
+       },
+       "{ \"a\", \"b\" } \"p\" { \"1\", \"3\" }", 2},
+  };
+  for (const auto& row : rows) {
+    Model model;
+    row.build(model);
+    Network network(model);
+    ASSERT_EQ(network.Narrow(), Outcome::Settled) << row.left;
+    std::string left;
+    for (int v = 0; v < static_cast<int>(model.Variables().size()); ++v) {
+      if (!model.Variables()[static_cast<std::size_t>(v)].constant)
+        left += (left.empty() ? "" : " ") + network[v].Print();
+    }
+    EXPECT_EQ(left, row.left);
+    const zornet::SearchResult all = network.Search(99, [] { return true; });
+    EXPECT_EQ(all.solutions, row.solutions) << row.left;
+    EXPECT_TRUE(all.complete) << row.left;
+  }
+}
+
+// Each text but one has a variable of its own: no search is needed to see that the last has none.
+TEST(Network, MatchesWithoutSearch) {
+  std::vector<std::string> texts;
+  for (int i = 0; i < 200; ++i) texts.push_back("t" + std::to_string(i));
+  Model model;
+  std::vector<zornet::Argument> variables;
+  for (int i = 0; i < 200; ++i) variables.emplace_back(model.TextSet("", texts));
+  model.Post("str_all_different", {variables});
+  variables.emplace_back(model.TextSet("", texts));
+  EXPECT_EQ(Network(model).Narrow(), Outcome::Settled);
+  model.Post("str_all_different", {variables});
+  EXPECT_EQ(Network(model).Narrow(), Outcome::Contradiction);
 }
 
 TEST(Network, TellsWhereModulesAreMissing) { EXPECT_NO_THROW(Network(Model(), {}, {"/nowhere"})); }

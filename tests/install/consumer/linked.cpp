@@ -3,15 +3,12 @@
 #include <iostream>
 
 #include "enum/ZORVadEnumString.h"
+#include "host/ZORPrint.h"
 #include "module/InitModule.h"
 #include "single/ZORVadSingleString.h"
 
 // Where the debugger looks at the values, to show the same.
-extern "C" __attribute__((noinline)) void Show(const ZORVaDoObject& value) {
-  ZORostrstream out;
-  value.PrintOn(out);
-  std::cout << out.View() << '\n';
-}
+extern "C" __attribute__((noinline)) void Show(const ZORVaDoObject& value) { std::cout << value << '\n'; }
 
 int main() {
   InitStrings();

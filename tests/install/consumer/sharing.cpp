@@ -1,6 +1,7 @@
 // Links the module and opens it by its name too: it is loaded once, and stays when the manager goes.
 #include <iostream>
 
+#include "host/ZORPrint.h"
 #include "module/InitModule.h"
 #include "single/ZORVadSingleString.h"
 
@@ -9,7 +10,7 @@ int main() {
     ZORVaDoModuleManager manager;
     const ZORVaDoModule* const module = manager.OpenModule("ZORVadStrings");
     if (module == nullptr) {
-      std::cerr << manager.GetFailure().CastToCharPtr() << '\n';
+      std::cerr << manager.GetFailure() << '\n';
       return 1;
     }
     if (module->FindDescriptor("single string") != ZORVadSingleString::sDescriptor) return 2;

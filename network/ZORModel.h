@@ -108,7 +108,7 @@ enum class Takes {
 constexpr bool IsList(Takes takes) { return takes >= Takes::Texts; }
 constexpr bool IsVariable(Takes takes) { return takes != Takes::Expression && takes != Takes::Rows; }
 constexpr bool IsNumber(Takes takes) {
-  return takes != Takes::Text && takes != Takes::Texts && takes != Takes::Anything;
+  return takes == Takes::Integer || takes == Takes::Boolean || takes >= Takes::Integers;
 }
 ZOR_EXPORT Takes MemberOf(Takes list);  // what the list holds; of another place what stands there
 

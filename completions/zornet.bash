@@ -9,12 +9,12 @@ _zornet() {
   case $previous in
     --color) mapfile -t COMPREPLY < <(compgen -W "auto always never" -- "$word") ;;
     --module-path) mapfile -t COMPREPLY < <(compgen -d -- "$word") ;;
-    --dot | --svg) mapfile -t COMPREPLY < <(compgen -f -- "$word") ;;
+    --dot | --svg | --parts) mapfile -t COMPREPLY < <(compgen -f -- "$word") ;;
     --solutions | --explain | --budget | --step-limit) ;;
     *)
       if [[ $word == -* ]]; then
-        mapfile -t COMPREPLY < <(compgen -W "--budget --color --dot --explain --help --json-stream --module-path --quiet
-          --raw --solutions --stats --step-limit --svg --trace --version" -- "$word")
+        mapfile -t COMPREPLY < <(compgen -W "--budget --color --dot --explain --help --json-stream --module-path --parts --quiet
+          --raw --solutions --split --stats --step-limit --svg --trace --version" -- "$word")
       else
         mapfile -t COMPREPLY < <(compgen -f -X '!*.szn' -- "$word"; compgen -d -- "$word")
       fi

@@ -3,7 +3,6 @@
 #include <fmt/core.h>
 
 #include <algorithm>
-#include <array>
 #include <cstdint>
 #include <unordered_map>
 #include <unordered_set>
@@ -41,6 +40,16 @@ std::string_view Describe(Takes takes) {
       return "a truth value";
     case Takes::Anything:
       return "anything";
+    case Takes::Expression:
+      return "a regular expression";
+    case Takes::Rows:
+      return "the rows of a table";
+    case Takes::Texts:
+      return "a list of texts";
+    case Takes::Integers:
+      return "a list of integers";
+    case Takes::Booleans:
+      return "a list of truth values";
   }
   return "";
 }
@@ -82,6 +91,7 @@ class Resolver {
   bool IsAllowed(const Variable& variable, const Word& word) const;
   bool Collect(std::span<const Word> words, Word::Type expected, Variable& variable);
   void Add(const ConstraintSyntax& constraint);
+  void RefuseExpression(const Kind& kind, std::span<const Word> arguments, const ExpressionError& error);
   const Kind* FindKindFor(const ConstraintSyntax& constraint);
   int AddArgument(const Word& word, Takes takes, std::string_view constraint, std::string_view role);
   int AddConstant(const Word& word);
@@ -94,6 +104,7 @@ class Resolver {
   Diagnostics& mDiagnostics;
   ReadModel mRead;
   Model& mModel = mRead.model;
+  std::vector<Argument> mArguments;  // of the constraint that is added
   std::unordered_map<std::string_view, int> mNames;
   std::unordered_set<std::string_view> mBroken;  // of these it was told already that something is wrong
 };
@@ -185,16 +196,34 @@ bool Resolver::IsAllowed(const Variable& variable, const Word& word) const {
 void Resolver::Add(const ConstraintSyntax& syntax) {
   const Kind* kind = FindKindFor(syntax);
   if (kind == nullptr) return;
-  std::array<Var, kMostArguments> variables;
+  mArguments.clear();
   bool good = true;
   const std::span<const Word> arguments = mSyntax.ArgumentsOf(syntax);
   for (std::size_t i = 0; i < arguments.size(); ++i) {
-    variables[i].index = AddArgument(arguments[i], kind->takes[i], kind->name, kind->roles[i]);
-    good = good && variables[i].index != kUnknown;
+    if (kind->takes[i] == Takes::Expression && arguments[i].type == Word::Text) {
+      mArguments.emplace_back(std::string(arguments[i].token.text));
+      continue;
+    }
+    const int variable = AddArgument(arguments[i], kind->takes[i], kind->name, kind->roles[i]);
+    mArguments.emplace_back(Var{variable});
+    good = good && variable != kUnknown;
   }
   if (!good) return;
-  mModel.Post(*kind, std::span(variables).first(arguments.size()));
+  try {
+    mModel.Post(*kind, mArguments);
+  } catch (const ExpressionError& error) {
+    RefuseExpression(*kind, arguments, error);
+  }
   mRead.places.constraints.push_back(syntax.extent);
+}
+
+void Resolver::RefuseExpression(const Kind& kind, std::span<const Word> arguments, const ExpressionError& error) {
+  for (std::size_t i = 0; i < arguments.size(); ++i) {
+    if (kind.takes[i] != Takes::Expression) continue;
+    const Extent quoted = arguments[i].token.extent;
+    const std::size_t begin = quoted.begin + 1 + error.offset;
+    mDiagnostics.Error({begin, quoted.End() - 1 - begin}, fmt::format("no regular expression: {}", error.what()));
+  }
 }
 
 // Null when there is no constraint of that name, or when it takes another number of arguments.

@@ -5,6 +5,8 @@
 
 #include "host/ZORNumbers.h"
 #include "network/ZORModel.h"
+#include "network/expression.h"
+#include "network/tables.h"
 #include "network/texts.h"
 
 namespace zornet {
@@ -81,41 +83,112 @@ Var Model::Boolean(std::string name) { return Add({std::move(name), Sort::Boolea
 Var Model::Boolean(std::string name, bool truth) { return Add({std::move(name), Sort::Boolean, {}, {truth ? 1 : 0}}); }
 
 Var Model::AddConstant(const Argument& value) {
+  if (const auto* variable = std::get_if<Var>(&value.mValue)) return *variable;
   if (const auto* text = std::get_if<std::string>(&value.mValue)) return Add({"", Sort::Text, {*text}, {}, true});
   if (const auto* number = std::get_if<std::int32_t>(&value.mValue))
     return Add({"", Sort::Integer, {}, {*number}, true});
-  if (const auto* truth = std::get_if<bool>(&value.mValue)) return Add({"", Sort::Boolean, {}, {*truth ? 1 : 0}, true});
-  return std::get<Var>(value.mValue);
+  return Add({"", Sort::Boolean, {}, {std::get<bool>(value.mValue) ? 1 : 0}, true});
 }
 
 int Model::Post(std::string_view name, std::initializer_list<Argument> arguments) {
-  const Kind* const kind = FindKind(name);
+  const bool list = std::any_of(arguments.begin(), arguments.end(), std::mem_fn(&Argument::IsList));
+  const Kind* const kind = FindKind(name, list);
   if (kind == nullptr) Refuse("there is no constraint '" + std::string(name) + "'");
+  return Post(*kind, {arguments.begin(), arguments.size()});
+}
+
+int Model::Post(const Kind& kind, std::span<const Argument> arguments) {
+  if (static_cast<int>(arguments.size()) != kind.arity)
+    Refuse(std::string(kind.name) + " takes " + std::to_string(kind.arity) + " arguments, not " +
+           std::to_string(arguments.size()));
   const std::size_t before = mVariables.size();
   try {
-    std::vector<Var> variables;
-    for (const Argument& argument : arguments) variables.push_back(AddConstant(argument));
-    return Post(*kind, variables);
+    Flatten(kind, arguments);
   } catch (...) {
     mVariables.resize(before);
     throw;
   }
+  mConstraints.push_back({&kind, Keep(mPosted), mExpression, mTable});
+  return static_cast<int>(mConstraints.size()) - 1;
 }
 
-int Model::Post(const Kind& kind, std::span<const Var> arguments) {
-  if (static_cast<int>(arguments.size()) != kind.arity)
-    Refuse(std::string(kind.name) + " takes " + std::to_string(kind.arity) + " arguments, not " +
-           std::to_string(arguments.size()));
-  Constraint constraint{&kind};
-  for (std::size_t i = 0; i < arguments.size(); ++i) {
-    const auto at = static_cast<std::size_t>(arguments[i].index);
-    if (at >= mVariables.size()) Refuse("no variable of this model");
-    if (!Fits(mVariables[at].sort, kind.takes[i]))
-      Refuse(std::string(kind.name) + " cannot take '" + mVariables[at].name + "' for " + std::string(kind.roles[i]));
-    constraint.arguments[i] = arguments[i].index;
+void Model::Flatten(const Kind& kind, std::span<const Argument> arguments) {
+  mPosted.clear();
+  mExpression = nullptr;
+  mTable = nullptr;
+  for (std::size_t place = 0; place < arguments.size(); ++place) {
+    const auto* const list = std::get_if<std::vector<Argument>>(&arguments[place].mValue);
+    if ((list != nullptr) != IsList(kind.takes[place]))
+      Refuse(std::string(kind.name) + " takes " + (list != nullptr ? "no list" : "a list") + " for " +
+             std::string(kind.roles[place]));
+    if (!IsVariable(kind.takes[place]) && list == nullptr) {
+      TakeExtra(kind, place, arguments[place]);
+    } else if (list == nullptr) {
+      Take(kind, place, arguments[place]);
+    } else if (list->empty()) {
+      Refuse(std::string(kind.name) + " takes at least one member in " + std::string(kind.roles[place]));
+    } else {
+      for (const Argument& member : *list) Take(kind, place, member);
+    }
   }
-  mConstraints.push_back(constraint);
-  return static_cast<int>(mConstraints.size()) - 1;
+}
+
+// What is no variable.
+void Model::TakeExtra(const Kind& kind, std::size_t place, const Argument& argument) {
+  const auto* const text = std::get_if<std::string>(&argument.mValue);
+  const auto* const rows = std::get_if<Rows>(&argument.mValue);
+  if (kind.takes[place] == Takes::Expression && text != nullptr) {
+    mExpression = mExpressions.emplace_back(std::make_shared<Expression>(*text)).get();
+  } else if (kind.takes[place] == Takes::Rows && rows != nullptr) {
+    for (const auto& row : rows->rows) std::for_each(row.begin(), row.end(), CheckText);
+    mTable = mTables.emplace_back(std::make_shared<Table>(*rows, mPosted.size())).get();
+  } else {
+    Refuse(std::string(kind.name) + " cannot take this for " + std::string(kind.roles[place]));
+  }
+}
+
+void Model::Take(const Kind& kind, std::size_t place, const Argument& argument) {
+  if (argument.IsList()) Refuse("a list holds no list");
+  if (std::holds_alternative<Rows>(argument.mValue))
+    Refuse(std::string(kind.name) + " takes no table for " + std::string(kind.roles[place]));
+  const Var variable = AddConstant(argument);
+  const auto at = static_cast<std::size_t>(variable.index);
+  if (at >= mVariables.size()) Refuse("no variable of this model");
+  if (!Fits(mVariables[at].sort, MemberOf(kind.takes[place])))
+    Refuse(std::string(kind.name) + " cannot take '" + mVariables[at].name + "' for " + std::string(kind.roles[place]));
+  mPosted.push_back(variable.index);
+}
+
+std::span<const int> Model::Keep(std::span<const int> numbers) {
+  constexpr std::size_t kBlock = 4096;
+  if (mArguments.empty() || mArguments.back().size - mArguments.back().used < numbers.size()) {
+    const std::size_t size = std::max(kBlock, numbers.size());
+    mArguments.push_back({std::make_unique<int[]>(size), 0, size});
+  }
+  Block& block = mArguments.back();
+  int* const first = block.numbers.get() + block.used;
+  std::copy(numbers.begin(), numbers.end(), first);
+  block.used += numbers.size();
+  return {first, numbers.size()};
+}
+
+Model::Model(const Model& other)
+    : mVariables(other.mVariables),
+      mConstraints(other.mConstraints),
+      mExpressions(other.mExpressions),
+      mTables(other.mTables),
+      mWanted(other.mWanted) {
+  for (Constraint& constraint : mConstraints) constraint.arguments = Keep(constraint.arguments);
+}
+
+Model& Model::operator=(Model other) noexcept {
+  mVariables.swap(other.mVariables);
+  mConstraints.swap(other.mConstraints);
+  mArguments.swap(other.mArguments);
+  mExpressions.swap(other.mExpressions);
+  mTables.swap(other.mTables);
+  mWanted.swap(other.mWanted);
+  return *this;
 }
 
 void Model::Want(Var variable) {

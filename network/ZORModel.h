@@ -12,7 +12,9 @@
 #include <cstddef>
 #include <cstdint>
 #include <initializer_list>
+#include <memory>
 #include <span>
+#include <stdexcept>
 #include <string>
 #include <string_view>
 #include <variant>
@@ -60,13 +62,20 @@ struct Variable {
   bool constant = false;
 };
 
-// What a constraint says: a relation between its first two arguments, whose truth a reified relation puts into its
-// third, or a function that gives its last argument.
+// What a constraint says: a relation between its arguments, or a function that gives the last one. A reified constraint
+// has one argument more, which tells whether that is so. Of truth values, which are 0 and 1 where numbers are asked
+// for, unequal is "not", less or equal is "implies", the minimum is "and" and the maximum "or".
 enum class Meaning {
   Equal,
   Unequal,
   LessOrEqual,
   Less,
+  Prefix,    // the second text begins with the first
+  Suffix,    // the second text ends with the first
+  Contains,  // the second text stands somewhere in the first
+  Matches,   // the regular expression describes the whole text
+  AllDifferent,
+  Row,  // the texts are a row of the table
   Concatenation,
   Slice,  // characters from one position to another, both included
   Length,
@@ -76,37 +85,88 @@ enum class Meaning {
   Maximum,
   Successor,
   TextForm,
+  Position,  // of the first occurrence of the second text in the first, or -1
+  ReplaceFirst,
+  ReplaceAll,
+  Sum,
+  Product,
 };
 
-enum class Takes { Text, Integer, Boolean, Anything };
-inline constexpr int kMostArguments = 4;
+// What stands at one place of a constraint. The plural is a list, as str_concat([a, "-", b], z) has one; a constraint
+// has at most one list. An expression and rows are no variables.
+enum class Takes {
+  Text,
+  Integer,
+  Boolean,
+  Anything,
+  Expression,
+  Rows,
+  Texts,
+  Integers,
+  Booleans,
+};
+constexpr bool IsList(Takes takes) { return takes >= Takes::Texts; }
+constexpr bool IsVariable(Takes takes) { return takes != Takes::Expression && takes != Takes::Rows; }
+constexpr bool IsNumber(Takes takes) {
+  return takes == Takes::Integer || takes == Takes::Boolean || takes >= Takes::Integers;
+}
+ZOR_EXPORT Takes MemberOf(Takes list);  // what the list holds; of another place what stands there
 
-// A constraint that can be posted.
-struct Kind {
+inline constexpr int kMostArguments = 5;
+
+// A constraint that can be posted. Two forms may share a name: one with a list and one without.
+struct ZOR_EXPORT Kind {
   std::string_view name;
   Meaning meaning;
   bool mirrored;  // the relation with first and second exchanged
   bool reified;
-  int arity;
+  int arity;  // arguments as they are written, where a list is one
   std::array<Takes, kMostArguments> takes;
   std::array<std::string_view, kMostArguments> roles;
 
-  constexpr bool IsRelation() const { return meaning <= Meaning::Less; }
-  constexpr int Inputs() const { return arity - 1; }  // of a function: its result comes last
+  constexpr bool IsComparison() const { return meaning <= Meaning::Less; }
+  constexpr bool IsRelation() const { return meaning <= Meaning::Row; }
+  constexpr bool IsOfNumbers() const { return IsNumber(takes[0]); }  // integers or truth values, no texts
+  bool HasList() const;
 };
 
 ZOR_EXPORT std::span<const Kind> Kinds();
-ZOR_EXPORT const Kind* FindKind(std::string_view name);  // null when there is none
+
+// The constraint of that name; of two forms the one with a list, or the one without. Null when there is none.
+ZOR_EXPORT const Kind* FindKind(std::string_view name, bool list = false);
 ZOR_EXPORT bool Fits(Sort sort, Takes takes);
 
-struct Constraint {
-  const Kind* kind = nullptr;
-  std::array<int, kMostArguments> arguments = {};  // variables by number
-
-  int Result() const { return arguments[static_cast<std::size_t>(kind->Inputs())]; }
+// The rows of a table, all of one length.
+struct Rows {
+  std::vector<std::vector<std::string>> rows;
 };
 
-// An argument of a constraint: a variable, or a constant.
+// A regular expression cannot be read from this character on: what() says why.
+struct ZOR_EXPORT ExpressionError : std::invalid_argument {
+  ExpressionError(const std::string& what, std::size_t at) : std::invalid_argument(what), offset(at) {}
+  std::size_t offset;
+};
+
+class Expression;
+class Table;
+
+// A constraint of a model, to which all that it points at belongs.
+struct ZOR_EXPORT Constraint {
+  const Kind* kind = nullptr;
+  std::span<const int> arguments = {};  // variables by number; a list's members stand in its place one by one
+  const Expression* expression = nullptr;
+  const Table* table = nullptr;
+
+  std::size_t Inputs() const { return arguments.size() - 1; }  // of a function, or reified: the result comes last
+  int Result() const { return arguments.back(); }
+
+  // Where arguments[position] stands as the constraint is written: an index into takes and roles.
+  std::size_t Place(std::size_t position) const;
+  std::string_view RoleOf(std::size_t position) const { return kind->roles[Place(position)]; }
+};
+
+// An argument of a constraint as it is written: a variable, a constant, a list of them, a regular expression in a text,
+// or the rows of a table.
 class Argument {
  public:
   // NOLINTBEGIN(google-explicit-constructor): arguments are written as what they are
@@ -115,15 +175,26 @@ class Argument {
   Argument(std::string text) : mValue(std::move(text)) {}
   Argument(std::int32_t number) : mValue(number) {}
   Argument(bool truth) : mValue(truth) {}
+  Argument(std::vector<Argument> list) : mValue(std::move(list)) {}
+  Argument(std::initializer_list<Argument> list) : mValue(std::vector<Argument>(list)) {}
+  Argument(Rows rows) : mValue(std::move(rows)) {}
   // NOLINTEND(google-explicit-constructor)
+
+  bool IsList() const { return std::holds_alternative<std::vector<Argument>>(mValue); }
 
  private:
   friend class Model;
-  std::variant<Var, std::string, std::int32_t, bool> mValue;
+  std::variant<Var, std::string, std::int32_t, bool, std::vector<Argument>, Rows> mValue;
 };
 
 class ZOR_EXPORT Model {
  public:
+  Model() = default;
+  Model(const Model& other);
+  Model(Model&&) noexcept = default;
+  Model& operator=(Model other) noexcept;
+  ~Model() = default;
+
   // clang-format off
   // Variables, by a name for people, which may be empty. Without a value nothing is known of them.
   Var Text      (std::string name);
@@ -142,8 +213,11 @@ class ZOR_EXPORT Model {
 
   // Posts the constraint of that name, such as "str_concat"; docs/language.md lists them with their arguments.
   // Answers its number.
+  //
+  //   model.Post("str_concat", {x, "-7", z});
+  //   model.Post("str_concat", {{a, "-", b}, z});  // with a list; FindKind chooses the form
   int Post(std::string_view name, std::initializer_list<Argument> arguments);
-  int Post(const Kind& kind, std::span<const Var> arguments);
+  int Post(const Kind& kind, std::span<const Argument> arguments);
 
   // Names a variable that is wanted: solutions that differ elsewhere only are one solution. Without any, all
   // variables are wanted.
@@ -157,8 +231,24 @@ class ZOR_EXPORT Model {
   void Reserve(std::size_t variables, std::size_t constraints);  // room, for large models
 
  private:
+  struct ZOR_INTERNAL Block {
+    std::unique_ptr<int[]> numbers;
+    std::size_t used = 0, size = 0;
+  };
+
+  void Flatten(const Kind& kind, std::span<const Argument> arguments);
+  void TakeExtra(const Kind& kind, std::size_t place, const Argument& argument);
+  void Take(const Kind& kind, std::size_t place, const Argument& argument);
+  std::span<const int> Keep(std::span<const int> numbers);
+
   std::vector<Variable> mVariables;
   std::vector<Constraint> mConstraints;
+  std::vector<Block> mArguments;            // of all constraints; never moved, so that these may point at them
+  std::vector<int> mPosted;                 // the arguments of the constraint that is posted
+  const Expression* mExpression = nullptr;  // of the same
+  const Table* mTable = nullptr;
+  std::vector<std::shared_ptr<const Expression>> mExpressions;  // of all constraints; copies of a model share them
+  std::vector<std::shared_ptr<const Table>> mTables;
   std::vector<int> mWanted;
 };
 

@@ -1,4 +1,4 @@
-// Supports that are driven from the listed results of a concatenation or a slice.
+// Supports that are driven from the listed results of a concatenation, a slice, a minimum or a maximum.
 #include <algorithm>
 #include <limits>
 #include <string_view>
@@ -10,6 +10,7 @@ namespace zornet {
 namespace {
 
 constexpr double kNever = std::numeric_limits<double>::infinity();
+constexpr std::size_t kMostParts = 1000;
 constexpr double kSearchCost = 8;  // looking for the beginnings of a text costs about as much as so many combinations
 
 std::string_view TextAt(const Listing& listing, std::size_t i) { return ToView(listing.texts[i]); }
@@ -60,22 +61,34 @@ bool ForEachBeginning(const Listing& listing, std::string_view text, Visit visit
   }
 }
 
+bool IsExtreme(Meaning meaning) { return meaning == Meaning::Minimum || meaning == Meaning::Maximum; }
+
+bool Has(const Listing& listing, std::string_view text) {
+  const std::size_t i = LowerBound(listing, text);
+  return i < listing.count && TextAt(listing, i) == text;
+}
+
 }  // namespace
 
 // An estimate, to be compared with a number of combinations; infinity when it cannot be driven.
 double Supports::DrivenCost(const Constraint& constraint) {
   const Meaning meaning = constraint.kind->meaning;
-  if (meaning != Meaning::Concatenation && meaning != Meaning::Slice) return kNever;
-  const Column &x = At(0), &y = At(1), &result = At(constraint.kind->Inputs());
+  const bool isExtreme = IsExtreme(meaning) && !constraint.kind->IsOfNumbers();
+  if (meaning != Meaning::Concatenation && meaning != Meaning::Slice && !isExtreme) return kNever;
+  const Column& result = Result();
   if (!result.IsListed()) return kNever;
   if (meaning == Meaning::Slice) {
-    if (!x.IsListed() || !y.IsListed() || !At(2).IsListed()) return kNever;
-    return static_cast<double>(x.listing->count) * static_cast<double>(y.listing->count) * kSearchCost;
+    if (!At(0).IsListed() || !At(1).IsListed() || !At(2).IsListed()) return kNever;
+    return static_cast<double>(At(0).listing->count) * static_cast<double>(At(1).listing->count) * kSearchCost;
   }
-  const bool isDoubled = &x == &y && !x.IsListed(), isRepeated = mCount < 3;
-  if (!isDoubled && isRepeated && result.listing->texts.back() == GreatestText()) return kNever;
-  if (!isDoubled && !x.IsListed() && !y.IsListed()) return kNever;
-  return static_cast<double>(result.listing->count) * kSearchCost;
+  if (constraint.Inputs() > kMostParts) return kNever;
+  const bool isRepeated = mCount < constraint.arguments.size();
+  if (isExtreme) {
+    if (isRepeated || constraint.Inputs() < 2) return kNever;
+    return static_cast<double>(result.listing->count) * static_cast<double>(constraint.Inputs()) * kSearchCost;
+  }
+  if (isRepeated && result.listing->texts.back() == GreatestText()) return kNever;
+  return static_cast<double>(result.listing->count) * kSearchCost * static_cast<double>(constraint.Inputs() + 1) / 3;
 }
 
 // False when it takes more than the budget.
@@ -83,6 +96,8 @@ bool Supports::Drive(const Constraint& constraint) {
   if (DrivenCost(constraint) == kNever) return false;
   Start();
   mTries = mBudget;
+  mLeast = constraint.kind->meaning == Meaning::Minimum;
+  if (IsExtreme(constraint.kind->meaning)) return DriveExtreme();
   return constraint.kind->meaning == Meaning::Slice ? DriveSlice() : DriveConcatenation();
 }
 
@@ -93,70 +108,206 @@ bool Supports::Spend() {
 }
 
 bool Supports::DriveConcatenation() {
-  const Listing& results = *At(2).listing;
-  const bool isDoubled = &At(0) == &At(1) && !At(0).IsListed();
+  const Listing& results = *Result().listing;
+  const bool isRepeated = mCount < mColumnOf.size();
   for (std::size_t i = 0; i < results.count && !HasAll(); ++i) {
-    if (!(isDoubled ? KeepDoubled(i) : Split(i))) return false;
+    if (!(isRepeated ? CutRepeated(i) : CutDifferent(i))) return false;
     if (results.texts[i] == GreatestText()) KeepOverflow(i);
   }
   return true;
 }
 
-// Keeps the ways to cut the result in two: x begins it, y is the rest.
-bool Supports::Split(std::size_t result) {
-  const Column& x = At(0);
-  const std::string_view text = TextAt(*At(2).listing, result);
-  if (x.IsListed()) {
-    return ForEachBeginning(*x.listing, text, [&](bool begins, std::size_t i) {
+// Keeps the ways to cut the result, where no input stands twice: what is reached from its beginning and leads to its
+// end.
+bool Supports::CutDifferent(std::size_t result) {
+  const std::string_view text = TextAt(*Result().listing, result);
+  if (!Reach(text)) return false;
+  if (mReached.back()[text.size()] == 0) return true;
+  Result().Keep(result);
+  mLeads.assign(text.size() + 1, 0);
+  mLeads.back() = 1;
+  for (std::size_t input = Inputs(); input-- > 0;) {
+    mLeadsNext.assign(text.size() + 1, 0);
+    if (!(At(input).IsListed() ? KeepParts(input) : KeepUnknownParts(input, text))) return false;
+    mLeads.swap(mLeadsNext);
+  }
+  return true;
+}
+
+// Finds from which places of the text each input can begin, when those before it are cut off.
+bool Supports::Reach(std::string_view text) {
+  mParts.clear();
+  mReached.resize(Inputs() + 1);
+  for (auto& places : mReached) places.assign(text.size() + 1, 0);
+  mReached[0][0] = 1;
+  for (std::size_t input = 0; input < Inputs(); ++input) {
+    for (std::size_t from = 0; from <= text.size(); ++from) {
+      if (mReached[input][from] == 0) continue;
+      if (!At(input).IsListed()) {
+        auto& next = mReached[input + 1];
+        std::fill(next.begin() + static_cast<std::ptrdiff_t>(from), next.end(), 1);
+        break;
+      }
+      if (!ReachFrom(input, text, from)) return false;
+    }
+  }
+  return true;
+}
+
+bool Supports::ReachFrom(std::size_t input, std::string_view text, std::size_t from) {
+  const Listing& listing = *At(input).listing;
+  const std::string_view rest = text.substr(from);
+  const auto add = [&](std::size_t i) {
+    const std::size_t to = from + TextAt(listing, i).size();
+    mParts.push_back({input, from, to, i});
+    mReached[input + 1][to] = 1;
+  };
+  if (input + 1 == Inputs()) {
+    const std::size_t i = LowerBound(listing, rest);
+    if (i < listing.count && TextAt(listing, i) == rest) add(i);
+    return Spend();
+  }
+  return ForEachBeginning(listing, rest, [&](bool begins, std::size_t i) {
+    if (begins) add(i);
+    return Spend();
+  });
+}
+
+// From mLeads, the places that the next input can begin at, to mLeadsNext, those of this one.
+bool Supports::KeepParts(std::size_t input) {
+  for (; !mParts.empty() && mParts.back().input == input; mParts.pop_back()) {
+    const Part& part = mParts.back();
+    if (mLeads[part.to] == 0) continue;
+    At(input).Keep(part.index);
+    mLeadsNext[part.from] = 1;
+  }
+  return true;
+}
+
+bool Supports::KeepUnknownParts(std::size_t input, std::string_view text) {
+  for (std::size_t from = 0; from <= text.size(); ++from) {
+    if (mReached[input][from] == 0) continue;
+    for (std::size_t to = from; to <= text.size(); ++to) {
+      if (mLeads[to] == 0) continue;
       if (!Spend()) return false;
-      if (begins) KeepCut(result, TextAt(*x.listing, i).size(), i);
-      return true;
+      mLeadsNext[from] = 1;
+      At(input).found.push_back({ToZor(text.substr(from, to - from)), 0});
+    }
+  }
+  return true;
+}
+
+// The same where an input stands twice or is the result: each way to cut is tried.
+bool Supports::CutRepeated(std::size_t result) {
+  const std::string_view text = TextAt(*Result().listing, result);
+  mChosen.assign(mCount, {});
+  mChosen[mColumnOf.back()] = {true, text, result};
+  return CutFrom(0, text);
+}
+
+bool Supports::CutFrom(std::size_t input, std::string_view rest) {
+  if (!Spend()) return false;
+  if (input == Inputs()) {
+    if (rest.empty()) KeepChosen();
+    return true;
+  }
+  Choice& choice = mChosen[mColumnOf[input]];
+  if (choice.made) return !rest.starts_with(choice.text) || CutFrom(input + 1, rest.substr(choice.text.size()));
+  const auto choose = [&](std::size_t length, std::size_t i) {
+    choice = {true, rest.substr(0, length), i};
+    const bool goOn = CutFrom(input + 1, rest.substr(length));
+    choice.made = false;
+    return goOn;
+  };
+  if (At(input).IsListed()) {
+    const Listing& listing = *At(input).listing;
+    return ForEachBeginning(listing, rest, [&](bool begins, std::size_t i) {
+      return begins ? choose(TextAt(listing, i).size(), i) : Spend();
     });
   }
-  for (std::size_t length = 0; length <= text.size(); ++length) {
-    if (!Spend()) return false;
-    KeepCut(result, length, 0);
+  for (std::size_t length = 0; length <= rest.size(); ++length) {
+    if (!choose(length, 0)) return false;
   }
   return true;
 }
 
-// Cuts the result behind so many characters, which are the text of x at i where x is listed.
-void Supports::KeepCut(std::size_t result, std::size_t length, std::size_t i) {
-  Column &x = At(0), &y = At(1), &z = At(2);
-  const std::string_view text = TextAt(*z.listing, result), rest = text.substr(length);
-  const std::size_t j = y.IsListed() ? LowerBound(*y.listing, rest) : 0;
-  if (y.IsListed() && (j == y.listing->count || TextAt(*y.listing, j) != rest)) return;
-  if ((&x == &z && i != result) || (&y == &z && j != result) || (&x == &y && i != j)) return;
-  x.IsListed() ? x.Keep(i) : x.found.push_back({ToZor(text.substr(0, length)), 0});
-  y.IsListed() ? y.Keep(j) : y.found.push_back({ToZor(rest), 0});
-  z.Keep(result);
-}
-
-// Of one unknown text twice.
-bool Supports::KeepDoubled(std::size_t result) {
-  const std::string_view text = TextAt(*At(2).listing, result), half = text.substr(0, text.size() / 2);
-  if (!Spend()) return false;
-  if (half != text.substr(half.size())) return true;
-  At(0).found.push_back({ToZor(half), 0});
-  At(2).Keep(result);
-  return true;
+void Supports::KeepChosen() {
+  for (std::size_t i = 0; i < mCount; ++i) {
+    Column& column = mColumns[i];
+    column.IsListed() ? column.Keep(mChosen[i].index) : column.found.push_back({ToZor(mChosen[i].text), 0});
+  }
 }
 
 // The greatest text is also what every longer concatenation becomes.
 void Supports::KeepOverflow(std::size_t greatest) {
-  Column &x = At(0), &y = At(1);
-  const std::size_t longestX = x.IsListed() ? LongestOf(*x.listing) : kTextLimit;
-  const std::size_t longestY = y.IsListed() ? LongestOf(*y.listing) : kTextLimit;
-  if (longestX + longestY <= kTextLimit) return;
-  At(2).Keep(greatest);
-  const auto keep = [](Column& column, std::size_t longestOther) {
+  mLongest.clear();
+  std::size_t longest = 0;
+  for (std::size_t input = 0; input < Inputs(); ++input) {
+    mLongest.push_back(At(input).IsListed() ? LongestOf(*At(input).listing) : kTextLimit);
+    longest += mLongest.back();
+  }
+  if (longest <= kTextLimit) return;
+  Result().Keep(greatest);
+  for (std::size_t input = 0; input < Inputs(); ++input) {
+    Column& column = At(input);
     column.open = !column.IsListed();
+    const std::size_t others = longest - mLongest[input];
     for (std::size_t i = 0; column.IsListed() && i < column.listing->count; ++i) {
-      if (TextAt(*column.listing, i).size() + longestOther > kTextLimit) column.Keep(i);
+      if (TextAt(*column.listing, i).size() + others > kTextLimit) column.Keep(i);
     }
-  };
-  keep(x, longestY);
-  keep(y, longestX);
+  }
+}
+
+// A result is had by an input, and every other input has something beyond it.
+bool Supports::DriveExtreme() {
+  const std::size_t results = Result().listing->count;
+  mExtremes.clear();
+  for (std::size_t i = 0; i < results; ++i) {
+    if (!Attain(mLeast ? i : results - 1 - i)) return false;
+  }
+  for (const Extreme& extreme : mExtremes) Result().Keep(extreme.index);
+  for (std::size_t input = 0; input < Inputs(); ++input) {
+    At(input).open = !At(input).IsListed();
+    if (At(input).IsListed()) KeepBesideExtreme(input);
+  }
+  return true;
+}
+
+bool Supports::Attain(std::size_t result) {
+  const std::string_view text = TextAt(*Result().listing, result);
+  std::size_t owner = 0, owners = 0;
+  for (std::size_t input = 0; input < Inputs(); ++input) {
+    if (!Spend()) return false;
+    const Column& column = At(input);
+    if (column.IsListed()) {
+      const std::string_view last = TextAt(*column.listing, mLeast ? column.listing->count - 1 : 0);
+      if (mLeast ? last < text : text < last) return true;  // this input is always nearer to the end
+      if (!Has(*column.listing, text)) continue;
+    }
+    owner = input;
+    ++owners;
+  }
+  if (owners > 0) mExtremes.push_back({result, owner, owners > 1});
+  return true;
+}
+
+// Keeps what the input has as the extreme, or beyond one of another input.
+void Supports::KeepBesideExtreme(std::size_t input) {
+  Column& column = At(input);
+  const Column& result = Result();
+  const auto other = std::find_if(mExtremes.begin(), mExtremes.end(),
+                                  [&](const Extreme& extreme) { return extreme.shared || extreme.owner != input; });
+  for (std::size_t i = 0; i < column.listing->count; ++i) {
+    const std::string_view text = TextAt(*column.listing, i);
+    bool kept = false;
+    if (other != mExtremes.end()) {
+      const std::string_view extreme = TextAt(*result.listing, other->index);
+      kept = mLeast ? extreme <= text : text <= extreme;
+    }
+    const std::size_t at = kept ? 0 : LowerBound(*result.listing, text);
+    if (!kept && at < result.listing->count) kept = TextAt(*result.listing, at) == text && result.kept[at] != 0;
+    if (kept) column.Keep(i);
+  }
 }
 
 bool Supports::DriveSlice() {

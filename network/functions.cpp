@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <utility>
 
 namespace zornet {
 
@@ -25,9 +26,25 @@ Operation ForwardOf(Meaning meaning) {
       return Operation::Maximum;
     case Meaning::Successor:
       return Operation::Successor;
-    default:
+    case Meaning::Sum:
+      return Operation::Sum;
+    case Meaning::Product:
+      return Operation::Product;
+    case Meaning::TextForm:
       return Operation::TextForm;
+    default:
+      return Operation::Supports;
   }
+}
+
+// Whether the module has an operation for it that takes sets.
+bool TakesSets(Meaning meaning) {
+  return meaning >= Meaning::Concatenation && meaning < Meaning::TextForm && meaning != Meaning::Slice;
+}
+
+// Whether it takes any number of inputs.
+bool IsFold(Meaning meaning) {
+  return meaning == Meaning::Concatenation || meaning == Meaning::Minimum || meaning == Meaning::Maximum;
 }
 
 constexpr std::int64_t kLastPosition = zor::kLengthLimit - 1;  // of a character in any text
@@ -58,6 +75,7 @@ Functions::Functions(Store& store, std::size_t budget)
     : mStore(store),
       mSemantics(store.Types()),
       mSupports(store, mSemantics, budget),
+      mArithmetic(store),
       mX(store.Types(), Sort::TextSet),
       mY(store.Types(), Sort::TextSet),
       mZ(store.Types(), Sort::TextSet) {}
@@ -65,18 +83,21 @@ Functions::Functions(Store& store, std::size_t budget)
 // Inputs with one value each give the result by one forward operation. An Undefined result takes what the module makes
 // of the sets of inputs. Everything else needs supports, or the module's sets again where these exceed the budget.
 Status Functions::Narrow(const Constraint& constraint) {
-  if (HasExactInputs(constraint)) {
+  if (constraint.kind->IsRelation() && !constraint.kind->reified) return NarrowRelation(constraint);
+  if (HasExact(constraint.arguments.first(constraint.Inputs()))) {
     ComputeExact(constraint);
     return Status::Subsumed;
   }
+  if (constraint.kind->IsOfNumbers()) return NarrowNumbers(constraint);
   if (constraint.kind->meaning == Meaning::Length) BoundLength(constraint.Result());
+  if (constraint.kind->meaning == Meaning::Position && !constraint.kind->reified) BoundPosition(constraint.Result());
   if (mStore.HasFailed()) return Status::Fixpoint;
   if (constraint.kind->meaning == Meaning::Successor && constraint.arguments[0] == constraint.Result()) {
     mStore.StartOperation(Operation::Successor);
     MeetResult(constraint, {GreatestText(), 0});  // the greatest text is its own successor
     return Status::Subsumed;
   }
-  if (mStore[constraint.Result()].IsUndefined() && ComputeSets(constraint)) return Status::Fixpoint;
+  if (!mStore.List(constraint.Result()).known && ComputeSets(constraint)) return Status::Fixpoint;
   if (mSupports.Narrow(constraint)) return Status::Fixpoint;
   if (constraint.kind->meaning == Meaning::Slice && BoundSlice(constraint)) return Status::Subsumed;
   if (mStore.HasFailed()) return Status::Fixpoint;
@@ -84,30 +105,50 @@ Status Functions::Narrow(const Constraint& constraint) {
   return Status::Again;  // the result may be an input too
 }
 
-bool Functions::HasExactInputs(const Constraint& constraint) const {
-  for (int i = 0; i < constraint.kind->Inputs(); ++i) {
-    if (!mStore[constraint.arguments[static_cast<std::size_t>(i)]].IsOne()) return false;
+// Bounds say all of intervals. Sets have holes beside, and what stands twice is bounded as if it were two.
+Status Functions::NarrowNumbers(const Constraint& constraint) {
+  const Status status = mArithmetic.Narrow(constraint);
+  if (mStore.HasFailed() || status != Status::Again || !mArithmetic.NeedsSupports(constraint)) return status;
+  return mSupports.Narrow(constraint) ? Status::Fixpoint : Status::Again;
+}
+
+// Nothing is computed: the values that are left must be related.
+Status Functions::NarrowRelation(const Constraint& constraint) {
+  if (!HasExact(constraint.arguments)) {
+    mSupports.Narrow(constraint);
+    return Status::Fixpoint;
   }
-  return true;
+  TakeExact(constraint.arguments);
+  mStore.StartOperation(Operation::Supports);
+  if (!mSemantics.Holds(constraint, mExact)) mStore.Fail(constraint.arguments.front());
+  return Status::Subsumed;
+}
+
+bool Functions::HasExact(std::span<const int> variables) const {
+  return std::all_of(variables.begin(), variables.end(), [this](int variable) { return mStore[variable].IsOne(); });
+}
+
+void Functions::TakeExact(std::span<const int> variables) {
+  mExact.resize(variables.size());
+  mTexts.resize(std::max(mTexts.size(), variables.size()));
+  for (std::size_t i = 0; i < variables.size(); ++i) {
+    const Value& value = mStore[variables[i]];
+    if (IsText(value.Sort())) {
+      mTexts[i] = value.LowestText();
+      mExact[i] = {&mTexts[i], 0, value.Sort()};
+    } else {
+      mExact[i] = {nullptr, value.LowestNumber(), value.Sort()};
+    }
+  }
 }
 
 void Functions::ComputeExact(const Constraint& constraint) {
-  std::array<Exact, kMostArguments> inputs{};
-  std::array<ZORString, kMostArguments> texts;
-  for (int i = 0; i < constraint.kind->Inputs(); ++i) {
-    const auto at = static_cast<std::size_t>(i);
-    const Value& value = mStore[constraint.arguments[at]];
-    inputs[at].sort = value.Sort();
-    if (IsText(value.Sort())) {
-      texts[at] = value.LowestText();
-      inputs[at].text = &texts[at];
-    } else {
-      inputs[at].number = value.LowestNumber();
-    }
-  }
-  mStore.StartOperation(ForwardOf(constraint.kind->meaning));
+  TakeExact(constraint.arguments.first(constraint.Inputs()));
+  const bool isExtreme = constraint.kind->IsOfNumbers() && constraint.kind->meaning != Meaning::Sum &&
+                         constraint.kind->meaning != Meaning::Product;
+  mStore.StartOperation(isExtreme ? Operation::Bounds : ForwardOf(constraint.kind->meaning));
   Answer answer;
-  if (!mSemantics.Compute(*constraint.kind, inputs.data(), answer)) return mStore.Fail(constraint.Result());
+  if (!mSemantics.Compute(constraint, mExact, answer)) return mStore.Fail(constraint.Result());
   MeetResult(constraint, answer);
 }
 
@@ -123,34 +164,52 @@ void Functions::MeetResult(const Constraint& constraint, const Answer& answer) {
 
 // False when the module has no such operation on sets, or when it would lose results.
 bool Functions::ComputeSets(const Constraint& constraint) {
-  const Kind& kind = *constraint.kind;
-  if (kind.meaning == Meaning::Slice || kind.meaning == Meaning::TextForm) return false;
-  const int first = constraint.arguments[0], second = constraint.arguments[1];
-  if (kind.Inputs() == 2 && first == second) return false;  // the module would pair different texts too
-  if (!mStore[first].IsKnown() || (kind.Inputs() == 2 && !mStore[second].IsKnown())) return false;
-  const Value& x = AsSet(first, mX);
-  if (kind.meaning == Meaning::Length) {
+  const Meaning meaning = constraint.kind->meaning;
+  if (!TakesSets(meaning) || !HasKnownInputs(constraint)) return false;
+  const Value& first = AsSet(constraint.arguments[0], mX);
+  if (meaning == Meaning::Length) {
     Value& lengths = mStore.FreshLike(constraint.Result());
     mStore.StartOperation(Operation::Length);
-    x.Text().CalcLength(lengths.Integer());
+    first.Text().CalcLength(lengths.Integer());
     mStore.Meet(constraint.Result(), lengths);
     return true;
   }
-  const Value& y = kind.Inputs() == 2 ? AsSet(second, mY) : x;
-  mZ.Reset();
-  if (!CallSets(constraint, x, y, mZ)) return false;
+  if (!(IsFold(meaning) ? FoldSets(constraint, first) : CallSets(meaning, first, first, mZ))) return false;
   if (mZ.IsUndefined()) return false;  // more texts than an operation on sets lists
   MeetSet(constraint.Result(), mZ);
   return true;
 }
 
-bool Functions::CallSets(const Constraint& constraint, const Value& x, const Value& y, Value& result) {
+// Whether all are known and, since the module would pair different texts of one input too, none stands twice.
+bool Functions::HasKnownInputs(const Constraint& constraint) {
+  const auto inputs = constraint.arguments.first(constraint.Inputs());
+  if (!std::all_of(inputs.begin(), inputs.end(), [this](int input) { return mStore[input].IsKnown(); })) return false;
+  mInputs.assign(inputs.begin(), inputs.end());
+  std::sort(mInputs.begin(), mInputs.end());
+  return std::adjacent_find(mInputs.begin(), mInputs.end()) == mInputs.end();
+}
+
+// The sets of all inputs, one after another.
+bool Functions::FoldSets(const Constraint& constraint, const Value& first) {
   const Meaning meaning = constraint.kind->meaning;
   if (meaning == Meaning::Concatenation && MayOverflow(constraint)) return false;
+  if (constraint.Inputs() == 1) mZ.Any().Assign(first.Any());
+  const Value* folded = &first;
+  for (const int input : constraint.arguments.first(constraint.Inputs()).subspan(1)) {
+    if (!CallSets(meaning, *folded, AsSet(input, mY), mZ)) return false;
+    if (mZ.IsUndefined() || input == constraint.arguments[constraint.Inputs() - 1]) return true;
+    std::swap(mX, mZ);
+    folded = &mX;
+  }
+  return true;
+}
+
+bool Functions::CallSets(Meaning meaning, const Value& x, const Value& y, Value& result) {
   // The module takes one space for the lower bound of a set that lists "" alone, and would put it into the result.
   const bool leastBound = x.LowestText().GetLengthInChar() == 0 && y.LowestText().GetLengthInChar() == 0;
   if (meaning == Meaning::Maximum && leastBound) return false;
   mStore.StartOperation(ForwardOf(meaning));
+  result.Reset();
   ZORVaDoString& z = result.Text();
   switch (meaning) {
     case Meaning::Concatenation:
@@ -177,8 +236,9 @@ bool Functions::CallSets(const Constraint& constraint, const Value& x, const Val
 
 // The module lists concatenations of any length in sets; here those above the limit are the greatest text.
 bool Functions::MayOverflow(const Constraint& constraint) {
-  const std::size_t longest = LongestOf(mStore.List(constraint.arguments[0]));
-  return longest + LongestOf(mStore.List(constraint.arguments[1])) > kTextLimit;
+  std::size_t longest = 0;
+  for (const int input : constraint.arguments.first(constraint.Inputs())) longest += LongestOf(mStore.List(input));
+  return longest > kTextLimit;
 }
 
 const Value& Functions::AsSet(int variable, Value& set) {
@@ -198,12 +258,17 @@ void Functions::MeetSet(int variable, const Value& set) {
 // Even the length of an unknown text lies within the limit.
 void Functions::BoundLength(int number) {
   mStore.StartOperation(Operation::Length);
-  Bound(number, 0, kTextLimit);
+  mStore.Bound(number, 0, kTextLimit);
+}
+
+void Functions::BoundPosition(int number) {
+  mStore.StartOperation(Operation::Supports);
+  mStore.Bound(number, -1, kLastPosition);
 }
 
 // Narrows positions and slice by each other, whatever the text is. True when the slice must be empty.
 bool Functions::BoundSlice(const Constraint& constraint) {
-  const auto [text, from, to, slice] = constraint.arguments;
+  const int from = constraint.arguments[1], to = constraint.arguments[2], slice = constraint.Result();
   const std::int64_t first = std::max<std::int64_t>(LowestOr(mStore[from], 0), 0);
   const std::int64_t last = HighestOr(mStore[to], kLastPosition);
   mStore.StartOperation(Operation::Slice);
@@ -220,9 +285,9 @@ bool Functions::BoundSlice(const Constraint& constraint) {
 // A slice that is not empty begins inside the longest text, and ends so many characters later.
 void Functions::BoundPositions(int from, int to, std::int64_t shortest) {
   if (shortest == 0) return;
-  Bound(from, 0, std::min(HighestOr(mStore[to], kLastPosition), kLastPosition) - shortest + 1);
+  mStore.Bound(from, 0, std::min(HighestOr(mStore[to], kLastPosition), kLastPosition) - shortest + 1);
   if (mStore.HasFailed()) return;
-  Bound(to, LowestOr(mStore[from], 0) + shortest - 1, std::numeric_limits<ZORLong>::max());
+  mStore.Bound(to, LowestOr(mStore[from], 0) + shortest - 1, std::numeric_limits<ZORLong>::max());
 }
 
 void Functions::DropLongTexts(int variable, std::int64_t longest) {
@@ -236,24 +301,6 @@ void Functions::DropLongTexts(int variable, std::int64_t longest) {
   Value& outcome = mStore.FreshLike(variable);
   outcome.SetTexts(kept);
   mStore.Meet(variable, outcome);
-}
-
-// Keeps the numbers from lowest to highest. An unknown single number stays unknown unless one number is left.
-void Functions::Bound(int number, std::int64_t lowest, std::int64_t highest) {
-  const Value& held = mStore[number];
-  if (held.IsKnown() && held.LowestNumber() >= lowest && held.HighestNumber() <= highest) return;
-  if (lowest > highest) return mStore.Fail(number);
-  Value& outcome = mStore.FreshLike(number);
-  if (held.Sort() == Sort::IntegerSet && held.IsKnown()) {
-    std::vector<ZORLong> possible = held.Numbers();
-    std::erase_if(possible, [&](ZORLong n) { return n < lowest || n > highest; });
-    outcome.SetNumbers(possible);
-  } else if (held.Sort() == Sort::Integer && held.IsKnown()) {
-    return mStore.Fail(number);
-  } else {
-    outcome.SetNumbers({static_cast<ZORLong>(lowest), static_cast<ZORLong>(highest)});
-  }
-  mStore.Meet(number, outcome);
 }
 
 }  // namespace zornet

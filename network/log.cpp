@@ -10,9 +10,8 @@ void Log::Narrowed(const Narrowing& narrowing) {
     entry.causes.push_back(mLast[static_cast<std::size_t>(narrowing.variable.index)]);
   }
   if (narrowing.constraint != kNone) {
-    const Constraint& constraint = mModel.Constraints()[static_cast<std::size_t>(narrowing.constraint)];
-    for (int i = 0; i < constraint.kind->arity; ++i) {
-      const int last = mLast[static_cast<std::size_t>(constraint.arguments[static_cast<std::size_t>(i)])];
+    for (const int variable : mModel.Constraints()[static_cast<std::size_t>(narrowing.constraint)].arguments) {
+      const int last = mLast[static_cast<std::size_t>(variable)];
       if (last != kNone) entry.causes.push_back(last);
     }
   }
@@ -33,9 +32,8 @@ Explanation Log::Explain(int variable) const {
     for (const int cause : entry.causes) needed[static_cast<std::size_t>(cause)] = 1;
     explanation.narrowings.push_back(entry.narrowing);
     if (entry.narrowing.constraint == kNone) continue;
-    const Constraint& constraint = mModel.Constraints()[static_cast<std::size_t>(entry.narrowing.constraint)];
-    for (int a = 0; a < constraint.kind->arity; ++a)
-      used[static_cast<std::size_t>(constraint.arguments[static_cast<std::size_t>(a)])] = 1;
+    for (const int argument : mModel.Constraints()[static_cast<std::size_t>(entry.narrowing.constraint)].arguments)
+      used[static_cast<std::size_t>(argument)] = 1;
   }
   std::reverse(explanation.narrowings.begin(), explanation.narrowings.end());
   for (std::size_t v = 0; v < mModel.Variables().size(); ++v) {

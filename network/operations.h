@@ -25,6 +25,10 @@ enum class Operation {
   Maximum,
   Successor,
   TextForm,
+  Sum,
+  Product,
+  Bounds,
+  Matching,
   Supports,
   Choice,
 };
@@ -49,6 +53,10 @@ constexpr std::string_view NameOf(Operation operation) {
                                                                 "CalcMaxValue",
                                                                 "CalcNextValue",
                                                                 "CalcStringRepresentation",
+                                                                "sum",
+                                                                "product",
+                                                                "bounds",
+                                                                "matching",
                                                                 "supports",
                                                                 "choice"};
   return kNames[static_cast<std::size_t>(operation)];

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "network/offsets.h"
 #include "network/order_cycles.h"
 
 namespace zornet {
@@ -13,8 +14,15 @@ constexpr std::uint64_t kProgressSteps = 256;
 }  // namespace
 
 Propagation::Propagation(Store& store, const Limits& limits)
-    : mStore(store), mModel(store.Model()), mLimits(limits), mRelations(store), mFunctions(store, limits.budget) {
+    : mStore(store),
+      mModel(store.Model()),
+      mLimits(limits),
+      mRelations(store),
+      mFunctions(store, limits.budget),
+      mAllDifferent(store),
+      mTables(store) {
   Connect();
+  mShavings.resize(mModel.Variables().size(), 0);
   mStates.resize(mModel.Constraints().size(), Idle);
   mQueue.resize(mModel.Constraints().size());
   for (std::size_t i = 0; i < mModel.Constraints().size(); ++i) Wake(static_cast<int>(i));
@@ -24,10 +32,8 @@ void Propagation::Connect() {
   mFirstReader.resize(mModel.Variables().size() + 1, 0);
   const auto each = [this](auto visit) {
     for (std::size_t c = 0; c < mModel.Constraints().size(); ++c) {
-      const Constraint& constraint = mModel.Constraints()[c];
-      for (int i = 0; i < constraint.kind->arity; ++i) {
-        visit(static_cast<int>(c), static_cast<std::size_t>(constraint.arguments[static_cast<std::size_t>(i)]));
-      }
+      for (const int variable : mModel.Constraints()[c].arguments)
+        visit(static_cast<int>(c), static_cast<std::size_t>(variable));
     }
   };
   each([this](int, std::size_t variable) { ++mFirstReader[variable + 1]; });
@@ -38,7 +44,9 @@ void Propagation::Connect() {
 }
 
 Outcome Propagation::Run() {
-  if (mSteps == 0) FailOrderCycle();
+  for (const int variable : mShaved) mShavings[static_cast<std::size_t>(variable)] = 0;
+  mShaved.clear();
+  if (mSteps == 0) FailCycle();
   if (mStore.HasFailed()) return Outcome::Contradiction;
   WakeReaders(kNone);
   while (mWaiting != 0) {
@@ -52,13 +60,14 @@ Outcome Propagation::Run() {
 }
 
 // Once, before the first pass.
-void Propagation::FailOrderCycle() {
-  const int constraint = FindOrderCycle(mModel);
+void Propagation::FailCycle() {
+  int constraint = FindOrderCycle(mModel);
+  if (constraint == kNone) constraint = FindOffsetConflict(mModel);
   if (constraint == kNone) return;
-  const Constraint& order = mModel.Constraints()[static_cast<std::size_t>(constraint)];
+  const Constraint& found = mModel.Constraints()[static_cast<std::size_t>(constraint)];
   mStore.StartConstraint(constraint);
-  mStore.StartOperation(Operation::LessOrEqual);
-  mStore.Fail(order.arguments[order.kind->mirrored ? 1 : 0]);
+  mStore.StartOperation(found.kind->IsRelation() ? Operation::LessOrEqual : Operation::Sum);
+  mStore.Fail(found.arguments[found.kind->mirrored ? 1 : 0]);
 }
 
 bool Propagation::CountStep() {
@@ -69,9 +78,8 @@ bool Propagation::CountStep() {
 }
 
 Status Propagation::Narrow(int constraint) {
-  const Constraint& what = mModel.Constraints()[static_cast<std::size_t>(constraint)];
   mStore.StartConstraint(constraint);
-  const Status status = what.kind->IsRelation() ? mRelations.Narrow(what) : mFunctions.Narrow(what);
+  const Status status = Narrow(mModel.Constraints()[static_cast<std::size_t>(constraint)]);
   if (status == Status::Subsumed) {
     mStates[static_cast<std::size_t>(constraint)] = Finished;
     mFinished.push_back(constraint);
@@ -79,14 +87,31 @@ Status Propagation::Narrow(int constraint) {
   return status;
 }
 
+Status Propagation::Narrow(const Constraint& constraint) {
+  if (constraint.kind->IsComparison()) return mRelations.Narrow(constraint);
+  if (constraint.kind->meaning == Meaning::AllDifferent) return mAllDifferent.Narrow(constraint);
+  if (constraint.kind->meaning == Meaning::Row) return mTables.Narrow(constraint);
+  return mFunctions.Narrow(constraint);
+}
+
 // A constraint that finds in one pass all that it can find is not woken by its own changes.
 void Propagation::WakeReaders(int except) {
   for (const int variable : mStore.Touched()) {
+    if (IsShaved(variable)) continue;
     for (const int reader : ReadersOf(variable)) {
       if (reader != except) Wake(reader);
     }
   }
   mStore.Touched().clear();
+}
+
+// Whether the readers of a changed variable are left alone. Those of one that has become a single number are not.
+bool Propagation::IsShaved(int variable) {
+  const Value& value = mStore[variable];
+  if (value.Sort() != Sort::Interval || value.IsOne()) return false;
+  unsigned& shavings = mShavings[static_cast<std::size_t>(variable)];
+  if (shavings++ == 0) mShaved.push_back(variable);
+  return shavings > kMostShavings;
 }
 
 std::span<const int> Propagation::ReadersOf(int variable) const {

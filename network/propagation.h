@@ -1,5 +1,7 @@
 // Narrows a network until nothing changes any more: constraints wait in a queue and are woken by the variables that
 // they read. It ends, since every change leaves less in a variable, and it loses no solution (see Store and Semantics).
+// Constraints in a circle, such as x + y = z and z + y = x, may take one number a pass from an interval, which may have
+// 2^32: an interval that has changed kMostShavings times in one run is shaved no further.
 #pragma once
 
 #include <cstdint>
@@ -7,9 +9,11 @@
 #include <span>
 #include <vector>
 
+#include "network/all_different.h"
 #include "network/functions.h"
 #include "network/relations.h"
 #include "network/store.h"
+#include "network/tables.h"
 
 namespace zornet {
 
@@ -39,8 +43,10 @@ class Propagation {
   void Connect();
   void Wake(int constraint);
   void WakeReaders(int except);
-  void FailOrderCycle();
+  bool IsShaved(int variable);
+  void FailCycle();
   Status Narrow(int constraint);
+  Status Narrow(const Constraint& constraint);
   int Next();
 
   Store& mStore;
@@ -48,11 +54,17 @@ class Propagation {
   Limits mLimits;
   Relations mRelations;
   Functions mFunctions;
+  AllDifferent mAllDifferent;
+  Tables mTables;
   Teller mTeller;
 
   // Constraints that read a variable: mReaders[mFirstReader[v]] and those up to mFirstReader[v + 1].
   std::vector<int> mReaders;
   std::vector<std::size_t> mFirstReader;
+
+  static constexpr unsigned kMostShavings = 4096;
+  std::vector<unsigned> mShavings;  // by variable: changes of an interval in this run
+  std::vector<int> mShaved;         // the variables that have some
 
   enum State : char { Idle, Waiting, Finished };
   std::vector<State> mStates;  // of the constraints

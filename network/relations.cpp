@@ -23,6 +23,7 @@ Meaning Opposite(Meaning meaning) {
 Operation RelationOf(Meaning meaning) {
   switch (meaning) {
     case Meaning::Equal:
+    case Meaning::Unequal:
       return Operation::IsEqual;
     case Meaning::LessOrEqual:
       return Operation::IsLessOrEqual;
@@ -37,6 +38,7 @@ bool IsOrder(Meaning meaning) { return meaning == Meaning::LessOrEqual || meanin
 
 Relations::Relations(Store& store)
     : mStore(store),
+      mNumbers(store),
       mSingle(store.Types(), Sort::Text),
       mOther(store.Types(), Sort::Text),
       mSet(store.Types(), Sort::TextSet),
@@ -55,6 +57,7 @@ Status Relations::Narrow(const Constraint& constraint) {
 
 Status Relations::Post(Meaning meaning, int x, int y) {
   if (x == y) return Reflexive(meaning, x);
+  if (!IsText(mStore[x].Sort())) return mNumbers.Post(meaning, x, y);
   switch (meaning) {
     case Meaning::Equal:
       return Equal(x, y);
@@ -195,15 +198,25 @@ Status Relations::Decide(Meaning meaning, int x, int y, int truth) {
   if (x == y) {
     mStore.StartOperation(RelationOf(meaning));
     mReified.SetNumber(Semantics::Relates(meaning, ZORString(), ZORString()) ? 1 : 0);
-  } else if (!mStore[x].IsKnown() || !mStore[y].IsKnown() || !Ask(meaning, x, y, mReified)) {
+  } else if (!Ask(meaning, x, y, mReified)) {
     return Status::Fixpoint;
   }
   mStore.Meet(truth, mReified);
-  return Status::Subsumed;
+  return mStore.HasCandidates(x) || mStore.HasCandidates(y) ? Status::Fixpoint : Status::Subsumed;
 }
 
-// False while the relation is open. Where the module would judge least texts by their state, their texts decide.
+// False while the relation is open.
 bool Relations::Ask(Meaning meaning, int x, int y, Value& answer) {
+  if (!IsText(mStore[x].Sort())) return mNumbers.Ask(meaning, x, y, answer);
+  if (!mStore[x].IsKnown() || !mStore[y].IsKnown()) return false;
+  if (meaning != Meaning::Unequal) return AskTexts(meaning, x, y, answer);
+  if (!AskTexts(Meaning::Equal, x, y, answer)) return false;
+  answer.SetNumber(1 - answer.LowestNumber());
+  return true;
+}
+
+// Where the module would judge least texts by their state, their texts decide.
+bool Relations::AskTexts(Meaning meaning, int x, int y, Value& answer) {
   const Value& left = OperandFor(x, mSingle);
   const Value& right = OperandFor(y, mOther);
   mStore.StartOperation(RelationOf(meaning));

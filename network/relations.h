@@ -1,17 +1,12 @@
-// Equality and order between two strings, posted or reified.
+// Equality and order, posted or reified: what is common to texts and numbers, and how texts are narrowed.
 #pragma once
 
+#include "network/number_relations.h"
 #include "network/semantics.h"
+#include "network/status.h"
 #include "network/store.h"
 
 namespace zornet {
-
-// What a pass over a constraint leaves to do.
-enum class Status {
-  Subsumed,  // nothing: it holds whatever values are left
-  Fixpoint,  // nothing until another constraint changes one of its variables
-  Again,     // another pass after every change of its variables, its own changes included
-};
 
 class Relations {
  public:
@@ -36,12 +31,14 @@ class Relations {
   void RaiseTo(const ZORString& bound, const ZORString& lowest, Value& outcome);
   void RemoveFrom(Value& outcome, const ZORString& text);
   bool Ask(Meaning meaning, int x, int y, Value& answer);
+  bool AskTexts(Meaning meaning, int x, int y, Value& answer);
   void AskEqual(const Value& left, const Value& right, Value& answer);
   void AskOrder(Meaning meaning, const Value& left, const Value& right, Value& answer);
   const Value& OperandFor(int variable, Value& plain);
   Value& Bound(const ZORString& text);
 
   Store& mStore;
+  NumberRelations mNumbers;
   Value mSingle, mOther;  // single texts that are Exact even when they are the greatest
   Value mSet;
   Value mReified;

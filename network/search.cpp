@@ -9,7 +9,8 @@ Search::Search(Store& store, Propagation& propagation)
     : mStore(store),
       mPropagation(propagation),
       mSemantics(store.Types()),
-      mStamps(store.Model().Variables().size(), 0) {
+      mStamps(store.Model().Variables().size(), 0),
+      mFailures(store.Model().Constraints().size(), 0) {
   std::vector<char> taken(mStamps.size(), 0);
   const auto take = [&](int variable) {
     if (std::exchange(taken[static_cast<std::size_t>(variable)], 1) == 0) mOrder.push_back(variable);
@@ -17,7 +18,7 @@ Search::Search(Store& store, Propagation& propagation)
   for (const int variable : store.Model().Wanted()) take(variable);
   mWanted = mOrder.size();
   for (const Constraint& constraint : store.Model().Constraints()) {
-    for (int i = 0; i < constraint.kind->arity; ++i) take(constraint.arguments[static_cast<std::size_t>(i)]);
+    for (const int variable : constraint.arguments) take(variable);
   }
   for (std::size_t place = 0; place < mOrder.size(); ++place) {
     if (!mStore.List(mOrder[place]).known) mUnlisted.push_back(place);
@@ -45,6 +46,7 @@ Outcome Search::Look(std::uint64_t limit, const Solution& solution) {
     Choose(mFrames.back());
     const Outcome outcome = mPropagation.Run();
     if (outcome == Outcome::Settled && Visit(solution)) continue;
+    if (outcome == Outcome::Contradiction) CountFailure();
     Retract();
     if (outcome == Outcome::StepLimit) return outcome;
   }
@@ -68,20 +70,32 @@ bool Search::Visit(const Solution& solution) {
   return true;
 }
 
-// The place of the variable with the fewest values, a wanted one if there is one. Where nothing is stuck, one is
-// listed.
+// The place of the variable with the fewest values for the contradictions of its constraints, a wanted one if there is
+// one. Where nothing is stuck, one is listed.
 std::size_t Search::Pick(std::size_t first) {
-  std::size_t chosen = mOrder.size(), fewest = 0;
+  std::size_t chosen = mOrder.size();
+  const double enough = 2.0 / static_cast<double>(1 + mFailed);  // hardly any is below
+  double least = 0;
   for (std::size_t place = first; place < mOrder.size(); ++place) {
     const bool found = chosen != mOrder.size();
-    if (found && (fewest == 2 || place == mWanted)) break;
+    if (found && (least <= enough || place == mWanted)) break;
     if (!Needs(place)) continue;
     const Listing& listing = mStore.List(mOrder[place]);
-    if (!listing.known || (found && listing.count >= fewest)) continue;
+    if (!listing.known) continue;
+    const double size = static_cast<double>(listing.count) / static_cast<double>(WeightOf(mOrder[place]));
+    if (found && size >= least) continue;
     chosen = place;
-    fewest = listing.count;
+    least = size;
   }
   return chosen;
+}
+
+std::uint64_t Search::WeightOf(int variable) const {
+  std::uint64_t weight = 1;
+  for (const int constraint : mPropagation.ReadersOf(variable)) {
+    if (!mPropagation.IsFinished(constraint)) weight += mFailures[static_cast<std::size_t>(constraint)];
+  }
+  return weight;
 }
 
 void Search::Push(std::size_t first, std::size_t place) {
@@ -115,6 +129,14 @@ void Search::Choose(Frame& frame) {
   mStore.StartConstraint(kNone);
   mStore.StartOperation(Operation::Choice);
   mStore.Meet(frame.variable, value);
+}
+
+// A choice itself fails nothing: its value is one of the domain.
+void Search::CountFailure() {
+  const int constraint = mStore.FailedConstraint();
+  if (constraint == kNone) return;
+  ++mFailures[static_cast<std::size_t>(constraint)];
+  ++mFailed;
 }
 
 void Search::Mark() {
@@ -153,9 +175,7 @@ bool Search::CanBecomeKnown(int variable, std::uint64_t before) {
   for (std::size_t i = 0; i < reached.size(); ++i) {
     for (const int number : mPropagation.ReadersOf(reached[i])) {
       if (mPropagation.IsFinished(number)) continue;
-      const Constraint& constraint = mStore.Model().Constraints()[static_cast<std::size_t>(number)];
-      for (int a = 0; a < constraint.kind->arity; ++a) {
-        const int other = constraint.arguments[static_cast<std::size_t>(a)];
+      for (const int other : mStore.Model().Constraints()[static_cast<std::size_t>(number)].arguments) {
         if (mStore[other].IsOne() || stamp(other) == mStamp) continue;
         if (mStore.List(other).known || stamp(other) > before) return true;
         stamp(other) = mStamp;
@@ -192,18 +212,17 @@ void Search::Leaf(const Solution& solution) {
 
 // Each constraint by itself. One that an argument without a value is left to is finished: it holds for any.
 bool Search::Confirm() {
-  return std::all_of(mStore.Model().Constraints().begin(), mStore.Model().Constraints().end(),
-                     [&](const Constraint& c) {
-                       std::array<Exact, kMostArguments> exact{};
-                       for (int i = 0; i < c.kind->arity; ++i) {
-                         const auto at = static_cast<std::size_t>(i);
-                         if (!mStore[c.arguments[at]].IsOne()) return true;
-                         const Listing& listing = mStore.List(c.arguments[at]);
-                         exact[at] = {IsText(listing.sort) ? &listing.texts.front() : nullptr,
-                                      IsText(listing.sort) ? 0 : listing.NumberAt(0), listing.sort};
-                       }
-                       return mSemantics.Holds(*c.kind, exact.data());
-                     });
+  const auto& constraints = mStore.Model().Constraints();
+  return std::all_of(constraints.begin(), constraints.end(), [this](const Constraint& constraint) {
+    mExact.clear();
+    for (const int variable : constraint.arguments) {
+      if (!mStore[variable].IsOne()) return true;
+      const Listing& listing = mStore.List(variable);
+      const bool text = IsText(listing.sort);
+      mExact.push_back({text ? &listing.texts.front() : nullptr, text ? 0 : listing.NumberAt(0), listing.sort});
+    }
+    return mSemantics.Holds(constraint, mExact);
+  });
 }
 
 // The wanted values as they are printed.

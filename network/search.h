@@ -48,6 +48,8 @@ class Search {
   Outcome Look(std::uint64_t limit, const Solution& solution);
   bool Visit(const Solution& solution);
   std::size_t Pick(std::size_t first);
+  std::uint64_t WeightOf(int variable) const;
+  void CountFailure();
   void Push(std::size_t first, std::size_t place);
   void Pop();
   void Choose(Frame& frame);
@@ -72,7 +74,10 @@ class Search {
   std::vector<std::size_t> mUnlisted;  // places in mOrder whose values could not be listed at first
   std::vector<std::uint64_t> mStamps;  // when CanBecomeKnown reached each variable last
   std::uint64_t mStamp = 0;
+  std::vector<std::uint64_t> mFailures;  // contradictions of each constraint so far
+  std::uint64_t mFailed = 0;             // of all
   std::vector<Frame> mFrames;
+  std::vector<Exact> mExact;     // arguments of the constraint that is confirmed
   std::set<std::string> mShown;  // solutions below the first loose frame
   int mWitnessOpen = kNone;      // a variable that stayed open while a witness was looked for
   std::uint64_t mFound = 0;

@@ -9,9 +9,14 @@
 //                  below 0, behind the text, or behind its own end
 //   successor      of the greatest text: itself
 //   text form      of more than 255 characters: none
+//   position       of the empty text: 0
+//   replacement    of the empty text: it stands before the first character and, where all are replaced, nowhere; of
+//                  more than 255 characters: the greatest text
+//   sum, product   outside the 32-bit integers: none
 #pragma once
 
 #include <optional>
+#include <span>
 #include <vector>
 
 #include "network/ZORModel.h"
@@ -38,30 +43,64 @@ class Semantics {
  public:
   explicit Semantics(const Types& types);
 
-  // The value of a function; false when it has none.
-  bool Compute(const Kind& kind, const Exact* inputs, Answer& result);
+  // The value of a function, or the truth of what is reified; false when there is none.
+  bool Compute(const Constraint& constraint, std::span<const Exact> inputs, Answer& result);
 
-  // All values of one input that give the result with the other inputs; nothing when they cannot be listed. Ignores
-  // values[position].
-  std::optional<std::vector<Answer>> Invert(const Kind& kind, int position, const Exact* values);
+  // All values of one input that give the result with the other inputs; nothing when they are too many to be listed.
+  // Ignores values[position].
+  std::optional<std::vector<Answer>> Invert(const Constraint& constraint, std::size_t position,
+                                            std::span<const Exact> values);
 
-  // Whether Invert ever lists something at this position.
-  static bool CanInvert(const Kind& kind, int position);
+  // Whether Invert ever lists something for an argument.
+  static bool CanInvert(const Kind& kind, std::size_t position);
 
-  static bool Relates(Meaning meaning, const ZORString& x, const ZORString& y);
-  bool Holds(const Kind& kind, const Exact* values);
+  template <class T>
+  static bool Relates(Meaning meaning, const T& x, const T& y);
+  bool Holds(const Constraint& constraint, std::span<const Exact> values);
 
  private:
+  using Answers = std::optional<std::vector<Answer>>;
+
+  bool IsTrue(const Constraint& constraint, std::span<const Exact> values);
+  static bool RelatesTexts(const Constraint& constraint, std::span<const Exact> values);
+  bool ComputeFunction(const Kind& kind, std::span<const Exact> inputs, Answer& result);
+  static bool ComputeNumber(const Kind& kind, std::span<const Exact> inputs, Answer& result);
+  Answers InvertTrue(const Constraint& constraint, std::size_t position, std::span<const Exact> values);
+  Answers InvertReplacement(const Constraint& constraint, std::size_t position, std::span<const Exact> values);
+  static Answers InvertNumber(const Kind& kind, std::size_t position, std::span<const Exact> values);
+  Answers Filter(const Constraint& constraint, std::size_t position, std::span<const Exact> values,
+                 std::vector<Answer>& proposals);
   bool ComputeTextForm(const Exact& value, Answer& result);
+  ZORString Fold(Meaning meaning, const ZORString& x, const ZORString& y);
+  ZORString FoldOthers(Meaning meaning, std::span<const Exact> inputs, std::size_t except);
   Value& FormOf(Sort sort);
-  bool Gives(const Kind& kind, int position, const Answer& input, const Exact* values);
-  void Propose(const Kind& kind, int position, const Exact* values, std::vector<Answer>& proposals);
+  bool Gives(const Constraint& constraint, std::size_t position, const Answer& input, std::span<const Exact> values);
+  static Answers InvertSlice(std::span<const Exact> values);
+  Answers Between(const ZORString& lowest, const ZORString& highest);
+  void Propose(const Kind& kind, std::size_t position, std::span<const Exact> values, std::vector<Answer>& proposals);
   void ProposeByTextForm(const Exact& value, const ZORString& form, std::vector<Answer>& proposals);
   void Take(std::vector<Answer>& proposals, const Value& target);
 
   Value mX, mY, mZ;           // single texts
   Value mLength;              // a single integer
   std::vector<Value> mForms;  // one of each sort, for text forms
+  std::vector<Exact> mGiven;  // what Gives looks at
 };
+
+template <class T>
+bool Semantics::Relates(Meaning meaning, const T& x, const T& y) {
+  switch (meaning) {
+    case Meaning::Equal:
+      return x == y;
+    case Meaning::Unequal:
+      return !(x == y);
+    case Meaning::LessOrEqual:
+      return x <= y;
+    case Meaning::Less:
+      return x < y;
+    default:
+      return false;
+  }
+}
 
 }  // namespace zornet

@@ -80,19 +80,29 @@ Store::Measure Store::MeasureOf(const Value& value) {
 void Store::Meet(int variable, const Value& outcome) {
   Value& held = mValues[static_cast<std::size_t>(variable)];
   if (held.IsNil() || outcome.IsUndefined()) return;
+  if (Declared(variable).constant && !outcome.IsNil() && held.Any().IsIntersected(outcome.Any()) == 0)
+    return Fail(variable);
+  if (HasCandidates(variable) && !outcome.IsNil() && outcome.Sort() != held.Sort())
+    return MeetNumbers(variable, CandidatesIn(variable, outcome));
+  if (HasCandidates(variable) && !IsCandidate(variable, outcome)) return Fail(variable);
   const Measure before = MeasureOf(held);
-  const std::string shown = mWatcher != nullptr ? held.Show() : "";
+  const std::string shown = mWatcher != nullptr ? Show(variable) : "";
   if (mMarks.empty()) {
     Narrow(variable, outcome);
   } else {
-    Saved saved{variable, held};
+    Saved saved{variable, held, TakeCandidates(variable)};  // a value is less than candidates, so they always go
     Narrow(variable, outcome);
     if (MeasureOf(held) != before) mTrail.push_back(std::move(saved));
   }
   if (MeasureOf(held) == before) return;
+  mListed[static_cast<std::size_t>(variable)] = 0;
+  Changed(variable, shown);
+}
+
+void Store::Changed(int variable, const std::string& before) {
+  const Value& held = (*this)[variable];
   OperationCounts& counts = mCounts[static_cast<std::size_t>(mOperation)];
   ++counts.changes;
-  mListed[static_cast<std::size_t>(variable)] = 0;
   mTouched.push_back(variable);
   if (held.IsNil()) {
     ++counts.contradictions;
@@ -100,7 +110,7 @@ void Store::Meet(int variable, const Value& outcome) {
     mFailedConstraint = mConstraint;
   }
   if (mWatcher != nullptr)
-    mWatcher->Narrowed({mConstraint, NameOf(mOperation), {variable}, shown, held.Show(), held.IsNil()});
+    mWatcher->Narrowed({mConstraint, NameOf(mOperation), {variable}, before, Show(variable), held.IsNil()});
 }
 
 // Intersecting a single value with the least or the greatest one would replace it, so disjoint values are found first.
@@ -111,7 +121,123 @@ void Store::Narrow(int variable, const Value& outcome) {
   if (held.Sort() == Sort::Text && held.IsKnown() && held.LowestText() == GreatestText()) held.Text().CalcMaxValue();
 }
 
+// A single of which little enough is left gets candidates.
+void Store::Bound(int variable, std::int64_t lowest, std::int64_t highest) {
+  const Value& held = (*this)[variable];
+  if (held.IsNil()) return;
+  const std::int64_t from = LowestNumber(variable), to = HighestNumber(variable);
+  lowest = std::max(lowest, from);
+  highest = std::min(highest, to);
+  if (lowest > highest) return Fail(variable);
+  if (lowest == from && highest == to) return;
+  Value& range = Fresh(held.Sort() == Sort::Boolean ? Sort::Boolean : Sort::Interval);
+  range.SetRange(static_cast<ZORLong>(lowest), static_cast<ZORLong>(highest));
+  const bool unlisted = held.Sort() == Sort::Integer && !HasCandidates(variable);
+  if (!unlisted || lowest == highest) return Meet(variable, range);
+  if (highest - lowest < static_cast<std::int64_t>(zor::kSetLimit)) MeetNumbers(variable, range.Numbers());
+}
+
+std::int64_t Store::LowestNumber(int variable) const {
+  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)].numbers.front();
+  return (*this)[variable].LowestNumber();
+}
+
+std::int64_t Store::HighestNumber(int variable) const {
+  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)].numbers.back();
+  return (*this)[variable].HighestNumber();
+}
+
+bool Store::HasCandidates(int variable) const {
+  const auto at = static_cast<std::size_t>(variable);
+  const Sort sort = mValues[at].Sort();
+  return (sort == Sort::Text || sort == Sort::Integer) && mListed[at] != 0 && mListings[at].known &&
+         mValues[at].IsUndefined();
+}
+
+bool Store::IsCandidate(int variable, const Value& outcome) const {
+  if (outcome.IsNil()) return true;
+  const Listing& candidates = mListings[static_cast<std::size_t>(variable)];
+  if (outcome.Sort() == Sort::Text)
+    return std::binary_search(candidates.texts.begin(), candidates.texts.end(), outcome.LowestText());
+  return std::binary_search(candidates.numbers.begin(), candidates.numbers.end(), outcome.LowestNumber());
+}
+
+// Of a single integer, by an outcome of another sort of integers.
+std::vector<ZORLong> Store::CandidatesIn(int variable, const Value& outcome) const {
+  std::vector<ZORLong> numbers = mListings[static_cast<std::size_t>(variable)].numbers;
+  std::erase_if(numbers, [&](ZORLong n) { return outcome.Integer().FindAtLeast(n) != n; });
+  return numbers;
+}
+
+void Store::MeetTexts(int variable, std::vector<ZORString> texts) {
+  if (texts.empty()) return Fail(variable);
+  if (texts.size() > 1 && (*this)[variable].Sort() == Sort::Text)
+    return MeetCandidates(variable, {true, std::move(texts), {}, 0, 0, Sort::Text});
+  Value& outcome = FreshLike(variable);
+  texts.size() == 1 ? outcome.SetText(texts.front()) : outcome.SetTexts(texts);
+  Meet(variable, outcome);
+}
+
+void Store::MeetNumbers(int variable, std::vector<ZORLong> numbers) {
+  if (numbers.empty()) return Fail(variable);
+  if (numbers.size() > 1 && (*this)[variable].Sort() == Sort::Integer)
+    return MeetCandidates(variable, {true, {}, std::move(numbers), 0, 0, Sort::IntegerSet});
+  Value& outcome = FreshLike(variable);
+  outcome.SetNumbers(numbers);
+  Meet(variable, outcome);
+}
+
+// A value that is known must be one of them. New candidates are among the old ones.
+void Store::MeetCandidates(int variable, Listing candidates) {
+  const Listing& held = List(variable);
+  if (held.known) {
+    const auto lacks = [](const auto& values) {
+      return [&](const auto& value) { return !std::binary_search(values.begin(), values.end(), value); };
+    };
+    std::erase_if(candidates.texts, lacks(held.texts));
+    if (candidates.sort == Sort::IntegerSet && held.sort == Sort::IntegerSet)
+      std::erase_if(candidates.numbers, lacks(held.numbers));
+    if (held.sort == Sort::Integer) std::erase_if(candidates.numbers, [&](ZORLong n) { return n != held.first; });
+  }
+  candidates.count = candidates.texts.size() + candidates.numbers.size();
+  if (held.known && candidates.count == held.count) return;
+  if (candidates.count <= 1)
+    return candidates.sort == Sort::Text ? MeetTexts(variable, std::move(candidates.texts))
+                                         : MeetNumbers(variable, std::move(candidates.numbers));
+  if (!held.known && candidates.count > zor::kSetLimit) return;
+  const std::string shown = mWatcher != nullptr ? Show(variable) : "";
+  if (!mMarks.empty()) {
+    Saved saved{variable, (*this)[variable], TakeCandidates(variable)};
+    mTrail.push_back(std::move(saved));
+  }
+  mListings[static_cast<std::size_t>(variable)] = std::move(candidates);
+  Changed(variable, shown);
+}
+
+// Null when there are none. Until they come back the listing is not to be read.
+std::unique_ptr<Listing> Store::TakeCandidates(int variable) {
+  Listing& listing = mListings[static_cast<std::size_t>(variable)];
+  const bool single = listing.sort == Sort::Text || listing.sort == Sort::IntegerSet;
+  if (!single || !HasCandidates(variable)) return nullptr;
+  return std::make_unique<Listing>(std::move(listing));
+}
+
+std::string Store::Show(int variable) const {
+  if (!HasCandidates(variable)) return (*this)[variable].Show();
+  const Listing& candidates = mListings[static_cast<std::size_t>(variable)];
+  Value all(mTypes, candidates.sort == Sort::Text ? Sort::TextSet : Sort::IntegerSet);
+  candidates.sort == Sort::Text ? all.SetTexts(candidates.texts) : all.SetNumbers(candidates.numbers);
+  return "one of " + all.Show();
+}
+
+// A contradiction shows in a variable rather than in a constant.
 void Store::Fail(int variable) {
+  if (Declared(variable).constant && mConstraint != kNone) {
+    const auto arguments = mModel.Constraints()[static_cast<std::size_t>(mConstraint)].arguments;
+    const auto found =
+        std::find_if(arguments.rbegin(), arguments.rend(), [this](int other) { return !Declared(other).constant; });
+    if (found != arguments.rend()) variable = *found;
+  }
   Value& nil = FreshLike(variable);
   nil.Any().SetNilValue();
   Meet(variable, nil);
@@ -122,8 +248,10 @@ void Store::Undo() {
   mMarks.pop_back();
   while (mTrail.size() > mark) {
     Saved& saved = mTrail.back();
-    mListed[static_cast<std::size_t>(saved.variable)] = 0;
-    mValues[static_cast<std::size_t>(saved.variable)] = std::move(saved.value);
+    const auto at = static_cast<std::size_t>(saved.variable);
+    mListed[at] = saved.candidates != nullptr ? 1 : 0;
+    if (saved.candidates != nullptr) mListings[at] = std::move(*saved.candidates);
+    mValues[at] = std::move(saved.value);
     mTrail.pop_back();
   }
   mTouched.clear();

@@ -1,9 +1,12 @@
 // The values of a network while it is narrowed. An operation of the module never touches a variable: it works on a
 // value of its own, which Meet intersects with the variable. So no answer of the module can add a value.
+//
+// A single text or integer that could be several stays Undefined, but may have candidates, of which its value is one.
 #pragma once
 
 #include <array>
 #include <cstdint>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -47,7 +50,9 @@ class Store {
   const zornet::Model& Model() const { return mModel; }
   const Value& operator[](int variable) const { return mValues[static_cast<std::size_t>(variable)]; }
   const Variable& Declared(int variable) const { return mModel.Variables()[static_cast<std::size_t>(variable)]; }
-  const Listing& List(int variable);  // good until the variable changes
+  std::int64_t LowestNumber(int variable) const;   // of integers and truth values; the least of all where nothing
+  std::int64_t HighestNumber(int variable) const;  // is known, and the greatest
+  const Listing& List(int variable);  // good until the variable changes; of an Undefined single its candidates
 
   // A value of the variable's type that is Undefined, good until the next call for the same type.
   Value& Fresh(Sort sort);
@@ -58,7 +63,12 @@ class Store {
   void StartConstraint(int constraint) { mConstraint = constraint; }
   void StartOperation(Operation operation);
   void Meet(int variable, const Value& outcome);
+  void MeetTexts(int variable, std::vector<ZORString> texts);           // ascending; none is a contradiction
+  void MeetNumbers(int variable, std::vector<ZORLong> numbers);         // so are these; of an interval both ends
+  void Bound(int variable, std::int64_t lowest, std::int64_t highest);  // keeps the numbers from one to the other
   void Fail(int variable);
+
+  bool HasCandidates(int variable) const;  // an Undefined single that is one of those that List answers
 
   bool HasFailed() const { return mFailed != kNone; }
   int Failed() const { return mFailed; }  // the variable that became Nil, or kNone
@@ -84,10 +94,17 @@ class Store {
   struct Saved {
     int variable;
     Value value;
+    std::unique_ptr<Listing> candidates;  // null when there were none
   };
 
   static Measure MeasureOf(const Value& value);
   void Narrow(int variable, const Value& outcome);
+  bool IsCandidate(int variable, const Value& outcome) const;
+  std::vector<ZORLong> CandidatesIn(int variable, const Value& outcome) const;
+  void MeetCandidates(int variable, Listing candidates);
+  std::unique_ptr<Listing> TakeCandidates(int variable);
+  void Changed(int variable, const std::string& before);
+  std::string Show(int variable) const;
 
   const zornet::Types& mTypes;
   const zornet::Model& mModel;

@@ -56,15 +56,18 @@ void Supports::Column::Keep(std::size_t place) {
   }
 }
 
+Supports::Supports(Store& store, Semantics& semantics, std::size_t budget)
+    : mStore(store), mSemantics(semantics), mBudget(budget), mColumnOfVariable(store.Model().Variables().size(), 0) {}
+
 bool Supports::Narrow(const Constraint& constraint) {
   Prepare(constraint);
   mTargets.clear();
-  for (int position = constraint.kind->Inputs(); position >= 0; --position) {
-    const bool result = position == constraint.kind->Inputs();
-    if (!result && !Semantics::CanInvert(*constraint.kind, position)) continue;
+  for (std::size_t position = mForward + 1; position-- > 0;) {
+    const bool forward = position == mForward;
+    if (!forward && !Semantics::CanInvert(*constraint.kind, position)) continue;
     const double combinations = Combinations(constraint, position);
     if (combinations <= static_cast<double>(mBudget)) {
-      mTargets.emplace_back(combinations * (result ? 1 : kInversionCost), position);
+      mTargets.emplace_back(combinations * (forward ? 1 : kInversionCost), position);
     }
   }
   std::sort(mTargets.begin(), mTargets.end(),
@@ -78,73 +81,88 @@ bool Supports::Narrow(const Constraint& constraint) {
 }
 
 void Supports::Prepare(const Constraint& constraint) {
+  const std::size_t arity = constraint.arguments.size();
+  for (Column* column : mTried) column->tried = false;
+  mTried.clear();
+  const bool posted = constraint.kind->IsRelation() && !constraint.kind->reified;
+  mForward = posted ? arity : arity - 1;
   mCount = 0;
-  mArity = constraint.kind->arity;
-  for (int position = 0; position < mArity; ++position) {
-    const auto at = static_cast<std::size_t>(position);
-    const int variable = constraint.arguments[at];
-    std::size_t column = 0;
-    while (column < mCount && mColumns[column].variable != variable) ++column;
-    mColumnOf[at] = column;
-    if (column == mCount) {
-      ++mCount;
+  mColumns.resize(std::max(mColumns.size(), arity));
+  mColumnOf.resize(arity);
+  mExact.resize(arity);
+  for (std::size_t position = 0; position < arity; ++position) {
+    const int variable = constraint.arguments[position];
+    std::size_t& column = mColumnOfVariable[static_cast<std::size_t>(variable)];
+    if (column >= mCount || mColumns[column].variable != variable) {
+      column = mCount++;
       mColumns[column].variable = variable;
       mColumns[column].listing = &mStore.List(variable);
-      mColumns[column].openAbove = false;
+      mColumns[column].openBelow = mColumns[column].openAbove = false;
     }
-    mExact[at] = {nullptr, 0, mStore[variable].Sort()};
+    mColumnOf[position] = column;
+    mExact[position] = {nullptr, 0, mStore[variable].Sort()};
   }
-  if (constraint.kind->meaning == Meaning::Slice) ClampPositions(constraint);
+  if (constraint.kind->meaning == Meaning::Slice) ClampPositions();
 }
 
-// A slice that is not empty begins inside the text, and all ends behind the text are alike. So even unknown positions
-// have few candidates.
-void Supports::ClampPositions(const Constraint& constraint) {
+// A slice begins inside the text or is empty, and all ends behind the text are alike. So even unknown positions have
+// few candidates.
+void Supports::ClampPositions() {
   const Listing& texts = *At(0).listing;
   const Listing& slices = *At(3).listing;
-  if (!texts.known || !slices.known || slices.texts.front().GetLengthInChar() == 0) return;
+  if (!texts.known) return;
   std::int64_t last = 0;
   for (const ZORString& text : texts.texts) last = std::max<std::int64_t>(last, text.GetLengthInChar() - 1);
-  ClampPosition(At(1), last, false);
-  if (constraint.arguments[1] != constraint.arguments[2]) ClampPosition(At(2), last, true);
+  if (!slices.known || slices.texts.front().GetLengthInChar() == 0) {
+    ClampPosition(At(1), -1, last + 1, true, true);
+    if (&At(1) != &At(2)) ClampPosition(At(2), -1, last, true, true);
+  } else {
+    ClampPosition(At(1), 0, last, false, false);
+    if (&At(1) != &At(2)) ClampPosition(At(2), 0, last, false, true);
+  }
 }
 
-void Supports::ClampPosition(Column& column, std::int64_t last, bool openAbove) {
+// Where it is open, an end of the range stands for all that is beyond it too.
+void Supports::ClampPosition(Column& column, std::int64_t low, std::int64_t high, bool openBelow, bool openAbove) {
   const Listing& listing = *column.listing;
   if (listing.sort == Sort::IntegerSet || (listing.known && listing.count == 1)) return;
-  constexpr std::int64_t kGreatest = std::numeric_limits<ZORLong>::max();
-  const std::int64_t from = listing.known ? std::max<std::int64_t>(listing.first, 0) : 0;
-  const std::int64_t to = listing.known ? listing.first + static_cast<std::int64_t>(listing.count) - 1 : kGreatest;
-  const std::int64_t top = openAbove ? std::max(last, from) : last;
-  column.openAbove = openAbove && to > top;
+  constexpr std::int64_t kLeast = std::numeric_limits<ZORLong>::min(), kMost = std::numeric_limits<ZORLong>::max();
+  const std::int64_t from = listing.known ? listing.first : kLeast;
+  const std::int64_t to = listing.known ? listing.first + static_cast<std::int64_t>(listing.count) - 1 : kMost;
+  const std::int64_t first = std::max(openBelow ? std::min(low, to) : low, from);
+  const std::int64_t last = std::min(openAbove ? std::max(high, from) : high, to);
+  column.openBelow = openBelow && from < first;
+  column.openAbove = openAbove && to > last;
   column.clamped = Listing();
   column.clamped.known = true;
   column.clamped.sort = Sort::Interval;
-  column.clamped.first = static_cast<ZORLong>(from);
-  column.clamped.count = static_cast<std::size_t>(std::max<std::int64_t>(std::min(to, top) - from + 1, 0));
+  column.clamped.first = static_cast<ZORLong>(first);
+  column.clamped.count = static_cast<std::size_t>(std::max<std::int64_t>(last - first + 1, 0));
+  if (mStore[column.variable].Sort() == Sort::Integer) {
+    for (std::int64_t n = first; n <= last; ++n) column.clamped.numbers.push_back(static_cast<ZORLong>(n));
+    column.clamped.sort = Sort::IntegerSet;  // a single one has each by itself
+  }
   column.listing = &column.clamped;
 }
 
 // How many combinations of the other arguments there are; infinity when one of them is not listed.
-double Supports::Combinations(const Constraint& constraint, int target) {
+double Supports::Combinations(const Constraint& constraint, std::size_t target) {
+  for (Column* column : mTried) column->tried = false;
   mTried.clear();
   double combinations = 1;
-  for (int position = 0; position < constraint.kind->arity; ++position) {
+  for (std::size_t position = 0; position < constraint.arguments.size(); ++position) {
     Column& column = At(position);
-    if (position == target || IsTried(column)) continue;
+    if (position == target || column.tried) continue;
     if (!column.IsListed()) return std::numeric_limits<double>::infinity();
     combinations *= static_cast<double>(column.listing->count);
+    column.tried = true;
     mTried.push_back(&column);
   }
   return combinations;
 }
 
-bool Supports::IsTried(const Column& column) const {
-  return std::find(mTried.begin(), mTried.end(), &column) != mTried.end();
-}
-
 // False when a listed target has more supports than can be listed.
-bool Supports::Try(const Constraint& constraint, int target) {
+bool Supports::Try(const Constraint& constraint, std::size_t target) {
   const bool none = Combinations(constraint, target) == 0;
   Start();
   if (none) return true;
@@ -159,13 +177,16 @@ void Supports::Start() {
   for (std::size_t i = 0; i < mCount; ++i) mColumns[i].Start();
 }
 
-bool Supports::TryOne(const Constraint& constraint, int target) {
+bool Supports::TryOne(const Constraint& constraint, std::size_t target) {
   bool accepted = false;
-  if (target == constraint.kind->Inputs()) {
+  if (target == mExact.size()) {
+    accepted = mSemantics.Holds(constraint, mExact);
+  } else if (target == mForward) {
     Answer answer;
-    accepted = mSemantics.Compute(*constraint.kind, mExact.data(), answer) && Accept(target, std::move(answer));
+    accepted =
+        mSemantics.Compute(constraint, std::span(mExact).first(target), answer) && Accept(target, std::move(answer));
   } else {
-    auto answers = mSemantics.Invert(*constraint.kind, target, mExact.data());
+    auto answers = mSemantics.Invert(constraint, target, mExact);
     if (!answers && At(target).IsListed()) return false;
     if (!answers) accepted = At(target).open = true;
     if (answers) {
@@ -191,9 +212,9 @@ bool Supports::Advance() {
 
 void Supports::Choose(Column& column, std::size_t index) {
   column.index = index;
-  for (int position = 0; position < mArity; ++position) {
+  for (std::size_t position = 0; position < mExact.size(); ++position) {
     if (&At(position) != &column) continue;
-    Exact& exact = mExact[static_cast<std::size_t>(position)];
+    Exact& exact = mExact[position];
     if (IsText(column.listing->sort)) {
       exact.text = &column.listing->texts[index];
     } else {
@@ -203,7 +224,7 @@ void Supports::Choose(Column& column, std::size_t index) {
 }
 
 // Whether the target can take answer; where this combination gave it a value, it must be that one.
-bool Supports::Accept(int target, Answer answer) {
+bool Supports::Accept(std::size_t target, Answer answer) {
   Column& column = At(target);
   if (!column.IsListed()) {
     column.found.push_back(std::move(answer));
@@ -211,7 +232,7 @@ bool Supports::Accept(int target, Answer answer) {
   }
   const std::size_t index = Find(*column.listing, answer);
   if (index == column.listing->count) return false;
-  if (IsTried(column)) return index == column.index;
+  if (column.tried) return index == column.index;
   column.Keep(index);
   return true;
 }
@@ -225,7 +246,7 @@ bool Supports::HasAll() const {
 void Supports::Apply(const Constraint& constraint) {
   mStore.StartOperation(Operation::Supports);
   for (const bool constants : {false, true}) {
-    for (int position = constraint.kind->Inputs(); position >= 0; --position) {
+    for (std::size_t position = constraint.arguments.size(); position-- > 0;) {
       Column& column = At(position);
       if (mStore.HasFailed()) return;
       if (column.met || mStore.Declared(column.variable).constant != constants) continue;
@@ -250,9 +271,7 @@ void Supports::MeetTexts(Column& column) {
   for (std::size_t i = 0; i < column.kept.size(); ++i) {
     if (column.kept[i] != 0) texts.push_back(column.listing->texts[i]);
   }
-  Value& outcome = mStore.FreshLike(column.variable);
-  outcome.SetTexts(texts);
-  mStore.Meet(column.variable, outcome);
+  mStore.MeetTexts(column.variable, std::move(texts));
 }
 
 void Supports::MeetNumbers(Column& column) {
@@ -263,11 +282,12 @@ void Supports::MeetNumbers(Column& column) {
     if (column.kept[i] != 0) numbers.push_back(column.listing->NumberAt(i));
   }
   const Value& held = mStore[column.variable];
-  if (column.openAbove && column.behindHighest == column.listing->count)
-    numbers.back() = held.IsKnown() ? held.HighestNumber() : std::numeric_limits<ZORLong>::max();
-  Value& outcome = mStore.FreshLike(column.variable);
-  outcome.SetNumbers(numbers);
-  mStore.Meet(column.variable, outcome);
+  const bool above = column.openAbove && numbers.back() == column.listing->NumberAt(column.listing->count - 1);
+  const bool below = column.openBelow && numbers.front() == column.listing->NumberAt(0);
+  if (held.Sort() == Sort::Integer && (above || below)) return;
+  if (above) numbers.back() = held.IsKnown() ? held.HighestNumber() : std::numeric_limits<ZORLong>::max();
+  if (below) numbers.front() = held.IsKnown() ? held.LowestNumber() : std::numeric_limits<ZORLong>::min();
+  mStore.MeetNumbers(column.variable, std::move(numbers));
 }
 
 void Supports::MeetFound(Column& column) {
@@ -275,21 +295,19 @@ void Supports::MeetFound(Column& column) {
   auto& found = column.found;
   std::sort(found.begin(), found.end(), IsBelow);
   found.erase(std::unique(found.begin(), found.end()), found.end());
-  const Sort sort = mStore[column.variable].Sort();
-  if (found.empty()) return mStore.Fail(column.variable);
-  if (found.size() > (sort == Sort::TextSet ? zor::kSetLimit : 1)) return;
-  Value& outcome = mStore.Fresh(sort);
-  if (sort == Sort::TextSet) {
+  if (IsText(mStore[column.variable].Sort())) {
+    if (found.size() > zor::kSetLimit) return;
     std::vector<ZORString> texts;
     texts.reserve(found.size());
     for (Answer& answer : found) texts.push_back(std::move(answer.text));
-    outcome.SetTexts(texts);
-  } else if (sort == Sort::Text) {
-    outcome.SetText(found.front().text);
+    mStore.MeetTexts(column.variable, std::move(texts));
   } else {
-    outcome.SetNumber(found.front().number);
+    if (found.size() > ZORVadEnumInteger::kListLimit) return;
+    std::vector<ZORLong> numbers;
+    numbers.reserve(found.size());
+    for (const Answer& answer : found) numbers.push_back(answer.number);
+    mStore.MeetNumbers(column.variable, std::move(numbers));
   }
-  mStore.Meet(column.variable, outcome);
 }
 
 }  // namespace zornet

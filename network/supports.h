@@ -5,7 +5,7 @@
 // for among the texts it begins with, so that what is tried is close to what is found.
 #pragma once
 
-#include <array>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -16,8 +16,7 @@ namespace zornet {
 
 class Supports {
  public:
-  Supports(Store& store, Semantics& semantics, std::size_t budget)
-      : mStore(store), mSemantics(semantics), mBudget(budget) {}
+  Supports(Store& store, Semantics& semantics, std::size_t budget);
 
   // False when the combinations are more than the budget or cannot be listed; then nothing has changed.
   bool Narrow(const Constraint& constraint);
@@ -29,7 +28,9 @@ class Supports {
     int variable = kNone;
     const Listing* listing = nullptr;
     Listing clamped;         // replaces positions that are unknown or too many
+    bool openBelow = false;  // the first one stands for all less positions too
     bool openAbove = false;  // the last one stands for all greater positions too
+    bool tried = false;      // it is one of mTried
     std::vector<char> kept;
     std::size_t dropped = 0;                    // values not kept so far
     std::size_t lowest = 0, behindHighest = 0;  // supported numbers of a range
@@ -47,25 +48,33 @@ class Supports {
   };
 
   void Prepare(const Constraint& constraint);
-  void ClampPositions(const Constraint& constraint);
-  void ClampPosition(Column& column, std::int64_t last, bool openAbove);
-  double Combinations(const Constraint& constraint, int target);
-  bool Try(const Constraint& constraint, int target);
+  void ClampPositions();
+  void ClampPosition(Column& column, std::int64_t low, std::int64_t high, bool openBelow, bool openAbove);
+  double Combinations(const Constraint& constraint, std::size_t target);
+  bool Try(const Constraint& constraint, std::size_t target);
   void Start();
-  bool TryOne(const Constraint& constraint, int target);
+  bool TryOne(const Constraint& constraint, std::size_t target);
   bool Advance();
   void Choose(Column& column, std::size_t index);
-  bool Accept(int target, Answer answer);
+  bool Accept(std::size_t target, Answer answer);
   bool HasAll() const;
 
   double DrivenCost(const Constraint& constraint);
   bool Drive(const Constraint& constraint);
   bool Spend();
   bool DriveConcatenation();
-  bool Split(std::size_t result);
-  void KeepCut(std::size_t result, std::size_t length, std::size_t i);
-  bool KeepDoubled(std::size_t result);
+  bool CutDifferent(std::size_t result);
+  bool Reach(std::string_view text);
+  bool ReachFrom(std::size_t input, std::string_view text, std::size_t from);
+  bool KeepParts(std::size_t input);
+  bool KeepUnknownParts(std::size_t input, std::string_view text);
+  bool CutRepeated(std::size_t result);
+  bool CutFrom(std::size_t input, std::string_view rest);
+  void KeepChosen();
   void KeepOverflow(std::size_t greatest);
+  bool DriveExtreme();
+  bool Attain(std::size_t result);
+  void KeepBesideExtreme(std::size_t input);
   bool DriveSlice();
   bool Slice(std::size_t text, std::size_t from);
   void KeepSlice(std::size_t text, std::size_t from, std::size_t result, std::size_t first, std::size_t last);
@@ -75,20 +84,45 @@ class Supports {
   void MeetTexts(Column& column);
   void MeetNumbers(Column& column);
   void MeetFound(Column& column);
-  Column& At(int position) { return mColumns[static_cast<std::size_t>(mColumnOf[static_cast<std::size_t>(position)])]; }
-  bool IsTried(const Column& column) const;
+  std::size_t Inputs() const { return mColumnOf.size() - 1; }
+  Column& Result() { return At(Inputs()); }
+  Column& At(std::size_t position) { return mColumns[mColumnOf[position]]; }
 
   Store& mStore;
   Semantics& mSemantics;
   std::size_t mBudget;
-  std::size_t mCount = 0;                               // of the columns in use
-  std::array<Column, kMostArguments> mColumns;          // one for each different variable
-  std::array<std::size_t, kMostArguments> mColumnOf{};  // by position
-  std::array<Exact, kMostArguments> mExact{};           // what is tried, by position
-  int mArity = 0;
-  std::size_t mTries = 0;                        // left of the budget of a driven pass
-  std::vector<Column*> mTried;                   // the columns whose combinations are tried
-  std::vector<std::pair<double, int>> mTargets;  // by their cost; the result before inputs of equal cost
+  std::size_t mForward = 0;      // the position of the result, or behind all when there is none: a relation is posted
+  std::size_t mCount = 0;        // of the columns in use
+  std::vector<Column> mColumns;  // one for each different variable
+  std::vector<std::size_t> mColumnOf;                    // by position
+  std::vector<std::size_t> mColumnOfVariable;            // good where that column has the variable
+  std::vector<Exact> mExact;                             // what is tried, by position
+  std::size_t mTries = 0;                                // left of the budget of a driven pass
+  std::vector<Column*> mTried;                           // the columns whose combinations are tried
+  std::vector<std::pair<double, std::size_t>> mTargets;  // by their cost; the result before inputs of equal cost
+
+  // A part of the text that is cut: input, its places, and which text of the input it is.
+  struct Part {
+    std::size_t input, from, to, index;
+  };
+  // The part that an input has taken, where it stands more than once.
+  struct Choice {
+    bool made = false;
+    std::string_view text;
+    std::size_t index = 0;
+  };
+  // A text that is the least or the greatest of the inputs, with an input that has it.
+  struct Extreme {
+    std::size_t index, owner;
+    bool shared;  // others have it too
+  };
+  std::vector<Extreme> mExtremes;           // the nearest to the end of the order first
+  bool mLeast = true;                       // of the extremes
+  std::vector<std::vector<char>> mReached;  // by input, the places where it can begin
+  std::vector<char> mLeads, mLeadsNext;     // places from which the end is reached
+  std::vector<Part> mParts;
+  std::vector<Choice> mChosen;  // by column
+  std::vector<std::size_t> mLongest;
 };
 
 }  // namespace zornet

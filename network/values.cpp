@@ -93,13 +93,17 @@ void Value::SetNumber(ZORLong number) {
 
 void Value::SetNumbers(const std::vector<ZORLong>& numbers) {
   if (numbers.empty()) return mValue->SetNilValue();
-  if (numbers.front() == numbers.back()) return SetNumber(numbers.front());
-  if (mSort == Sort::Interval) return Any().Assign(ZORVadIntervalInteger(numbers.front(), numbers.back()));
-  if (mSort != Sort::IntegerSet) return Reset();
+  if (mSort != Sort::IntegerSet || numbers.front() == numbers.back()) return SetRange(numbers.front(), numbers.back());
   ZORVadEnumInteger listed;
   listed.SetNilValue();
   for (const ZORLong number : numbers) listed.Insert(number);
   Any().Assign(listed);
+}
+
+void Value::SetRange(ZORLong lowest, ZORLong highest) {
+  if (lowest == highest) return SetNumber(lowest);
+  if (mSort == Sort::Interval) return Any().Assign(ZORVadIntervalInteger(lowest, highest));
+  Reset();
 }
 
 // The module answers one space for the bounds of a set that lists "" alone.

@@ -59,8 +59,9 @@ class Value {
   void SetTexts(std::span<const ZORString> texts);       // of a set; in ascending order, at least one
   void SetNumber(ZORLong number);                        // of a Boolean 0 or 1
   void SetNumbers(const std::vector<ZORLong>& numbers);  // ascending; an interval takes the ends, a single one or all
+  void SetRange(ZORLong lowest, ZORLong highest);        // of an interval or a Boolean; lowest <= highest
 
-  // What a known value holds.
+  // What a known value holds; of numbers also what an Undefined one does.
   ZORString LowestText() const;
   ZORString HighestText() const;
   std::vector<ZORString> Texts() const;  // in ascending order

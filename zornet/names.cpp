@@ -47,6 +47,11 @@ std::string Names::OfVariable(int variable) const {
   return declared.constant ? Written(mPlaces.variables[at]) : declared.name;
 }
 
+std::string Names::DeclarationOf(int variable) const {
+  const std::size_t line = LineOfVariable(variable);
+  return Written({mSource.LineBegin(line), mSource.Line(line).size()});
+}
+
 std::size_t Names::LineOfConstraint(int constraint) const {
   return mSource.LineOf(mPlaces.constraints[static_cast<std::size_t>(constraint)].begin);
 }

@@ -40,6 +40,13 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   app.add_option("FILE", options.file, "The model (*.szn); - for standard input")->required();
   auto* solutions =
       app.add_option("--solutions", options.solutions, "Print up to N solutions")->type_name("N")->check(WholeFrom(1));
+  auto* split = app.add_option("--split", options.split, "Write at least N parts of the model, to be searched apart")
+                    ->type_name("N")
+                    ->check(WholeFrom(1))
+                    ->excludes(solutions);
+  app.add_option("--parts", options.parts, "What the names of these files begin with (part)")
+      ->type_name("PREFIX")
+      ->needs(split);
   app.add_flag("--trace", options.trace, "Print each narrowing as it happens");
   auto* explain = app.add_option("--explain", options.explain, "Print what brought a variable to its value")
                       ->type_name("NAME")
@@ -47,6 +54,7 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   app.add_flag("--stats", options.stats, "Print calls, changes and contradictions of each operation");
   app.add_flag("--raw", options.raw, "Call the module's bare operations in the order of the file, once each")
       ->excludes(solutions)
+      ->excludes(split)
       ->excludes(explain);
   app.add_flag("--json-stream", options.json, "Print everything as one JSON object a line");
   app.add_option("--dot", options.dot, "Write the network as a graph for Graphviz; - for standard output")

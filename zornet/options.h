@@ -14,6 +14,8 @@ struct Options {
   std::string file;
   bool raw = false;
   std::uint64_t solutions = 0;
+  std::uint64_t split = 0;
+  std::string parts;  // what the files of the parts begin with
   bool trace = false;
   std::vector<std::string> explain;
   bool stats = false;

@@ -146,9 +146,12 @@ void RunRaw(Network& network, const Names& names, const std::function<void(const
   RawRun run(network, names);
   const std::vector<Constraint>& constraints = network.GetModel().Constraints();
   for (int c = 0; c < static_cast<int>(constraints.size()); ++c) {
-    const Kind& kind = *constraints[static_cast<std::size_t>(c)].kind;
+    const Constraint& constraint = constraints[static_cast<std::size_t>(c)];
+    const Kind& kind = *constraint.kind;
+    if (kind.IsOfNumbers()) continue;  // the module's operations are those of texts
     for (const Row& row : kRows) {
-      if (row.meaning == kind.meaning && row.mirrored == kind.mirrored && row.reified == kind.reified)
+      if (row.meaning == kind.meaning && row.mirrored == kind.mirrored && row.reified == kind.reified &&
+          row.order.size() == constraint.arguments.size())
         told(run.Call(c, row));
     }
   }

@@ -67,6 +67,7 @@ class Names {
 
   std::string OfConstraint(int constraint) const;
   std::string OfVariable(int variable) const;
+  std::string DeclarationOf(int variable) const;  // the line of the source that declares it
   std::string OfVariable(Var variable) const { return OfVariable(variable.index); }
   std::size_t LineOfConstraint(int constraint) const;
   std::size_t LineOfVariable(int variable) const;

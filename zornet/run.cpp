@@ -19,6 +19,7 @@
 #include "zornet/picture.h"
 #include "zornet/progress.h"
 #include "zornet/raw.h"
+#include "zornet/split.h"
 
 namespace zornet {
 
@@ -73,6 +74,7 @@ class OneRun {
   const Names& mNames;
   Report& mReport;
   std::vector<Var> mExplained;
+  Explanation mDrawn;  // all that was explained, for pictures
   Summary mSummary;
 };
 
@@ -120,7 +122,12 @@ void OneRun::Solve() {
 
 void OneRun::Tell() {
   if (!mSummary.search) mReport.Variables(mNetwork);
-  for (const Var variable : mExplained) mReport.Explain(mNetwork, variable, mNetwork.Explain(variable));
+  for (const Var variable : mExplained) {
+    const Explanation explanation = mNetwork.Explain(variable);
+    mReport.Explain(mNetwork, variable, explanation);
+    mDrawn.declared.insert(mDrawn.declared.end(), explanation.declared.begin(), explanation.declared.end());
+    mDrawn.narrowings.insert(mDrawn.narrowings.end(), explanation.narrowings.begin(), explanation.narrowings.end());
+  }
   if (mOptions.stats) mReport.Statistics(mNetwork);
   WritePictures();
   if (!mOptions.raw) mReport.Finish(mNetwork, mSummary);
@@ -128,8 +135,10 @@ void OneRun::Tell() {
 
 void OneRun::WritePictures() const {
   try {
-    if (!mOptions.dot.empty()) WriteGraph(mOptions.dot, Graph(mNetwork, mNames));
-    if (!mOptions.svg.empty()) WritePicture(mOptions.svg, Graph(mNetwork, mNames));
+    if (mOptions.dot.empty() && mOptions.svg.empty()) return;
+    const std::string graph = Graph(mNetwork, mNames, mExplained.empty() ? nullptr : &mDrawn);
+    if (!mOptions.dot.empty()) WriteGraph(mOptions.dot, graph);
+    if (!mOptions.svg.empty()) WritePicture(mOptions.svg, graph);
   } catch (const std::runtime_error& error) {
     throw UsageError(error.what());
   }
@@ -147,6 +156,20 @@ int OneRun::ExitCode() const {
       return kOpen;
   }
   return kSettled;
+}
+
+// The names of the files are told on standard output, so that the next program can read them.
+int WriteParts(const Options& options, const Source& source, const Model& model) {
+  const std::vector<Part> parts = Split(model, options.limits, options.modulePaths, options.split);
+  for (std::size_t i = 0; i < parts.size(); ++i) {
+    const std::string file = fmt::format("{}.{}.szn", options.parts.empty() ? "part" : options.parts, i + 1);
+    std::ofstream out(file, std::ios::binary);
+    out << source.Text() << "\n" << parts[i];
+    out.close();
+    if (!out) throw UsageError(fmt::format("{}: {}", file, std::strerror(errno)));
+    std::cout << file << '\n';
+  }
+  return parts.empty() ? kContradiction : kSettled;
 }
 
 }  // namespace
@@ -170,6 +193,7 @@ int Run(const Options& options) {
       reportOn(source, {}, {})->Errors(source, diagnostics);
       return kModelError;
     }
+    if (options.split != 0) return WriteParts(options, source, read.model);
     Network network(std::move(read.model), options.limits, options.modulePaths);
     const Names names(source, read.places, network.GetModel());
     const auto report = reportOn(source, read.places, network.GetModel());

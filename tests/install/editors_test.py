@@ -26,6 +26,8 @@ colours = {}
 for model in root.glob('examples/*.szn'):
     for scope, text in (part for line in model.read_text().splitlines() for part in parts(line)):
         colours.setdefault(scope, set()).add(text)
+for scope, text in (part for kind in kinds for part in parts(f'constraint {kind}();')):
+    colours.setdefault(scope, set()).add(text)
 plain = {text for text in colours.pop('') if text.strip()}
 assert not plain, f'without a colour: {plain}'
 assert colours['support.function.szn'] == kinds, f'constraints: {colours["support.function.szn"] ^ kinds}'

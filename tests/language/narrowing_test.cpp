@@ -72,6 +72,15 @@ TEST(Propagation, WorkGrowsWithTheNetwork) {
   EXPECT_LE(passes(10000), 11 * passes(1000));
 }
 
+// Each pass would take one number from an interval.
+TEST(Propagation, ShavesNoIntervalToItsEnd) {
+  Solved solved(
+      "var 0..2147483647: x; var 1..2: by; var 0..2147483647: y; constraint int_plus(x, by, y);"
+      "constraint int_plus(y, by, x);",
+      {65536, 10000});
+  EXPECT_EQ(solved.Narrow(), zornet::Outcome::Settled);
+}
+
 TEST(Search, SaysNoMoreThanItKnows) {
   for (const Row& row : Rows("searches.txt")) {
     Solved solved(row.model, {1000, 100});

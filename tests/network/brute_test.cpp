@@ -28,6 +28,11 @@ class Check {
     }
     for (const naive::Assignment& solution : mExpected) ASSERT_NO_FATAL_FAILURE(CheckKept(solution));
     ASSERT_NO_FATAL_FAILURE(CheckExact());
+    const auto& variables = mNetwork.variables;
+    const bool hasAllNumbers = std::any_of(variables.begin(), variables.end(), [](const naive::Variable& variable) {
+      return variable.type == naive::Type::Interval && variable.domain.empty();
+    });
+    if (hasAllNumbers) return;  // the search would try them
     ASSERT_NO_FATAL_FAILURE(CheckSearch());
   }
 
@@ -66,7 +71,7 @@ class Check {
 
   void CheckHolds(const naive::Assignment& assignment) const {
     for (const naive::Constraint& constraint : mNetwork.constraints) {
-      ASSERT_TRUE(naive::Holds(mNetwork, constraint, assignment)) << mText << constraint.Name() << " fails for\n"
+      ASSERT_TRUE(naive::Holds(mNetwork, constraint, assignment)) << mText << constraint.kind->name << " fails for\n"
                                                                   << Describe(assignment);
     }
   }
@@ -116,8 +121,13 @@ class Check {
     for (std::size_t v = 0; v < mNetwork.variables.size(); ++v)
       text += "v" + std::to_string(v) + ": " + mSolved[static_cast<int>(v)].Print() + "\n";
     for (const naive::Constraint& constraint : mNetwork.constraints) {
-      text += constraint.Name();
+      text += constraint.kind->name;
       for (const int argument : constraint.arguments) text += " v" + std::to_string(argument);
+      if (!constraint.expression.empty()) text += " \"" + constraint.expression + '"';
+      for (const auto& row : constraint.rows) {
+        text += " |";
+        for (const std::string& cell : row) text += " \"" + cell + '"';
+      }
       text += "\n";
     }
     return text;

@@ -31,37 +31,12 @@ struct Variable {
   std::vector<Value> domain;  // empty: anything
 };
 
-struct Network;
-struct Constraint;
-using Assignment = std::vector<Value>;
-using Image = std::optional<Value>;
-
-// The values of the arguments of a constraint.
-struct Arguments {
-  const Network& network;
-  const Constraint& constraint;
-  const Assignment& values;
-
-  const Value& operator[](std::size_t i) const;
-  const std::string& Text(std::size_t i) const { return (*this)[i].text; }
-  Type TypeOf(std::size_t i) const;
-};
-
-// What a constraint means on exact values: the value it computes from its operands, nothing where there is none. A
-// truth value makes it a relation, which holds where that is true; reified, the truth value is its last argument.
-struct Meaning {
-  const char* name;
-  const char* takes;  // t: a text, i: an integer, b: a truth value, a: anything
-  char gives;
-  Image (*image)(const Arguments& operands);
-};
-
 struct Constraint {
-  const Meaning* meaning;
-  bool result;  // whether the last argument is the result
+  const zornet::Kind* kind;
   std::vector<int> arguments;
-
-  std::string Name() const { return meaning->name + std::string(result && meaning->gives == 'b' ? "_reif" : ""); }
+  std::size_t members = 0;                          // so many of the first arguments are a list
+  std::string expression = {};                      // of a constraint that takes one
+  std::vector<std::vector<std::string>> rows = {};  // of a table
 };
 
 struct Network {
@@ -71,12 +46,7 @@ struct Network {
   zornet::Model Build() const;  // variable 3 is called v3
 };
 
-inline const Value& Arguments::operator[](std::size_t i) const {
-  return values[static_cast<std::size_t>(constraint.arguments[i])];
-}
-inline Type Arguments::TypeOf(std::size_t i) const {
-  return network.variables[static_cast<std::size_t>(constraint.arguments[i])].type;
-}
+using Assignment = std::vector<Value>;
 
 bool Holds(const Network& network, const Constraint& constraint, const Assignment& values);
 

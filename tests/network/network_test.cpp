@@ -23,6 +23,11 @@ TEST(Model, RefusesWhatItCannotHold) {
     {[](Model& m, Var x, Var) { m.Post("str_eq", {x}); }, "str_eq takes 2 arguments, not 1"},
     {[](Model& m, Var, Var n) { m.Post("str_eq", {"a", n}); }, "str_eq cannot take 'n' for y"},
     {[](Model& m, Var, Var) { m.Post("str_eq", {"a", Var{}}); }, "no variable of this model"},
+    {[](Model& m, Var x, Var n) { m.Post("str_concat", {{x, "a", n}, x}); }, "str_concat cannot take 'n' for xs"},
+    {[](Model& m, Var x, Var) { m.Post("str_concat", {std::vector<zornet::Argument>(), x}); }, "str_concat takes at least one member in xs"},
+    {[](Model& m, Var x, Var) { m.Post("str_eq", {{x, "a"}, x}); }, "str_eq takes no list for x"},
+    {[](Model& m, Var x, Var) { m.Post("str_matches", {x, "a(b"}); }, "missing ): a(b"},
+    {[](Model& m, Var x, Var) { m.Post("str_table", {{x, x}, zornet::Rows{{{"a", "b"}, {"a"}}}}); }, "a row has 2 texts here, not 1"},
   };
   // clang-format on
   for (const auto& [add, told] : rows) {
@@ -82,6 +87,20 @@ TEST(Network, ExplainsAContradiction) {
   EXPECT_EQ(why.narrowings[0].constraint, joined);
   EXPECT_EQ(why.narrowings[0].after, "\"a.tar\"");
   EXPECT_EQ(why.narrowings[1].after, "Nil");
+}
+
+// Each text but one has a variable of its own: no search is needed to see that the last has none.
+TEST(Network, MatchesWithoutSearch) {
+  std::vector<std::string> texts;
+  for (int i = 0; i < 200; ++i) texts.push_back("t" + std::to_string(i));
+  Model model;
+  std::vector<zornet::Argument> variables;
+  for (int i = 0; i < 200; ++i) variables.emplace_back(model.TextSet("", texts));
+  model.Post("str_all_different", {variables});
+  variables.emplace_back(model.TextSet("", texts));
+  EXPECT_EQ(Network(model).Narrow(), Outcome::Settled);
+  model.Post("str_all_different", {variables});
+  EXPECT_EQ(Network(model).Narrow(), Outcome::Contradiction);
 }
 
 TEST(Network, TellsWhereModulesAreMissing) { EXPECT_NO_THROW(Network(Model(), {}, {"/nowhere"})); }

@@ -82,7 +82,7 @@ SearchResult Network::Search(std::uint64_t most, const std::function<bool()>& fo
   result.outcome = search.Run(most, found);
   result.solutions = search.Found();
   result.open = search.Open();
-  result.openVariable = {search.OpenVariable()};
+  for (const int variable : search.OpenVariables()) result.openVariables.push_back({variable});
   result.complete = search.IsExhausted() && result.open == 0;
   if (search.IsExhausted() && result.open != 0) result.outcome = Outcome::Open;
   if (result.complete && result.solutions == 0) result.outcome = Outcome::Contradiction;

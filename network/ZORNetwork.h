@@ -94,9 +94,9 @@ struct OperationCount {
 struct SearchResult {
   Outcome outcome = Outcome::Settled;  // Contradiction: it is sure that there is no solution
   std::uint64_t solutions = 0;
-  bool complete = false;   // there are no more
-  std::uint64_t open = 0;  // branches left because a variable stays unknown in them
-  Var openVariable;        // one such variable
+  bool complete = false;           // there are no more
+  std::uint64_t open = 0;          // branches left because variables stay unknown in them
+  std::vector<Var> openVariables;  // these variables
 };
 
 class ZOR_EXPORT Network {

@@ -118,9 +118,11 @@ class JsonReport : public Report {
               {"calls", total.calls},
               {"changes", total.changes},
               {"milliseconds", summary.milliseconds}};
-    if (const auto& search = summary.search)
-      json.update({{"solutions", search->solutions}, {"complete", search->complete}, {"open", search->open}});
-    if (summary.search && summary.search->open != 0) json["variable"] = mNames.OfVariable(summary.search->openVariable);
+    if (const auto& search = summary.search) {
+      json.update({{"solutions", search->solutions}, {"complete", search->complete}});
+      json["open"] = Json::array();
+      for (const Var variable : search->openVariables) json["open"].push_back(mNames.OfVariable(variable));
+    }
     if (const int failed = network.FailedConstraint(); failed != kNone) {
       json["variable"] = mNames.OfVariable(network.FailedVariable());
       json["constraint"] = mNames.OfConstraint(failed);

@@ -35,7 +35,7 @@ enum ExitCode {
   kModelError = 3,
   kModuleError = 4,
   kStepLimit = 5,
-  kOpen = 6,  // all is tried, and there may be more solutions
+  kOpen = 6,  // all is tried, but there may be more solutions
   kNoMemory = 7,
 };
 

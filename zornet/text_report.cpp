@@ -14,6 +14,8 @@ std::string Counted(std::uint64_t count, std::string_view thing) {
   return fmt::format("{} {}{}", count, thing, count == 1 ? "" : "s");
 }
 
+constexpr std::size_t kMostNamed = 8;
+
 class TextReport : public Report {
  public:
   TextReport(const Source& source, const Places& places, const Model& model, const ReportStyle& style,
@@ -57,6 +59,7 @@ class TextReport : public Report {
   std::string Line(const Narrowing& narrowing) const;
   std::string Shown(const Domain& domain) const;
   std::string Result(const Network& network, const Summary& summary) const;
+  std::string Listed(const std::vector<Var>& variables) const;
 
   const Model& mModel;
   Names mNames;
@@ -128,8 +131,18 @@ std::string TextReport::Result(const Network& network, const Summary& summary) c
   }
   if (summary.outcome == Outcome::Contradiction) return "contradiction: no solution";
   if (!search) return "settled";
+  if (summary.outcome == Outcome::Open) return "open after " + solutions;
   if (!search->complete) return solutions + " found, there may be more";
   return search->solutions == 1 ? "the only solution" : "all " + solutions;
+}
+
+// By name, the first of many.
+std::string TextReport::Listed(const std::vector<Var>& variables) const {
+  const std::size_t named = std::min(variables.size(), kMostNamed);
+  std::string listed;
+  for (std::size_t i = 0; i < named; ++i) listed += (i == 0 ? "" : ", ") + mNames.OfVariable(variables[i]);
+  if (named < variables.size()) listed += fmt::format(" and {} more", variables.size() - named);
+  return listed;
 }
 
 void TextReport::Finish(const Network& network, const Summary& summary) {
@@ -137,7 +150,8 @@ void TextReport::Finish(const Network& network, const Summary& summary) {
   if (search && search->complete) mResults << "==========\n";
   mResults.flush();
   if (summary.outcome == Outcome::Open)
-    mRemarks << fmt::format("unknown: {} stays open\n", mNames.OfVariable(search->openVariable));
+    mRemarks << fmt::format("unknown: {} stay{} open\n", Listed(search->openVariables),
+                            search->openVariables.size() == 1 ? "s" : "");
   if (mStyle.quiet) return;
   const Paint paint(mStyle.remarkColour);
   const OperationCount total = Total(network.Counts());

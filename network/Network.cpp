@@ -106,6 +106,14 @@ Explanation Network::Explain(Var variable) const {
   return explanation;
 }
 
+std::vector<LimitMet> Network::LimitsMet() const {
+  if (mInside->store.HasFailed()) return {};
+  std::vector<LimitMet> met = mInside->store.LimitsMet();
+  mInside->propagation.AddLimitsMet(met);
+  std::erase_if(met, [this](const LimitMet& each) { return (*this)[each.variable].IsOne(); });
+  return met;
+}
+
 void Network::OnNarrowing(std::function<void(const Narrowing&)> told) {
   mInside->teller = told ? std::make_unique<Teller>(std::move(told)) : nullptr;
   mInside->store.Watch(mInside->teller.get());

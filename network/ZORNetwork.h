@@ -86,6 +86,23 @@ struct Explanation {
   std::vector<Narrowing> narrowings;  // in the order in which they happened
 };
 
+// What can keep a variable from being narrowed further.
+enum class Limit {
+  Set,         // more values are possible than a set lists
+  Budget,      // the values have more combinations than Limits::budget
+  Narrowings,  // of one interval in a row
+  Steps,       // Limits::steps are made
+};
+
+// A limit that did so.
+struct LimitMet {
+  Limit limit = Limit::Set;
+  Var variable;
+  int constraint = kNone;   // that would have narrowed it
+  std::uint64_t count = 0;  // the values or combinations; 0 where they were not counted
+  std::uint64_t most = 0;   // what the limit allows
+};
+
 struct OperationCount {
   std::string_view operation;
   std::uint64_t calls = 0, changes = 0, contradictions = 0;
@@ -126,6 +143,10 @@ class ZOR_EXPORT Network {
 
   // Narrows once more from the start, to tell what brought a variable to its domain.
   Explanation Explain(Var variable) const;
+
+  // What keeps variables from being narrowed further, apart from what is not known of others. None after a
+  // contradiction, and none at a variable that has one value.
+  std::vector<LimitMet> LimitsMet() const;
 
   // The solver's own value, for the bare operations of its modules. What is narrowed after a change is not sound.
   ZORVaDoAny& Bare(Var variable);

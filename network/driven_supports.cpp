@@ -93,7 +93,6 @@ double Supports::DrivenCost(const Constraint& constraint) {
 
 // False when it takes more than the budget.
 bool Supports::Drive(const Constraint& constraint) {
-  if (DrivenCost(constraint) == kNever) return false;
   Start();
   mTries = mBudget;
   mLeast = constraint.kind->meaning == Meaning::Minimum;

@@ -109,6 +109,10 @@ Status Functions::Narrow(const Constraint& constraint) {
 Status Functions::NarrowNumbers(const Constraint& constraint) {
   const Status status = mArithmetic.Narrow(constraint);
   if (mStore.HasFailed() || status != Status::Again || !mArithmetic.NeedsSupports(constraint)) return status;
+  if (mArithmetic.HasManyOpen(constraint)) {
+    mSupports.ExceedBudget(constraint, 0);
+    return status;
+  }
   return mSupports.Narrow(constraint) ? Status::Fixpoint : Status::Again;
 }
 

@@ -43,7 +43,7 @@ void Propagation::Connect() {
   each([&](int constraint, std::size_t variable) { mReaders[next[variable]++] = constraint; });
 }
 
-Outcome Propagation::Run() {
+Outcome Propagation::NarrowAll() {
   for (const int variable : mShaved) mShavings[static_cast<std::size_t>(variable)] = 0;
   mShaved.clear();
   if (mSteps == 0) FailCycle();
@@ -111,7 +111,17 @@ bool Propagation::IsShaved(int variable) {
   if (value.Sort() != Sort::Interval || value.IsOne()) return false;
   unsigned& shavings = mShavings[static_cast<std::size_t>(variable)];
   if (shavings++ == 0) mShaved.push_back(variable);
+  if (shavings == kMostShavings + 1) mStore.MeetLimit(Limit::Narrowings, variable, 0, kMostShavings);
   return shavings > kMostShavings;
+}
+
+void Propagation::AddLimitsMet(std::vector<LimitMet>& met) const {
+  if (mOutcome != Outcome::StepLimit) return;
+  for (std::size_t i = 0; i < mWaiting; ++i) {
+    const int constraint = mQueue[(mHead + i) % mQueue.size()];
+    for (const int variable : mModel.Constraints()[static_cast<std::size_t>(constraint)].arguments)
+      met.push_back({Limit::Steps, {variable}, constraint, 0, mLimits.steps});
+  }
 }
 
 std::span<const int> Propagation::ReadersOf(int variable) const {

@@ -21,7 +21,7 @@ class Propagation {
  public:
   Propagation(Store& store, const Limits& limits);
 
-  Outcome Run();
+  Outcome Run() { return mOutcome = NarrowAll(); }
 
   // Reports now and then, with the steps made and the constraints waiting.
   using Teller = std::function<void(std::uint64_t steps, std::size_t waiting)>;
@@ -35,11 +35,14 @@ class Propagation {
   bool IsFinished(int constraint) const { return mStates[static_cast<std::size_t>(constraint)] == Finished; }
   bool Waits(int variable) const;  // whether a constraint that reads it is not finished
 
+  void AddLimitsMet(std::vector<LimitMet>& met) const;  // at the variables that waiting constraints would narrow
+
   // As in Store, for what is settled and what waits.
   void Mark() { mMarks.push_back(mFinished.size()); }
   void Undo();
 
  private:
+  Outcome NarrowAll();
   void Connect();
   void Wake(int constraint);
   void WakeReaders(int except);
@@ -74,6 +77,7 @@ class Propagation {
   std::vector<int> mFinished;  // in the order in which they were
   std::vector<std::size_t> mMarks;
   std::uint64_t mSteps = 0;
+  Outcome mOutcome = Outcome::Settled;  // of the latest run
 };
 
 }  // namespace zornet

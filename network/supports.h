@@ -20,6 +20,7 @@ class Supports {
 
   // False when the combinations are more than the budget or cannot be listed; then nothing has changed.
   bool Narrow(const Constraint& constraint);
+  void ExceedBudget(const Constraint& constraint, double combinations);  // 0 where they were not counted
 
  private:
   // One variable of the constraint: its domain, and the values with a support so far. Of a range of numbers only the
@@ -37,6 +38,7 @@ class Supports {
     std::size_t index = 0;                      // the value that is tried
     std::vector<Answer> found;                  // values of a variable that is not listed
     bool open = false;                          // found does not hold all of them
+    bool tooMany = false;                       // since there are more than a set lists
     bool met = false;                           // its variable has been narrowed
 
     bool IsListed() const { return listing->known; }

@@ -1,5 +1,6 @@
 #include <nlohmann/json.hpp>
 
+#include "zornet/limits.h"
 #include "zornet/render.h"
 #include "zornet/report.h"
 
@@ -63,10 +64,12 @@ class JsonReport : public Report {
   void Narrowed(const Narrowing& narrowing) override { Tell(ToJson("narrowing", narrowing)); }
 
   void Variables(const Network& network) override {
+    const LimitsByVariable limits = LimitsOf(network);
     for (const int variable : mModel.Wanted()) {
       const Sort sort = mModel.Variables()[static_cast<std::size_t>(variable)].sort;
       Json json{{"event", "variable"}, {"name", mNames.OfVariable(variable)}, {"type", NamesOf(sort).type}};
       json.update(Describe(network[variable], sort));
+      AddLimits(json, limits, variable);
       Tell(json);
     }
   }
@@ -82,11 +85,13 @@ class JsonReport : public Report {
     Json steps = Json::array(), declared = Json::array();
     for (const auto& start : explanation.declared) declared.push_back(mNames.OfVariable(start.variable));
     for (const Narrowing& step : explanation.narrowings) steps.push_back(ToJson("narrowing", step));
-    Tell({{"event", "explanation"},
-          {"name", mNames.OfVariable(variable)},
-          {"value", network[variable].Print()},
-          {"declared", std::move(declared)},
-          {"narrowings", std::move(steps)}});
+    Json json{{"event", "explanation"},
+              {"name", mNames.OfVariable(variable)},
+              {"value", network[variable].Print()},
+              {"declared", std::move(declared)},
+              {"narrowings", std::move(steps)}};
+    AddLimits(json, LimitsOf(network), variable.index);
+    Tell(json);
   }
 
   void Statistics(const Network& network) override {
@@ -123,6 +128,7 @@ class JsonReport : public Report {
       json["open"] = Json::array();
       for (const Var variable : search->openVariables) json["open"].push_back(mNames.OfVariable(variable));
     }
+    for (const Limit limit : LimitsOf(network, summary.outcome)) json["limits"].push_back(NameOf(limit));
     if (const int failed = network.FailedConstraint(); failed != kNone) {
       json["variable"] = mNames.OfVariable(network.FailedVariable());
       json["constraint"] = mNames.OfConstraint(failed);
@@ -135,15 +141,28 @@ class JsonReport : public Report {
  private:
   Json ToJson(std::string_view event, const Narrowing& narrowing) const {
     Json json{{"event", event}};
-    if (narrowing.constraint != kNone) {
-      json["line"] = mNames.LineOfConstraint(narrowing.constraint);
-      json["constraint"] = mNames.OfConstraint(narrowing.constraint);
-    }
+    AddConstraint(json, narrowing.constraint);
     json["operation"] = narrowing.operation;
     json["target"] = mNames.OfVariable(narrowing.variable);
     json["before"] = narrowing.before;
     json["after"] = narrowing.after;
     return json;
+  }
+
+  void AddConstraint(Json& json, int constraint) const {
+    if (constraint == kNone) return;
+    json["line"] = mNames.LineOfConstraint(constraint);
+    json["constraint"] = mNames.OfConstraint(constraint);
+  }
+
+  void AddLimits(Json& json, const LimitsByVariable& limits, int variable) const {
+    const auto [first, last] = limits.equal_range(variable);
+    for (auto at = first; at != last; ++at) {
+      Json limit{{"limit", NameOf(at->second.limit)}, {"most", at->second.most}};
+      if (at->second.count != 0) limit["count"] = at->second.count;
+      AddConstraint(limit, at->second.constraint);
+      json["limits"].push_back(std::move(limit));
+    }
   }
 
   // File names and broken models need not be UTF-8.

@@ -99,7 +99,10 @@ Explanation Network::Explain(Var variable) const {
   Store store(mInside->session.Types(), mInside->model);
   Log log(mInside->model);
   store.Watch(&log);
-  Propagation(store, {mInside->limits.budget, mInside->propagation.Steps()}).Run();
+  Limits limits;
+  limits.budget = mInside->limits.budget;
+  limits.steps = mInside->propagation.Steps();
+  Propagation(store, limits).Run();
   Explanation explanation = log.Explain(variable.index);
   const Store start(mInside->session.Types(), mInside->model);
   for (Explanation::Start& declared : explanation.declared) declared.value = start[declared.variable.index].Show();

@@ -10,6 +10,8 @@
 // Networks are independent of each other; one belongs to one thread at a time.
 #pragma once
 
+#include <atomic>
+#include <chrono>
 #include <cstddef>
 #include <cstdint>
 #include <functional>
@@ -35,6 +37,8 @@ struct ZOR_EXPORT ModuleFailure : std::runtime_error {
 struct Limits {
   std::size_t budget = 65536;         // combinations of values that one pass over a constraint may try
   std::uint64_t steps = 100'000'000;  // passes over a constraint, and choices of a search, in all
+  std::chrono::steady_clock::time_point deadline = std::chrono::steady_clock::time_point::max();
+  const std::atomic<bool>* stop = nullptr;  // ends it when another thread or a signal makes this true
 };
 
 enum class Outcome {
@@ -42,6 +46,8 @@ enum class Outcome {
   Contradiction,  // there is no solution
   StepLimit,
   Open,  // of a search that tried all: there may be more solutions, as a variable stays unknown in some branch
+  TimeLimit,
+  Stopped,
 };
 
 // What is still possible for a variable: a view, good until its network changes. Texts and numbers ascend.
@@ -92,6 +98,8 @@ enum class Limit {
   Budget,      // the values have more combinations than Limits::budget
   Narrowings,  // of one interval in a row
   Steps,       // Limits::steps are made
+  Time,        // Limits::deadline is past
+  Stop,        // Limits::stop is true
 };
 
 // A limit that did so.
@@ -125,7 +133,7 @@ class ZOR_EXPORT Network {
   Network(Network&&) noexcept;
   Network& operator=(Network&&) noexcept;
 
-  // Narrows until nothing changes, until a contradiction, or until the limit of steps.
+  // Narrows until nothing changes, until a contradiction, or until a limit.
   Outcome Narrow();
 
   // Narrows, then looks for solutions, in which every wanted variable has one value, and stops at `most` of them. Each

@@ -101,7 +101,7 @@ bool Supports::Drive(const Constraint& constraint) {
 }
 
 bool Supports::Spend() {
-  if (mTries == 0) return false;
+  if (mTries == 0 || mStop.IsAsked()) return false;
   --mTries;
   return true;
 }

@@ -71,10 +71,10 @@ std::size_t LongestOf(const Listing& listing) {
 
 }  // namespace
 
-Functions::Functions(Store& store, std::size_t budget)
+Functions::Functions(Store& store, std::size_t budget, Stop& stop)
     : mStore(store),
       mSemantics(store.Types()),
-      mSupports(store, mSemantics, budget),
+      mSupports(store, mSemantics, budget, stop),
       mArithmetic(store),
       mX(store.Types(), Sort::TextSet),
       mY(store.Types(), Sort::TextSet),

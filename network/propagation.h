@@ -12,6 +12,7 @@
 #include "network/all_different.h"
 #include "network/functions.h"
 #include "network/relations.h"
+#include "network/stop.h"
 #include "network/store.h"
 #include "network/tables.h"
 
@@ -21,14 +22,15 @@ class Propagation {
  public:
   Propagation(Store& store, const Limits& limits);
 
-  Outcome Run() { return mOutcome = NarrowAll(); }
+  Outcome Run();
 
   // Reports now and then, with the steps made and the constraints waiting.
   using Teller = std::function<void(std::uint64_t steps, std::size_t waiting)>;
   void OnProgress(Teller teller) { mTeller = std::move(teller); }
 
   std::uint64_t Steps() const { return mSteps; }
-  bool CountStep();  // false at the limit: there is none left
+  bool CountStep();  // false when there is none left, and the outcome says why
+  Outcome WhyEnded() const { return mEnd; }
   const Limits& Bounds() const { return mLimits; }
 
   std::span<const int> ReadersOf(int variable) const;  // the constraints, as often as they name it
@@ -42,12 +44,12 @@ class Propagation {
   void Undo();
 
  private:
-  Outcome NarrowAll();
   void Connect();
   void Wake(int constraint);
   void WakeReaders(int except);
   bool IsShaved(int variable);
   void FailCycle();
+  Outcome LeaveOff(int constraint);
   Status Narrow(int constraint);
   Status Narrow(const Constraint& constraint);
   int Next();
@@ -55,6 +57,7 @@ class Propagation {
   Store& mStore;
   const Model& mModel;
   Limits mLimits;
+  Stop mStop;
   Relations mRelations;
   Functions mFunctions;
   AllDifferent mAllDifferent;
@@ -77,7 +80,7 @@ class Propagation {
   std::vector<int> mFinished;  // in the order in which they were
   std::vector<std::size_t> mMarks;
   std::uint64_t mSteps = 0;
-  Outcome mOutcome = Outcome::Settled;  // of the latest run
+  Outcome mEnd = Outcome::Settled;  // Settled: no limit was met
 };
 
 }  // namespace zornet

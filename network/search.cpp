@@ -41,14 +41,14 @@ Outcome Search::Look(std::uint64_t limit, const Solution& solution) {
       Pop();
       continue;
     }
-    if (!mPropagation.CountStep()) return Outcome::StepLimit;
+    if (!mPropagation.CountStep()) return mPropagation.WhyEnded();
     Mark();
     Choose(mFrames.back());
     const Outcome outcome = mPropagation.Run();
     if (outcome == Outcome::Settled && Visit(solution)) continue;
     if (outcome == Outcome::Contradiction) CountFailure();
     Retract();
-    if (outcome == Outcome::StepLimit) return outcome;
+    if (outcome != Outcome::Settled && outcome != Outcome::Contradiction) return outcome;
   }
   return Outcome::Settled;
 }

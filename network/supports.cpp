@@ -57,8 +57,12 @@ void Supports::Column::Keep(std::size_t place) {
   }
 }
 
-Supports::Supports(Store& store, Semantics& semantics, std::size_t budget)
-    : mStore(store), mSemantics(semantics), mBudget(budget), mColumnOfVariable(store.Model().Variables().size(), 0) {}
+Supports::Supports(Store& store, Semantics& semantics, std::size_t budget, Stop& stop)
+    : mStore(store),
+      mSemantics(semantics),
+      mBudget(budget),
+      mStop(stop),
+      mColumnOfVariable(store.Model().Variables().size(), 0) {}
 
 bool Supports::Narrow(const Constraint& constraint) {
   Prepare(constraint);
@@ -83,6 +87,7 @@ bool Supports::Narrow(const Constraint& constraint) {
     Apply(constraint);
     return true;
   }
+  if (mStop.WasAsked()) return false;
   if (isDriven || !std::isinf(beyond)) ExceedBudget(constraint, std::isinf(beyond) ? 0 : beyond);
   return false;
 }
@@ -176,14 +181,14 @@ double Supports::Combinations(const Constraint& constraint, std::size_t target) 
   return combinations;
 }
 
-// False when a listed target has more supports than can be listed.
+// False when a listed target has more supports than can be listed, or it is to end.
 bool Supports::Try(const Constraint& constraint, std::size_t target) {
   const bool none = Combinations(constraint, target) == 0;
   Start();
   if (none) return true;
   for (Column* column : mTried) Choose(*column, 0);
   do {
-    if (!TryOne(constraint, target)) return false;
+    if (mStop.IsAsked() || !TryOne(constraint, target)) return false;
   } while (!HasAll() && Advance());
   return true;
 }

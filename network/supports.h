@@ -10,15 +10,16 @@
 #include <vector>
 
 #include "network/semantics.h"
+#include "network/stop.h"
 #include "network/store.h"
 
 namespace zornet {
 
 class Supports {
  public:
-  Supports(Store& store, Semantics& semantics, std::size_t budget);
+  Supports(Store& store, Semantics& semantics, std::size_t budget, Stop& stop);
 
-  // False when the combinations are more than the budget or cannot be listed; then nothing has changed.
+  // False when the combinations are more than the budget, cannot be listed, or it is to end; then nothing has changed.
   bool Narrow(const Constraint& constraint);
   void ExceedBudget(const Constraint& constraint, double combinations);  // 0 where they were not counted
 
@@ -93,6 +94,7 @@ class Supports {
   Store& mStore;
   Semantics& mSemantics;
   std::size_t mBudget;
+  Stop& mStop;
   std::size_t mForward = 0;      // the position of the result, or behind all when there is none: a relation is posted
   std::size_t mCount = 0;        // of the columns in use
   std::vector<Column> mColumns;  // one for each different variable

@@ -20,6 +20,10 @@ std::string_view Describe(Outcome outcome) {
       return "step limit";
     case Outcome::Open:
       return "open";
+    case Outcome::TimeLimit:
+      return "time limit";
+    case Outcome::Stopped:
+      return "interrupted";
   }
   return "";
 }
@@ -158,7 +162,8 @@ class JsonReport : public Report {
   void AddLimits(Json& json, const LimitsByVariable& limits, int variable) const {
     const auto [first, last] = limits.equal_range(variable);
     for (auto at = first; at != last; ++at) {
-      Json limit{{"limit", NameOf(at->second.limit)}, {"most", at->second.most}};
+      Json limit{{"limit", NameOf(at->second.limit)}};
+      if (at->second.most != 0) limit["most"] = at->second.most;
       if (at->second.count != 0) limit["count"] = at->second.count;
       AddConstraint(limit, at->second.constraint);
       json["limits"].push_back(std::move(limit));

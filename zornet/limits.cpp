@@ -30,6 +30,10 @@ std::string_view NameOf(Limit limit) {
       return "narrowings";
     case Limit::Steps:
       return "steps";
+    case Limit::Time:
+      return "time";
+    case Limit::Stop:
+      return "interrupt";
   }
   return "";
 }
@@ -44,8 +48,25 @@ std::string Describe(const LimitMet& met, Sort sort) {
       return fmt::format("narrowed {} times in a row, and no further", met.most);
     case Limit::Steps:
       return fmt::format("the limit of {} steps came first", met.most);
+    case Limit::Time:
+      return "the time limit came first";
+    case Limit::Stop:
+      return "the run was interrupted first";
   }
   return "";
+}
+
+std::optional<Limit> EndOf(Outcome outcome) {
+  switch (outcome) {
+    case Outcome::StepLimit:
+      return Limit::Steps;
+    case Outcome::TimeLimit:
+      return Limit::Time;
+    case Outcome::Stopped:
+      return Limit::Stop;
+    default:
+      return std::nullopt;
+  }
 }
 
 LimitsByVariable LimitsOf(const Network& network) {
@@ -57,7 +78,7 @@ LimitsByVariable LimitsOf(const Network& network) {
 std::set<Limit> LimitsOf(const Network& network, Outcome outcome) {
   std::set<Limit> limits;
   for (const LimitMet& met : network.LimitsMet()) limits.insert(met.limit);
-  if (outcome == Outcome::StepLimit) limits.insert(Limit::Steps);
+  if (const auto end = EndOf(outcome)) limits.insert(*end);
   return limits;
 }
 

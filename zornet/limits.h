@@ -2,6 +2,7 @@
 #pragma once
 
 #include <map>
+#include <optional>
 #include <set>
 #include <string>
 #include <string_view>
@@ -14,6 +15,9 @@ std::string_view NameOf(Limit limit);
 
 // "480 texts exceed the 256 that a set holds"
 std::string Describe(const LimitMet& met, Sort sort);
+
+// The limit that ended a run, if one did.
+std::optional<Limit> EndOf(Outcome outcome);
 
 using LimitsByVariable = std::multimap<int, LimitMet>;
 LimitsByVariable LimitsOf(const Network& network);

@@ -34,7 +34,7 @@ enum ExitCode {
   kUsage = 2,
   kModelError = 3,
   kModuleError = 4,
-  kStepLimit = 5,
+  kLimit = 5,
   kOpen = 6,  // all is tried, but there may be more solutions
   kNoMemory = 7,
 };

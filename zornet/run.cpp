@@ -151,7 +151,9 @@ int OneRun::ExitCode() const {
     case Outcome::Contradiction:
       return kContradiction;
     case Outcome::StepLimit:
-      return kStepLimit;
+    case Outcome::TimeLimit:
+    case Outcome::Stopped:
+      return kLimit;
     case Outcome::Open:
       return kOpen;
   }

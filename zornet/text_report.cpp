@@ -15,6 +15,11 @@ std::string Counted(std::uint64_t count, std::string_view thing) {
   return fmt::format("{} {}{}", count, thing, count == 1 ? "" : "s");
 }
 
+std::string Ended(Limit limit) {
+  if (limit == Limit::Stop) return "interrupted";
+  return limit == Limit::Time ? "time limit reached" : "step limit reached";
+}
+
 constexpr std::size_t kMostNamed = 8;
 
 class TextReport : public Report {
@@ -154,7 +159,7 @@ void TextReport::Called(const RawCall& call) {
 std::string TextReport::Result(const Network& network, const Summary& summary) const {
   const auto& search = summary.search;
   const std::string solutions = search ? Counted(search->solutions, "solution") : "";
-  if (summary.outcome == Outcome::StepLimit) return "step limit reached" + (search ? " after " + solutions : "");
+  if (const auto end = EndOf(summary.outcome)) return Ended(*end) + (search ? " after " + solutions : "");
   if (const int failed = network.FailedConstraint(); failed != kNone) {
     return fmt::format("contradiction at {}: {} leaves nothing for {}", mNames.PlaceOfConstraint(failed),
                        mNames.OfConstraint(failed), mNames.OfVariable(network.FailedVariable()));
@@ -169,7 +174,7 @@ std::string TextReport::Result(const Network& network, const Summary& summary) c
 // A search that has tried all is sure in spite of them. The outcome itself names one.
 std::string TextReport::Limited(const Network& network, const Summary& summary) const {
   std::set<Limit> limits = LimitsOf(network, summary.outcome);
-  if (summary.outcome == Outcome::StepLimit) limits.erase(Limit::Steps);
+  if (const auto end = EndOf(summary.outcome)) limits.erase(*end);
   if (limits.empty() || (summary.search && summary.search->complete)) return "";
   std::string listed;
   for (const Limit limit : limits) listed += fmt::format("{}{}", listed.empty() ? "" : ", ", NameOf(limit));

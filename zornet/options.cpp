@@ -18,7 +18,8 @@ constexpr char kAbout[] =
 
 constexpr char kFooter[] =
     "Exit codes: 0 settled, 1 contradiction, 2 usage or file, 3 error in the model, 4 module not loadable,\n"
-    "5 step or time limit, 6 searched to the end but variables stay open, 7 out of memory.\n"
+    "5 step or time limit, 6 searched to the end but variables stay open, 7 out of memory,\n"
+    "130 SIGINT, 143 SIGTERM.\n"
     "The language of models and all else: man zornet.";
 
 // Digits alone: to the library a minus sign is part of an unsigned number, which then wraps.

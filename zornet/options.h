@@ -37,6 +37,7 @@ enum ExitCode {
   kLimit = 5,
   kOpen = 6,  // all is tried, but there may be more solutions
   kNoMemory = 7,
+  kSignal = 128,  // and its number
 };
 
 // Nothing when the program is to end with exitCode: help or version was asked for, or the command line is wrong.

@@ -46,6 +46,13 @@ Json Describe(const Domain& domain, Sort sort) {
   return json;
 }
 
+// The one value of a variable in a solution.
+Json ValueOf(const Domain& domain, Sort sort) {
+  if (IsText(sort)) return domain.Texts().front();
+  if (sort == Sort::Boolean) return domain.Lowest() != 0;
+  return domain.Lowest();
+}
+
 class JsonReport : public Report {
  public:
   JsonReport(const Source& source, const Places& places, const Model& model, std::ostream& results)
@@ -80,7 +87,9 @@ class JsonReport : public Report {
 
   void Solution(const Network& network, std::uint64_t number) override {
     Json values = Json::object();
-    for (const int variable : mModel.Wanted()) values[mNames.OfVariable(variable)] = network[variable].Print();
+    for (const int variable : mModel.Wanted())
+      values[mNames.OfVariable(variable)] =
+          ValueOf(network[variable], mModel.Variables()[static_cast<std::size_t>(variable)].sort);
     Tell({{"event", "solution"}, {"number", number}, {"values", std::move(values)}});
     mResults.flush();
   }

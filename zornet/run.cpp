@@ -114,8 +114,7 @@ void OneRun::EndWithoutReader() {
 
 // Nobody is told where nobody listens: text forms cost more than the narrowing itself.
 void OneRun::Solve() {
-  if (mOptions.trace || mOptions.json)
-    mNetwork.OnNarrowing([this](const Narrowing& narrowing) { mReport.Narrowed(narrowing); });
+  if (mOptions.trace) mNetwork.OnNarrowing([this](const Narrowing& narrowing) { mReport.Narrowed(narrowing); });
   const Interrupts interrupts;
   ProgressLine progress(isatty(STDERR_FILENO) != 0 && !mOptions.json);
   mNetwork.OnProgress([&](std::uint64_t steps, std::size_t waiting) {
@@ -194,7 +193,7 @@ int WriteParts(const Options& options, const Source& source, const Model& model)
 
 int Run(const Options& options) {
   ReportStyle style{WantsColour(options.colour, STDOUT_FILENO), WantsColour(options.colour, STDERR_FILENO),
-                    options.trace, options.quiet};
+                    options.quiet};
   const auto reportOn = [&](const Source& source, const Places& places, const Model& model) {
     return options.json ? MakeJsonReport(source, places, model, std::cout)
                         : MakeTextReport(source, places, model, style, std::cout, std::cerr);

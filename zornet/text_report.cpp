@@ -41,9 +41,7 @@ class TextReport : public Report {
     mRemarks << Paint(mStyle.remarkColour)(Style::Error, "zornet: error:") << ' ' << message << '\n';
   }
 
-  void Narrowed(const Narrowing& narrowing) override {
-    if (mStyle.trace) mResults << Line(narrowing) << '\n';
-  }
+  void Narrowed(const Narrowing& narrowing) override { mResults << Line(narrowing) << '\n'; }
 
   void Variables(const Network& network) override { Show(network, LimitsOf(network)); }
 

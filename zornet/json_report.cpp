@@ -179,8 +179,8 @@ class JsonReport : public Report {
     }
   }
 
-  // File names and broken models need not be UTF-8.
-  void Tell(const Json& json) { mResults << json.dump(-1, ' ', false, Json::error_handler_t::replace) << '\n'; }
+  // File names and broken models need not be UTF-8. In ASCII alone nothing acts on a terminal.
+  void Tell(const Json& json) { mResults << json.dump(-1, ' ', true, Json::error_handler_t::replace) << '\n'; }
 
   const Model& mModel;
   Names mNames;

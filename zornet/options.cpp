@@ -7,6 +7,10 @@
 #include <charconv>
 #include <chrono>
 #include <cmath>
+#include <iostream>
+#include <sstream>
+
+#include "zornet/render.h"
 
 namespace zornet {
 
@@ -110,7 +114,10 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   try {
     app.parse(argc, argv);
   } catch (const CLI::ParseError& error) {
-    exitCode = app.exit(error) == 0 ? kSettled : kUsage;
+    std::ostringstream told;
+    exitCode = app.exit(error, std::cout, told) == 0 ? kSettled : kUsage;
+    std::istringstream lines(told.str());
+    for (std::string line; std::getline(lines, line);) std::cerr << Harmless(line) << '\n';
     return std::nullopt;
   }
   if (seconds) SetTimeLimit(*seconds, options.limits);

@@ -38,7 +38,7 @@ class TextReport : public Report {
   }
 
   void Failure(const std::string& message) override {
-    mRemarks << Paint(mStyle.remarkColour)(Style::Error, "zornet: error:") << ' ' << message << '\n';
+    mRemarks << Paint(mStyle.remarkColour)(Style::Error, "zornet: error:") << ' ' << Harmless(message) << '\n';
   }
 
   void Narrowed(const Narrowing& narrowing) override { mResults << Line(narrowing) << '\n'; }

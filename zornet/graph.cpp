@@ -144,8 +144,8 @@ Drawing::Drawing(const Network& network, const Names& names, const Explanation* 
     : mNetwork(network),
       mModel(network.GetModel()),
       mNames(names),
-      mShown(mModel.Variables().size(), explanation == nullptr),
-      mDrawn(mModel.Constraints().size(), explanation == nullptr) {
+      mShown(mModel.Variables().size(), explanation == nullptr ? 1 : 0),
+      mDrawn(mModel.Constraints().size(), explanation == nullptr ? 1 : 0) {
   if (explanation != nullptr) Show(*explanation);
   for (std::size_t v = 0; v < mShown.size(); ++v) {
     if (mModel.Variables()[v].constant) mShown[v] = 0;

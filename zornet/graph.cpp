@@ -116,7 +116,7 @@ class Drawing {
  private:
   template <class... Arguments>
   void Add(fmt::format_string<Arguments...> format, Arguments&&... arguments) {
-    fmt::format_to(std::back_inserter(mText), format, std::forward<Arguments>(arguments)...);
+    mText += fmt::format(format, std::forward<Arguments>(arguments)...);
   }
 
   void Show(const Explanation& explanation);

@@ -257,9 +257,10 @@ inline int InsertExactValue(Str& z, Word w) {
 }
 inline int RemoveExactValue(Str& z, Word w) { return IsNil(z) || IsAny(z) || z.text != w.text ? 0 : ToNil(z); }
 
-// Text forms.
+// Text forms. A zero character ends a text in them.
+inline std::string Quoted(const std::string& text) { return std::string("\"") + text.c_str() + '"'; }
 inline std::string Print(const Str& v) {
-  return IsNil(v) ? "Nil" : IsAny(v) ? "Any" : IsMax(v) ? "Max" : IsMin(v) ? "Min" : '"' + v.text + '"';
+  return IsNil(v) ? "Nil" : IsAny(v) ? "Any" : IsMax(v) ? "Max" : IsMin(v) ? "Min" : Quoted(v.text);
 }
 // At most limit characters up to the delimiter, which is taken; a zero character hides the rest.
 inline std::string Line(std::string_view& in, std::size_t limit, char delimiter) {
@@ -277,7 +278,7 @@ inline Str Input(std::string_view& in) {
 }
 inline int CalcStringRepresentation(Str& z, Str x) { return Put(z, Text(Print(x))); }
 inline int CalcInverseStringRepresentation(Str z, Str& x) {
-  std::string_view in = z.text;
+  std::string_view in = z.text.c_str();
   return Put(x, Input(in));
 }
 

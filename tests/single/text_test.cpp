@@ -13,16 +13,11 @@ using namespace zor::test;
 TEST(SingleText, InputOfAnyBytes) {
   constexpr char kCharacters[] = "MMNAinaxyl\"\"\"\" \n\0\xff{,}12";
   std::mt19937 random(20);
-  std::vector<std::string> texts = {"Minimum",
-                                    "Any\n\"a\"",
-                                    "Nil",
-                                    "Ma\nx",
-                                    "max",
-                                    " \t\n\v\f\rMax",
-                                    "\"a\nc\"d",
-                                    "\" \"",
-                                    '"' + std::string(254, 'q') + '"',
-                                    '"' + std::string(255, 'q') + '"'};
+  // clang-format off
+  std::vector<std::string> texts = {
+      "Minimum", "Any\n\"a\"", "Nil", "Ma\nx", "max", " \t\n\v\f\rMax", "\"a\nc\"d", "\" \"",
+      '"' + std::string(254, 'q') + '"', '"' + std::string(255, 'q') + '"'};
+  // clang-format on
   for (int round = 0; round < 3000; ++round) {
     std::string text(1 + random() % 20, ' ');
     for (char& c : text) c = round % 7 == 0 ? static_cast<char>(random()) : kCharacters[random() % sizeof kCharacters];
@@ -43,15 +38,10 @@ TEST(SingleText, InputOfAnyBytes) {
 
 // A value that is filled from a stream keeps its text where none was stored; a new one has none.
 TEST(SingleText, Forms) {
-  for (const auto& [value, printed] :
-       std::initializer_list<std::pair<Str, std::string>>{{kNil, "Nil"},
-                                                          {kAny, "Any"},
-                                                          {kMin, "Min"},
-                                                          {kMax, "Max"},
-                                                          {"", "\"\""},
-                                                          {"ab", "\"ab\""},
-                                                          {"a\"b", "\"a\"b\""},
-                                                          {"z*255", '"' + std::string(255, 'z') + '"'}}) {
+  const std::pair<Str, std::string> forms[] = {
+      {"Nil", "Nil"}, {"Any", "Any"},   {"Min", "Min"},       {"Max", "Max"},
+      {"", "\"\""},   {"ab", "\"ab\""}, {"a\"b", "\"a\"b\""}, {"z*255", '"' + std::string(255, 'z') + '"'}};
+  for (const auto& [value, printed] : forms) {
     HeldSingle held(value), filled("old");
     std::ostringstream shown;
     shown << held.value;

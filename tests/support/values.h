@@ -127,6 +127,9 @@ struct Int {
 struct Word {
   using Held = struct HeldWord;
   std::string text;
+
+  Word(std::string held = "") : text(std::move(held)) {}    // NOLINT(google-explicit-constructor)
+  Word(const char* notation) : text(Unpacked(notation)) {}  // NOLINT(google-explicit-constructor)
   bool operator==(const Word&) const = default;
   friend std::ostream& operator<<(std::ostream& out, const Word& v) { return Show(out, kExact, v.text); }
 };
@@ -134,6 +137,11 @@ struct Word {
 using Value = std::variant<Str, Set, Int, Word>;
 inline std::ostream& operator<<(std::ostream& out, const Value& value) {
   return std::visit([&](const auto& v) -> std::ostream& { return out << v; }, value);
+}
+
+template <class Plain>
+std::vector<Value> ListOf(std::initializer_list<Plain> values) {
+  return {values.begin(), values.end()};
 }
 
 inline std::string ShownAs(const Value& value) {

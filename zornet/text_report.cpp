@@ -1,6 +1,7 @@
 #include <fmt/core.h>
 
 #include <algorithm>
+#include <span>
 
 #include "zornet/colour.h"
 #include "zornet/limits.h"
@@ -57,13 +58,13 @@ class TextReport : public Report {
 
  private:
   void Show(const Network& network, const LimitsByVariable& limits);
-  std::string ShownLimits(const LimitsByVariable& limits, int variable) const;
+  std::string LimitsAt(int variable, const LimitsByVariable& limits) const;
   std::string Line(const Narrowing& narrowing) const;
   std::string Place(int constraint) const;
   std::string Shown(const Domain& domain) const;
   std::string Result(const Network& network, const Summary& summary) const;
   std::string Limited(const Network& network, const Summary& summary) const;
-  std::string Listed(const std::vector<Var>& variables) const;
+  void TellOpen(const Network& network, const std::vector<Var>& variables);
 
   const Model& mModel;
   Names mNames;
@@ -83,22 +84,24 @@ std::string TextReport::Shown(const Domain& domain) const {
 
 void TextReport::Show(const Network& network, const LimitsByVariable& limits) {
   for (const int variable : mModel.Wanted()) {
-    mResults << mPaint(Style::Name, mNames.OfVariable(variable)) << " = " << Shown(network[variable])
-             << ShownLimits(limits, variable) << '\n';
+    mResults << mPaint(Style::Name, mNames.OfVariable(variable)) << " = " << Shown(network[variable]);
+    if (const std::string met = LimitsAt(variable, limits); !met.empty())
+      mResults << mPaint(Style::Faint, "  % " + met);
+    mResults << '\n';
   }
 }
 
 // One of each kind.
-std::string TextReport::ShownLimits(const LimitsByVariable& limits, int variable) const {
+std::string TextReport::LimitsAt(int variable, const LimitsByVariable& limits) const {
   std::string shown;
   std::set<Limit> kinds;
   const auto [first, last] = limits.equal_range(variable);
   for (auto at = first; at != last; ++at) {
     if (!kinds.insert(at->second.limit).second) continue;
-    shown += shown.empty() ? "  % " : "; ";
+    if (!shown.empty()) shown += "; ";
     shown += Describe(at->second, mModel.Variables()[static_cast<std::size_t>(variable)].sort);
   }
-  return shown.empty() ? shown : mPaint(Style::Faint, shown);
+  return shown;
 }
 
 // model.szn:12: str_concat(x, y, z)
@@ -179,22 +182,25 @@ std::string TextReport::Limited(const Network& network, const Summary& summary) 
   return fmt::format(" (limits met: {})", listed);
 }
 
-// By name, the first of many.
-std::string TextReport::Listed(const std::vector<Var>& variables) const {
+// Which variables stay open, the first of many by name, and what limits them.
+void TextReport::TellOpen(const Network& network, const std::vector<Var>& variables) {
   const std::size_t named = std::min(variables.size(), kMostNamed);
-  std::string listed;
-  for (std::size_t i = 0; i < named; ++i) listed += (i == 0 ? "" : ", ") + mNames.OfVariable(variables[i]);
-  if (named < variables.size()) listed += fmt::format(" and {} more", variables.size() - named);
-  return listed;
+  const LimitsByVariable limits = LimitsOf(network);
+  std::string names, lines;
+  for (const Var variable : std::span(variables).first(named)) {
+    names += (names.empty() ? "" : ", ") + mNames.OfVariable(variable);
+    if (const std::string met = LimitsAt(variable.index, limits); !met.empty())
+      lines += fmt::format("  {}: {}\n", mNames.OfVariable(variable), met);
+  }
+  if (named < variables.size()) names += fmt::format(" and {} more", variables.size() - named);
+  mRemarks << fmt::format("unknown: {} stay{} open\n{}", names, variables.size() == 1 ? "s" : "", lines);
 }
 
 void TextReport::Finish(const Network& network, const Summary& summary) {
   const auto& search = summary.search;
   if (search && search->complete) mResults << "==========\n";
   mResults.flush();
-  if (summary.outcome == Outcome::Open)
-    mRemarks << fmt::format("unknown: {} stay{} open\n", Listed(search->openVariables),
-                            search->openVariables.size() == 1 ? "s" : "");
+  if (summary.outcome == Outcome::Open) TellOpen(network, search->openVariables);
   if (mStyle.quiet) return;
   const Paint paint(mStyle.remarkColour);
   const OperationCount total = Total(network.Counts());

@@ -53,7 +53,7 @@ int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const ReadModel read = Read(source, diagnostics);
   std::ostringstream objects, results, remarks;
   const auto json = MakeJsonReport(source, read.places, read.model, objects);
-  const auto text = MakeTextReport(source, read.places, read.model, {true, true, true, false}, results, remarks);
+  const auto text = MakeTextReport(source, read.places, read.model, {true, true, false}, results, remarks);
   if (diagnostics.Failed()) {
     for (Report* report : {json.get(), text.get()}) report->Errors(source, diagnostics);
   } else {

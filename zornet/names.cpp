@@ -1,5 +1,6 @@
 #include <fmt/core.h>
 
+#include "zornet/render.h"
 #include "zornet/report.h"
 
 namespace zornet {
@@ -34,7 +35,7 @@ std::string Names::Written(Extent extent) const {
     const bool blank = !quoted && kBlanks.find(c) != std::string_view::npos;
     if (!comment && !(blank && written.ends_with(' '))) written += blank ? ' ' : c;
   }
-  return written;
+  return Harmless(written);
 }
 
 std::string Names::OfConstraint(int constraint) const {
@@ -61,11 +62,12 @@ std::size_t Names::LineOfVariable(int variable) const {
 }
 
 std::string Names::PlaceOfConstraint(int constraint) const {
-  return constraint == kNone ? mSource.Name() : fmt::format("{}:{}", mSource.Name(), LineOfConstraint(constraint));
+  const std::string file = Harmless(mSource.Name());
+  return constraint == kNone ? file : fmt::format("{}:{}", file, LineOfConstraint(constraint));
 }
 
 std::string Names::PlaceOfVariable(int variable) const {
-  return fmt::format("{}:{}", mSource.Name(), LineOfVariable(variable));
+  return fmt::format("{}:{}", Harmless(mSource.Name()), LineOfVariable(variable));
 }
 
 }  // namespace zornet

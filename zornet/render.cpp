@@ -23,17 +23,19 @@ std::vector<std::string_view> Split(std::string_view text) {
   return characters;
 }
 
-// Control characters, also those of eight bits, and stray bytes could act on a terminal.
-std::string_view Harmless(std::string_view character) {
-  const char c = character.front();
-  const bool good = character.size() > 1 ? character >= "\xC2\xA0" : (c >= ' ' && c <= '~') || c == '\t';
-  return good ? character : "?";
+bool IsPlain(char c) { return (c >= ' ' && c <= '~') || c == '\t'; }
+
+// What turns the direction of text, or ends a line.
+bool IsFormat(std::string_view character) {
+  const auto isBetween = [&](std::string_view first, std::string_view last) {
+    return character >= first && character <= last;
+  };
+  return isBetween("\u200E", "\u200F") || isBetween("\u2028", "\u202E") || isBetween("\u2066", "\u2069");
 }
 
-std::string Harmless(const std::string& text) {
-  std::string harmless;
-  for (const std::string_view character : Split(text)) harmless += Harmless(character);
-  return harmless;
+std::string_view HarmlessCharacter(std::string_view character) {
+  const bool good = character.size() > 1 ? character >= "\u00A0" && !IsFormat(character) : IsPlain(character.front());
+  return good ? character : "?";
 }
 
 std::string Caret(std::size_t characters) {
@@ -58,7 +60,7 @@ std::string MarkedLine(std::string_view line, std::size_t mark, std::size_t mark
   std::string shown(begin != 0 || first != 0 ? kCut : "");
   std::string below(shown.size(), ' ');
   for (std::size_t i = first; i < last; ++i) {
-    shown += Harmless(characters[i]);
+    shown += HarmlessCharacter(characters[i]);
     if (i < from) below += characters[i] == "\t" ? '\t' : ' ';
   }
   if (end != line.size() || last != size) shown += kCut;
@@ -71,13 +73,20 @@ std::string Told(const Source& source, const Diagnostic& diagnostic, const Locat
   const Extent marked{diagnostic.extent.begin, std::min(diagnostic.extent.length, kReach)};
   const Paint paint(colour);
   return fmt::format(
-      "{} {} {}\n{}\n", paint(Style::Bold, fmt::format("{}:{}:{}:", source.Name(), at.line, at.column)),
+      "{} {} {}\n{}\n", paint(Style::Bold, fmt::format("{}:{}:{}:", Harmless(source.Name()), at.line, at.column)),
       error ? paint(Style::Error, "error:") : paint(Style::Note, "note:"),
       paint(error ? Style::Bold : Style::Plain, Harmless(diagnostic.message)),
       MarkedLine(source.Line(at.line), marked.begin - source.LineBegin(at.line), MarkedLength(source, marked), paint));
 }
 
 }  // namespace
+
+std::string Harmless(std::string_view text) {
+  if (std::all_of(text.begin(), text.end(), IsPlain)) return std::string(text);
+  std::string harmless;
+  for (const std::string_view character : Split(text)) harmless += HarmlessCharacter(character);
+  return harmless;
+}
 
 std::size_t MarkedLength(const Source& source, Extent extent) {
   return std::max<std::size_t>(CountCharacters(source.InLine(extent)), 1);
@@ -89,7 +98,7 @@ std::string Render(const Source& source, const Diagnostics& diagnostics, bool co
   for (const Diagnostic& diagnostic : diagnostics.All())
     text += Told(source, diagnostic, locate(diagnostic.extent.begin), colour);
   if (diagnostics.Stopped()) {
-    text += fmt::format("{}: stopped after {} errors\n", source.Name(), Diagnostics::kErrorLimit);
+    text += fmt::format("{}: stopped after {} errors\n", Harmless(source.Name()), Diagnostics::kErrorLimit);
   }
   return text;
 }

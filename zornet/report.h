@@ -51,7 +51,6 @@ OperationCount Total(const std::vector<OperationCount>& counts);
 struct ReportStyle {
   bool colour = false;        // in results
   bool remarkColour = false;  // in remarks
-  bool trace = false;         // tell each narrowing
   bool quiet = false;         // no summary
 };
 std::unique_ptr<Report> MakeTextReport(const Source& source, const Places& places, const Model& model,

@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cerrno>
 #include <chrono>
+#include <csignal>
 #include <cstring>
 #include <filesystem>
 #include <fstream>
@@ -16,6 +17,7 @@
 #include "language/reader.h"
 #include "zornet/colour.h"
 #include "zornet/graph.h"
+#include "zornet/interrupt.h"
 #include "zornet/picture.h"
 #include "zornet/progress.h"
 #include "zornet/raw.h"
@@ -65,6 +67,7 @@ class OneRun {
  private:
   void FindExplained();
   void Solve();
+  static void EndWithoutReader();
   void Tell();
   void WritePictures() const;
   int ExitCode() const;
@@ -102,12 +105,22 @@ void OneRun::FindExplained() {
   }
 }
 
+// As a write would, also while there is nothing to write. Where the signal is ignored the flag is left.
+void OneRun::EndWithoutReader() {
+  const bool isGone = IsReaderGone();
+  if (isGone) std::raise(SIGPIPE);
+  if (isGone || !std::cout.good()) Interrupts::Raise();
+}
+
 // Nobody is told where nobody listens: text forms cost more than the narrowing itself.
 void OneRun::Solve() {
-  if (mOptions.trace || mOptions.json)
-    mNetwork.OnNarrowing([this](const Narrowing& narrowing) { mReport.Narrowed(narrowing); });
+  if (mOptions.trace) mNetwork.OnNarrowing([this](const Narrowing& narrowing) { mReport.Narrowed(narrowing); });
+  const Interrupts interrupts;
   ProgressLine progress(isatty(STDERR_FILENO) != 0 && !mOptions.json);
-  mNetwork.OnProgress([&](std::uint64_t steps, std::size_t waiting) { progress.Show(steps, waiting); });
+  mNetwork.OnProgress([&](std::uint64_t steps, std::size_t waiting) {
+    progress.Show(steps, waiting);
+    EndWithoutReader();
+  });
   mSummary.outcome = mNetwork.Narrow();
   if (mOptions.solutions != 0) {
     std::uint64_t solutions = 0;
@@ -122,6 +135,7 @@ void OneRun::Solve() {
 
 void OneRun::Tell() {
   if (!mSummary.search) mReport.Variables(mNetwork);
+  if (mSummary.outcome == Outcome::Stopped) return mReport.Finish(mNetwork, mSummary);
   for (const Var variable : mExplained) {
     const Explanation explanation = mNetwork.Explain(variable);
     mReport.Explain(mNetwork, variable, explanation);
@@ -151,7 +165,10 @@ int OneRun::ExitCode() const {
     case Outcome::Contradiction:
       return kContradiction;
     case Outcome::StepLimit:
-      return kStepLimit;
+    case Outcome::TimeLimit:
+      return kLimit;
+    case Outcome::Stopped:
+      return Interrupts::Signal() != 0 ? kSignal + Interrupts::Signal() : kUsage;
     case Outcome::Open:
       return kOpen;
   }
@@ -176,7 +193,7 @@ int WriteParts(const Options& options, const Source& source, const Model& model)
 
 int Run(const Options& options) {
   ReportStyle style{WantsColour(options.colour, STDOUT_FILENO), WantsColour(options.colour, STDERR_FILENO),
-                    options.trace, options.quiet};
+                    options.quiet};
   const auto reportOn = [&](const Source& source, const Places& places, const Model& model) {
     return options.json ? MakeJsonReport(source, places, model, std::cout)
                         : MakeTextReport(source, places, model, style, std::cout, std::cerr);
@@ -194,7 +211,9 @@ int Run(const Options& options) {
       return kModelError;
     }
     if (options.split != 0) return WriteParts(options, source, read.model);
-    Network network(std::move(read.model), options.limits, options.modulePaths);
+    Limits limits = options.limits;
+    limits.stop = &Interrupts::Flag();
+    Network network(std::move(read.model), limits, options.modulePaths);
     const Names names(source, read.places, network.GetModel());
     const auto report = reportOn(source, read.places, network.GetModel());
     return OneRun(options, network, names, *report).Go();

@@ -9,7 +9,7 @@
 namespace {
 
 std::string Told(const std::string& model) {
-  const zornet::Source source("", model);
+  zornet::Source source("", model);
   zornet::Diagnostics diagnostics;
   zornet::Read(source, diagnostics);
   std::string text = zornet::Render(source, diagnostics, false);
@@ -42,7 +42,7 @@ TEST(Reader, StopsAfterTwentyErrors) {
   std::string model;
   for (int i = 0; i < 20; ++i) model += "nonsense;\n";
   const std::string all = Told(model), told = Told(model + "output x;");
-  EXPECT_TRUE(all.ends_with("20:1: error: expected 'var', 'constraint' or 'output'\nnonsense;\n^~~~~~~~\n"));
+  EXPECT_TRUE(all.ends_with("20:1: error: expected 'var', 'set', 'array', 'constraint', 'output' or 'include'\nnonsense;\n^~~~~~~~\n"));
   EXPECT_EQ(told, all + " stopped after 20 errors\n");
 }
 

@@ -42,6 +42,8 @@ std::string ReadText(std::istream& in) {
     text.resize(size + kMegabyte);
     size += static_cast<std::size_t>(in.read(text.data() + size, kMegabyte).gcount());
   }
+  if (text.find('\0') != std::string::npos)
+    throw std::runtime_error("is no text: it is binary, or in UTF-16 and not UTF-8");
   return text;
 }
 

@@ -82,9 +82,24 @@ Token Lexer::Next() {
 }
 
 void Lexer::SkipBlanks() {
-  while (mNext < mText.size() && (IsBlank(At(0)) || At(0) == '%')) {
-    mNext = At(0) == '%' ? std::min(mText.find('\n', mNext), mText.size()) : mNext + 1;
+  while (mNext < mText.size()) {
+    if (IsBlank(At(0))) {
+      ++mNext;
+    } else if (!SkipsComment()) {
+      return;
+    }
   }
+}
+
+// What other languages begin comments with is told once, and skipped as they would.
+bool Lexer::SkipsComment() {
+  const bool block = At(0) == '/' && At(1) == '*', line = At(0) == '#' || (At(0) == '/' && At(1) == '/');
+  if (At(0) != '%' && !block && !line) return false;
+  if (At(0) != '%' && !std::exchange(mToldComment, true))
+    mDiagnostics.Error(Here(At(0) == '#' ? 1 : 2), "a comment begins with '%' and ends with its line");
+  const std::size_t end = block ? mText.find("*/", mNext + 2) : mText.find('\n', mNext);
+  mNext = end == std::string_view::npos ? mText.size() : end + (block ? 2 : 0);
+  return true;
 }
 
 Token Lexer::Make(Token::Type type, std::size_t length) {
@@ -143,8 +158,13 @@ void Lexer::CheckEscapes(std::string_view inside) {
   }
 }
 
+// Letters outside ASCII come as one word.
 Token Lexer::NextBroken() {
-  Token token = Make(Token::Broken, CharacterLength(mText.substr(mNext)));
+  const std::string_view rest = mText.substr(mNext);
+  std::size_t length = 0;
+  while (length < rest.size() && CharacterLength(rest.substr(length)) > 1)
+    length += CharacterLength(rest.substr(length));
+  const Token token = Make(Token::Broken, std::max<std::size_t>(length, 1));
   mDiagnostics.Error(token.extent, fmt::format("{} has no meaning here", NameOf(token.text)));
   return token;
 }

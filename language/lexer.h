@@ -37,6 +37,7 @@ class Lexer {
 
  private:
   void SkipBlanks();
+  bool SkipsComment();
   Token Make(Token::Type type, std::size_t length);
   Token NextName();
   Token NextNumber();
@@ -51,6 +52,7 @@ class Lexer {
   const std::string_view mText;
   Diagnostics& mDiagnostics;
   std::size_t mNext = 0;
+  bool mToldComment = false;
 };
 
 }  // namespace zornet

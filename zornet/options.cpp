@@ -3,7 +3,11 @@
 #include <fmt/core.h>
 
 #include <CLI/CLI.hpp>
+#include <algorithm>
 #include <charconv>
+#include <iostream>
+
+#include "language/spelling.h"
 
 namespace zornet {
 
@@ -28,6 +32,19 @@ CLI::Validator WholeFrom(std::uint64_t least) {
     return good ? std::string() : fmt::format("expected a whole number from {} on, not '{}'", least, text);
   };
   return {check, ""};
+}
+
+// What is no option and no file.
+std::string RefuseExtra(const CLI::App& app) {
+  const std::vector<std::string> extras = app.remaining();
+  const auto option =
+      std::find_if(extras.begin(), extras.end(), [](const std::string& extra) { return extra.starts_with('-'); });
+  if (option == extras.end()) return fmt::format("one model at a time, not '{}' too", extras.front());
+  std::vector<std::string> names;
+  for (const CLI::Option* known : app.get_options()) names.push_back(known->get_name());
+  const std::vector<std::string_view> views(names.begin(), names.end());
+  const std::string word = option->substr(0, option->find('='));
+  return fmt::format("there is no option '{}'{}", word, Suggestion(word, views));
 }
 
 }  // namespace
@@ -77,6 +94,10 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   app.add_flag("-q,--quiet", options.quiet, "No summary at the end");
   try {
     app.parse(argc, argv);
+  } catch (const CLI::ExtrasError&) {
+    std::cerr << "zornet: error: " << RefuseExtra(app) << '\n';
+    exitCode = kUsage;
+    return std::nullopt;
   } catch (const CLI::ParseError& error) {
     exitCode = app.exit(error) == 0 ? kSettled : kUsage;
     return std::nullopt;

@@ -14,6 +14,7 @@
 #include <stdexcept>
 
 #include "language/reader.h"
+#include "language/spelling.h"
 #include "zornet/colour.h"
 #include "zornet/graph.h"
 #include "zornet/picture.h"
@@ -51,6 +52,7 @@ class OneRun {
 
  private:
   void FindExplained();
+  std::string SuggestVariable(const std::string& name) const;
   void Solve();
   void Tell();
   void WritePictures() const;
@@ -84,9 +86,18 @@ void OneRun::FindExplained() {
     const auto found = std::find_if(variables.begin(), variables.end(),
                                     [&](const Variable& variable) { return variable.name == name; });
     if (name.empty() || found == variables.end())
-      throw UsageError(fmt::format("--explain: there is no variable '{}'", name));
+      throw UsageError(fmt::format("--explain: there is no variable '{}'{}", name, SuggestVariable(name)));
     mExplained.push_back({static_cast<int>(found - variables.begin())});
   }
+}
+
+std::string OneRun::SuggestVariable(const std::string& name) const {
+  std::vector<std::string_view> names;
+  for (const Variable& variable : mNetwork.GetModel().Variables()) {
+    if (variable.name.starts_with(name + "[")) return fmt::format("; did you mean '{}'?", variable.name);
+    if (!variable.constant) names.push_back(variable.name);
+  }
+  return Suggestion(name, names);
 }
 
 // Nobody is told where nobody listens: text forms cost more than the narrowing itself.

@@ -123,6 +123,8 @@ class Resolver {
   bool AddRows(const Kind& kind, std::size_t place, const Word& word);
   void RefuseExpression(const Kind& kind, std::span<const Word> arguments, const ExpressionError& error);
   bool Refuse(const Kind& kind, std::size_t place, const Word& word, std::string_view is);
+  void TellPlace(const Token& name, const Named& named);
+  std::string Written(const Word& name) const;
   const Kind* FindKindFor(const ConstraintSyntax& constraint);
   int VariableFor(const Kind& kind, std::size_t place, const Word& word);
   int VariableOf(const Kind& kind, std::size_t place, const Word& word);
@@ -236,8 +238,8 @@ bool Resolver::DeclareConstants(const DeclarationSyntax& declaration, Named& nam
   if (!Collect(mSyntax.Members(declaration.value), MemberType(declaration.type.sort), all)) return false;
   const std::int64_t size = named.last - named.first + 1;
   if (static_cast<std::uint64_t>(size) == declaration.value.count) return true;
-  mDiagnostics.Error(declaration.valueExtent, fmt::format("the array has {} elements, and here are {} constants", size,
-                                                          declaration.value.count));
+  mDiagnostics.Error(declaration.valueExtent,
+                     fmt::format("the array has {} elements, not {}", size, declaration.value.count));
   return false;
 }
 
@@ -437,7 +439,7 @@ bool Resolver::AddRows(const Kind& kind, std::size_t place, const Word& word) {
     good = false;
   }
   mArguments.emplace_back(std::move(rows));
-  return good;
+  return good && !mDiagnostics.Failed();  // after an error they may be none that a model can hold
 }
 
 void Resolver::RefuseExpression(const Kind& kind, std::span<const Word> arguments, const ExpressionError& error) {
@@ -453,11 +455,20 @@ void Resolver::RefuseExpression(const Kind& kind, std::span<const Word> argument
 // Answers false.
 bool Resolver::Refuse(const Kind& kind, std::size_t place, const Word& word, std::string_view is) {
   const bool named = word.type == Word::Name || word.type == Word::Element;
-  const std::string what = named ? fmt::format("'{}'", word.token.text) : "this";
-  mDiagnostics.Error(word.token.extent, fmt::format("{} takes {} for {}, and {} is {}", kind.name,
-                                                    Describe(kind.takes[place]), kind.roles[place], what, is));
-  if (named) mDiagnostics.Note(mNames.at(word.token.text).place, fmt::format("'{}' is declared here", word.token.text));
+  mDiagnostics.Error(word.token.extent,
+                     fmt::format("{} takes {} for {}, and {} is {}", kind.name, Describe(kind.takes[place]),
+                                 kind.roles[place], named ? Written(word) : "this", is));
+  if (named) TellPlace(word.token, mNames.at(word.token.text));
   return false;
+}
+
+void Resolver::TellPlace(const Token& name, const Named& named) {
+  mDiagnostics.Note(named.place, fmt::format("'{}' is declared here", name.text));
+}
+
+std::string Resolver::Written(const Word& name) const {
+  if (name.type == Word::Name) return fmt::format("'{}'", name.token.text);
+  return fmt::format("'{}[{}]'", name.token.text, mSyntax.Members(name.members).front().token.number);
 }
 
 // Null when there is no constraint of that name, or when it takes another number of arguments.
@@ -512,17 +523,18 @@ int Resolver::ElementOf(const Word& word) {
   const Named* const array = Find(word.token);
   if (array == nullptr) return kUnknown;
   const Token& index = mSyntax.Members(word.members).front().token;
+  const bool within = array->first <= index.number && index.number <= array->last;
+  if (array->what == DeclarationSyntax::Variables && within)
+    return array->index + static_cast<int>(index.number - array->first);
   if (!array->IsArray()) {
     mDiagnostics.Error(word.token.extent, fmt::format("'{}' is no array", word.token.text));
-  } else if (index.number < array->first || index.number > array->last) {
+  } else if (!within) {
     mDiagnostics.Error(index.extent,
                        fmt::format("'{}' has the elements {} to {}", word.token.text, array->first, array->last));
-  } else if (array->what == DeclarationSyntax::Constants) {
-    mDiagnostics.Error(word.token.extent, fmt::format("'{}' has no variables", word.token.text));
   } else {
-    return array->index + static_cast<int>(index.number - array->first);
+    mDiagnostics.Error(word.token.extent, fmt::format("{} is a constant, no variable", Written(word)));
   }
-  mDiagnostics.Note(array->place, fmt::format("'{}' is declared here", word.token.text));
+  TellPlace(word.token, *array);
   return kUnknown;
 }
 
@@ -550,12 +562,13 @@ void Resolver::AddOutput(const Word& word) {
   }
   const Named* const named = Find(word.token);
   if (named == nullptr) return;
-  if (named->what == DeclarationSyntax::Set || named->what == DeclarationSyntax::Constants) {
-    mDiagnostics.Error(word.token.extent, fmt::format("'{}' has no variables", word.token.text));
-    mDiagnostics.Note(named->place, fmt::format("'{}' is declared here", word.token.text));
+  if (named->index != kUnknown && named->what != DeclarationSyntax::Set) {
+    for (std::int64_t i = 0; i <= named->last - named->first; ++i) mModel.Want({named->index + static_cast<int>(i)});
     return;
   }
-  for (std::int64_t i = 0; i <= named->last - named->first; ++i) mModel.Want({named->index + static_cast<int>(i)});
+  const std::string_view is = named->IsArray() ? "an array of constants" : "a set";
+  mDiagnostics.Error(word.token.extent, fmt::format("{} is {}, no variable", Written(word), is));
+  TellPlace(word.token, *named);
 }
 
 const Named* Resolver::Find(const Token& name) {

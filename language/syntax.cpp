@@ -320,12 +320,13 @@ Word Parser::Member() {
 }
 
 Word Parser::NameOrElement() {
-  const Token name = Take();
+  Token name = Take();
   if (!mToken.Is("[")) return {Word::Name, name};
   Take();
   if (mToken.type != Token::Number) Fail("the index, an integer");
   const Range index = Keep({Constant()});
   Expect("]", "behind the index");
+  name.extent = Join(name.extent, mLast);
   return {Word::Element, name, index};
 }
 

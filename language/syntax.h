@@ -28,7 +28,7 @@ struct Word {
   enum Type { Name, Text, Number, Truth, Element, List, Rows };
 
   Type type = Name;
-  Token token;         // of an Element the name of its array; of a List or Rows no more than the extent
+  Token token;  // of an Element the name of its array and the extent of all; of a List or Rows no more than the extent
   Range members = {};  // of an Element its index, of a List what it holds, of Rows lists
 };
 

@@ -5,7 +5,6 @@
 #include <CLI/CLI.hpp>
 #include <algorithm>
 #include <charconv>
-#include <iostream>
 
 #include "language/spelling.h"
 
@@ -38,7 +37,7 @@ CLI::Validator WholeFrom(std::uint64_t least) {
 std::string RefuseExtra(const CLI::App& app) {
   const std::vector<std::string> extras = app.remaining();
   const auto option =
-      std::find_if(extras.begin(), extras.end(), [](const std::string& extra) { return extra.starts_with('-'); });
+      std::find_if(extras.begin(), extras.end(), [](const auto& word) { return word.starts_with('-'); });
   if (option == extras.end()) return fmt::format("one model at a time, not '{}' too", extras.front());
   std::vector<std::string> names;
   for (const CLI::Option* known : app.get_options()) names.push_back(known->get_name());
@@ -47,12 +46,19 @@ std::string RefuseExtra(const CLI::App& app) {
   return fmt::format("there is no option '{}'{}", word, Suggestion(word, views));
 }
 
+std::string Failure(const CLI::App* app, const CLI::Error& error) {
+  const bool extra = error.get_exit_code() == static_cast<int>(CLI::ExitCodes::ExtrasError);
+  if (!extra) return CLI::FailureMessage::simple(app, error);
+  return RefuseExtra(*app) + "\nRun with --help for more information.\n";
+}
+
 }  // namespace
 
 std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   Options options;
   CLI::App app(kAbout, "zornet");
   app.footer(kFooter);
+  app.failure_message(Failure);
   app.set_version_flag("--version", "zornet " ZORNET_VERSION);
   app.add_option("FILE", options.file, "The model (*.szn); - for standard input")->required();
   auto* solutions =
@@ -94,10 +100,6 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   app.add_flag("-q,--quiet", options.quiet, "No summary at the end");
   try {
     app.parse(argc, argv);
-  } catch (const CLI::ExtrasError&) {
-    std::cerr << "zornet: error: " << RefuseExtra(app) << '\n';
-    exitCode = kUsage;
-    return std::nullopt;
   } catch (const CLI::ParseError& error) {
     exitCode = app.exit(error) == 0 ? kSettled : kUsage;
     return std::nullopt;

@@ -48,7 +48,7 @@ void CheckObjects(std::istringstream lines) {
 
 // With a listener or without, the outcome is the same.
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  const Source source("fuzz.szn", std::string(data, data + size));
+  Source source("fuzz.szn", std::string(data, data + size));
   Diagnostics diagnostics;
   const ReadModel read = Read(source, diagnostics);
   std::ostringstream objects, results, remarks;

@@ -63,7 +63,7 @@ class JsonReport : public Report {
     for (const Diagnostic& diagnostic : diagnostics.All()) {
       const Location at = locate(diagnostic.extent.begin);
       Tell({{"event", diagnostic.severity == Diagnostic::Error ? "error" : "note"},
-            {"file", source.Name()},
+            {"file", source.NameAt(diagnostic.extent.begin)},
             {"line", at.line},
             {"column", at.column},
             {"length", MarkedLength(source, diagnostic.extent)},

@@ -10,6 +10,7 @@
 #include <iostream>
 #include <sstream>
 
+#include "language/spelling.h"
 #include "zornet/render.h"
 
 namespace zornet {
@@ -62,6 +63,25 @@ void SetTimeLimit(double seconds, Limits& limits) {
       std::chrono::steady_clock::now() + std::chrono::duration_cast<std::chrono::steady_clock::duration>(limit);
 }
 
+// What is no option and no file.
+std::string RefuseExtra(const CLI::App& app) {
+  const std::vector<std::string> extras = app.remaining();
+  const auto option =
+      std::find_if(extras.begin(), extras.end(), [](const auto& word) { return word.starts_with('-'); });
+  if (option == extras.end()) return fmt::format("one model at a time, not '{}' too", extras.front());
+  std::vector<std::string> names;
+  for (const CLI::Option* known : app.get_options()) names.push_back(known->get_name());
+  const std::vector<std::string_view> views(names.begin(), names.end());
+  const std::string word = option->substr(0, option->find('='));
+  return fmt::format("there is no option '{}'{}", word, Suggestion(word, views));
+}
+
+std::string Failure(const CLI::App* app, const CLI::Error& error) {
+  const bool extra = error.get_exit_code() == static_cast<int>(CLI::ExitCodes::ExtrasError);
+  if (!extra) return CLI::FailureMessage::simple(app, error);
+  return RefuseExtra(*app) + "\nRun with --help for more information.\n";
+}
+
 }  // namespace
 
 std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
@@ -69,6 +89,7 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   std::optional<double> seconds;
   CLI::App app(kAbout, "zornet");
   app.footer(kFooter);
+  app.failure_message(Failure);
   app.set_version_flag("--version", "zornet " ZORNET_VERSION);
   app.add_option("FILE", options.file, "The model (*.szn); - for standard input")->required();
   auto* solutions =

@@ -38,16 +38,20 @@ std::string_view HarmlessCharacter(std::string_view character) {
   return good ? character : "?";
 }
 
-std::string Caret(std::size_t characters) {
-  std::string caret(characters, '~');
+std::string Caret(std::size_t cells) {
+  std::string caret(cells, '~');
   caret.front() = '^';
   return caret;
+}
+
+std::string Blank(std::string_view character) {
+  return character == "\t" ? "\t" : std::string(CountCells(character), ' ');
 }
 
 // What is shown of a line is cut out of this many bytes on each side of the mark's begin.
 constexpr std::size_t kReach = kWindow * kLongestCharacter;
 
-// The line and below it the mark, of so many characters from that byte on. A tab stays one in the blanks ahead of it.
+// The line and below it the mark, of so many cells from that byte on. A tab stays one in the blanks ahead of it.
 std::string MarkedLine(std::string_view line, std::size_t mark, std::size_t marked, const Paint& paint) {
   const std::size_t at = std::min(mark, line.size()), begin = at - std::min(at, kReach);
   const std::size_t end = std::min(at + kReach, line.size());
@@ -59,24 +63,31 @@ std::string MarkedLine(std::string_view line, std::size_t mark, std::size_t mark
   const std::size_t last = std::min(first + kWindow, size);
   std::string shown(begin != 0 || first != 0 ? kCut : "");
   std::string below(shown.size(), ' ');
+  std::size_t room = 0;
   for (std::size_t i = first; i < last; ++i) {
     shown += HarmlessCharacter(characters[i]);
-    if (i < from) below += characters[i] == "\t" ? '\t' : ' ';
+    if (i < from) {
+      below += Blank(characters[i]);
+    } else {
+      room += CountCells(characters[i]);
+    }
   }
   if (end != line.size() || last != size) shown += kCut;
-  const std::size_t room = std::max<std::size_t>(last - std::min(from, last), 1);
-  return fmt::format("{}\n{}{}", shown, below, paint(Style::Caret, Caret(std::min(marked, room))));
+  return fmt::format("{}\n{}{}", shown, below,
+                     paint(Style::Caret, Caret(std::max<std::size_t>(std::min(marked, room), 1))));
 }
 
 std::string Told(const Source& source, const Diagnostic& diagnostic, const Location& at, bool colour) {
   const bool error = diagnostic.severity == Diagnostic::Error;
   const Extent marked{diagnostic.extent.begin, std::min(diagnostic.extent.length, kReach)};
+  const Extent line = source.LineAt(marked.begin);
   const Paint paint(colour);
-  return fmt::format(
-      "{} {} {}\n{}\n", paint(Style::Bold, fmt::format("{}:{}:{}:", Harmless(source.Name()), at.line, at.column)),
-      error ? paint(Style::Error, "error:") : paint(Style::Note, "note:"),
-      paint(error ? Style::Bold : Style::Plain, Harmless(diagnostic.message)),
-      MarkedLine(source.Line(at.line), marked.begin - source.LineBegin(at.line), MarkedLength(source, marked), paint));
+  return fmt::format("{} {} {}\n{}\n",
+                     paint(Style::Bold, fmt::format("{}:{}:{}:", Harmless(source.NameAt(diagnostic.extent.begin)),
+                                                    at.line, at.column)),
+                     error ? paint(Style::Error, "error:") : paint(Style::Note, "note:"),
+                     paint(error ? Style::Bold : Style::Plain, Harmless(diagnostic.message)),
+                     MarkedLine(source.Text(line), marked.begin - line.begin, MarkedLength(source, marked), paint));
 }
 
 }  // namespace
@@ -89,7 +100,7 @@ std::string Harmless(std::string_view text) {
 }
 
 std::size_t MarkedLength(const Source& source, Extent extent) {
-  return std::max<std::size_t>(CountCharacters(source.InLine(extent)), 1);
+  return std::max<std::size_t>(CountCells(source.InLine(extent)), 1);
 }
 
 std::string Render(const Source& source, const Diagnostics& diagnostics, bool colour) {

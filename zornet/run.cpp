@@ -15,6 +15,7 @@
 #include <stdexcept>
 
 #include "language/reader.h"
+#include "language/spelling.h"
 #include "zornet/colour.h"
 #include "zornet/graph.h"
 #include "zornet/interrupt.h"
@@ -32,29 +33,16 @@ struct UsageError : std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
-constexpr std::size_t kMegabyte = 1 << 20, kMostMegabytes = 256;  // a model is no larger
-
-// In pieces, since some files have no end.
-std::string ReadAll(std::istream& in, const std::string& name) {
-  std::string text;
-  for (std::size_t size = 0; in; text.resize(size)) {
-    if (size > kMostMegabytes * kMegabyte)
-      throw UsageError(fmt::format("{}: is larger than {} MB", name, kMostMegabytes));
-    text.resize(size + kMegabyte);
-    size += static_cast<std::size_t>(in.read(text.data() + size, kMegabyte).gcount());
-  }
-  return text;
-}
-
 // A model may be named without its ending.
 Source Load(std::string file) {
-  if (file == "-") return {"<stdin>", ReadAll(std::cin, "<stdin>")};
-  if (!std::filesystem::exists(file) && std::filesystem::exists(file + ".szn")) file += ".szn";
-  if (std::filesystem::is_directory(file)) throw UsageError(file + ": is a folder");
-  std::ifstream in(file, std::ios::binary);
-  std::string text = ReadAll(in, file);
-  if (!in.is_open() || in.bad()) throw UsageError(fmt::format("{}: {}", file, std::strerror(errno)));
-  return {file, std::move(text)};
+  const bool isInput = file == "-";
+  if (!isInput && !std::filesystem::exists(file) && std::filesystem::exists(file + ".szn")) file += ".szn";
+  const std::string name = isInput ? "<stdin>" : file;
+  try {
+    return {name, isInput ? ReadText(std::cin) : DiskFiles().Read(file)};
+  } catch (const std::runtime_error& error) {
+    throw UsageError(fmt::format("{}: {}", name, error.what()));
+  }
 }
 
 class OneRun {
@@ -66,6 +54,7 @@ class OneRun {
 
  private:
   void FindExplained();
+  std::string SuggestVariable(const std::string& name) const;
   void Solve();
   static void EndWithoutReader();
   void Tell();
@@ -100,7 +89,7 @@ void OneRun::FindExplained() {
     const auto found = std::find_if(variables.begin(), variables.end(),
                                     [&](const Variable& variable) { return variable.name == name; });
     if (name.empty() || found == variables.end())
-      throw UsageError(fmt::format("--explain: there is no variable '{}'", name));
+      throw UsageError(fmt::format("--explain: there is no variable '{}'{}", name, SuggestVariable(name)));
     mExplained.push_back({static_cast<int>(found - variables.begin())});
   }
 }
@@ -110,6 +99,15 @@ void OneRun::EndWithoutReader() {
   const bool isGone = IsReaderGone();
   if (isGone) std::raise(SIGPIPE);
   if (isGone || !std::cout.good()) Interrupts::Raise();
+}
+
+std::string OneRun::SuggestVariable(const std::string& name) const {
+  std::vector<std::string_view> names;
+  for (const Variable& variable : mNetwork.GetModel().Variables()) {
+    if (variable.name.starts_with(name + "[")) return fmt::format("; did you mean '{}'?", variable.name);
+    if (!variable.constant) names.push_back(variable.name);
+  }
+  return Suggestion(name, names);
 }
 
 // Nobody is told where nobody listens: text forms cost more than the narrowing itself.
@@ -176,12 +174,12 @@ int OneRun::ExitCode() const {
 }
 
 // The names of the files are told on standard output, so that the next program can read them.
-int WriteParts(const Options& options, const Source& source, const Model& model) {
+int WriteParts(const Options& options, const std::string& written, const Model& model) {
   const std::vector<Part> parts = Split(model, options.limits, options.modulePaths, options.split);
   for (std::size_t i = 0; i < parts.size(); ++i) {
     const std::string file = fmt::format("{}.{}.szn", options.parts.empty() ? "part" : options.parts, i + 1);
     std::ofstream out(file, std::ios::binary);
-    out << source.Text() << "\n" << parts[i];
+    out << written << "\n" << parts[i];
     out.close();
     if (!out) throw UsageError(fmt::format("{}: {}", file, std::strerror(errno)));
     std::cout << file << '\n';
@@ -203,14 +201,14 @@ int Run(const Options& options) {
     return code;
   };
   try {
-    const Source source = Load(options.file);
+    Source source = Load(options.file);
     Diagnostics diagnostics;
-    ReadModel read = Read(source, diagnostics);
+    ReadModel read = Read(source, diagnostics, DiskFiles());
     if (diagnostics.Failed()) {
       reportOn(source, {}, {})->Errors(source, diagnostics);
       return kModelError;
     }
-    if (options.split != 0) return WriteParts(options, source, read.model);
+    if (options.split != 0) return WriteParts(options, SelfContained(source, read.places.embedded), read.model);
     Limits limits = options.limits;
     limits.stop = &Interrupts::Flag();
     Network network(std::move(read.model), limits, options.modulePaths);

@@ -32,7 +32,7 @@ inline std::vector<Row> Rows(const std::string& name) {
 }
 
 inline zornet::Model ReadGood(const std::string& text) {
-  const zornet::Source source("test.szn", text);
+  zornet::Source source("test.szn", text);
   zornet::Diagnostics diagnostics;
   zornet::Model model = zornet::Read(source, diagnostics).model;
   EXPECT_FALSE(diagnostics.Failed()) << zornet::Render(source, diagnostics, false);

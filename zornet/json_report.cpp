@@ -118,13 +118,14 @@ class JsonReport : public Report {
   }
 
   void Called(const RawCall& call) override {
-    Tell({{"event", "call"},
-          {"line", mNames.LineOfConstraint(call.constraint)},
-          {"call", call.call},
-          {"answer", call.answer},
-          {"target", call.target},
-          {"before", call.before},
-          {"after", call.after}});
+    Json json{{"event", "call"}};
+    AddPlace(json, call.constraint);
+    json.update({{"call", call.call},
+                 {"answer", call.answer},
+                 {"target", call.target},
+                 {"before", call.before},
+                 {"after", call.after}});
+    Tell(json);
   }
 
   void Finish(const Network& network, const Summary& summary) override {
@@ -144,8 +145,7 @@ class JsonReport : public Report {
     for (const Limit limit : LimitsOf(network, summary.outcome)) json["limits"].push_back(NameOf(limit));
     if (const int failed = network.FailedConstraint(); failed != kNone) {
       json["variable"] = mNames.OfVariable(network.FailedVariable());
-      json["constraint"] = mNames.OfConstraint(failed);
-      json["line"] = mNames.LineOfConstraint(failed);
+      AddConstraint(json, failed);
     }
     Tell(json);
     mResults.flush();
@@ -164,8 +164,14 @@ class JsonReport : public Report {
 
   void AddConstraint(Json& json, int constraint) const {
     if (constraint == kNone) return;
-    json["line"] = mNames.LineOfConstraint(constraint);
+    AddPlace(json, constraint);
     json["constraint"] = mNames.OfConstraint(constraint);
+  }
+
+  // Of another file than the model itself also which one.
+  void AddPlace(Json& json, int constraint) const {
+    if (const std::string& file = mNames.FileOfConstraint(constraint); file != mNames.File()) json["file"] = file;
+    json["line"] = mNames.LineOfConstraint(constraint);
   }
 
   void AddLimits(Json& json, const LimitsByVariable& limits, int variable) const {

@@ -71,7 +71,7 @@ std::string TextReport::Shown(const Domain& domain) const {
                       : domain.IsOne()   ? Style::Known
                       : domain.IsKnown() ? Style::Open
                                          : Style::Faint;
-  return mPaint(style, domain.Print());
+  return mPaint(style, domain.HasShape() ? domain.Print() + ": " + domain.PrintShape() : domain.Print());
 }
 
 // model.szn:12: str_concat(x, y, z): z: Any -> "ab" (CalcConcatenation)

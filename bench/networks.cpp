@@ -24,7 +24,8 @@ struct Zornet {
   static void Run(State& state, const Problem& problem) {
     const auto solve = [&](std::size_t) {
       zornet::Diagnostics diagnostics;
-      zornet::Network network(zornet::Read(zornet::Source("problem", problem.network), diagnostics).model);
+      zornet::Source source("problem", problem.network);
+      zornet::Network network(zornet::Read(source, diagnostics).model);
       if (diagnostics.Failed() || network.Narrow() != zornet::Outcome::Settled) std::abort();
     };
     Measure(

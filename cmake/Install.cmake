@@ -63,7 +63,7 @@ install(FILES editors/zornet.tmLanguage.json DESTINATION share/zorvadstrings)
 install(FILES README.md CONTRIBUTING.md CHANGELOG.md SECURITY.md LICENSE DESTINATION ${CMAKE_INSTALL_DOCDIR})
 install(DIRECTORY docs DESTINATION ${CMAKE_INSTALL_DOCDIR}
   FILES_MATCHING PATTERN *.md PATTERN *.svg PATTERN *.cpp)
-install(DIRECTORY examples DESTINATION ${CMAKE_INSTALL_DOCDIR} FILES_MATCHING PATTERN *.szn)
+install(DIRECTORY examples DESTINATION ${CMAKE_INSTALL_DOCDIR} FILES_MATCHING PATTERN *.szn PATTERN *.txt)
 
 install(EXPORT ZORVadStrings NAMESPACE ZORVadStrings:: FILE ZORVadStringsConfig.cmake DESTINATION ${package_dir})
 write_basic_package_version_file(${PROJECT_BINARY_DIR}/ZORVadStringsConfigVersion.cmake

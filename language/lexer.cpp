@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <charconv>
 #include <limits>
+#include <utility>
 
 #include "host/ZORText.h"
 #include "module/texts.h"
@@ -23,7 +24,48 @@ std::string NameOf(std::string_view character) {
   return fmt::format("'{}'", character);
 }
 
+// Bytes that stand for one character in quotes. Nothing else is escaped.
+std::size_t WrittenLength(std::string_view text) {
+  return text.size() > 1 && text[0] == '\\' && (text[1] == '"' || text[1] == '\\') ? 2 : 1;
+}
+
 }  // namespace
+
+std::string Unescaped(const Token& token) {
+  if (token.type == Token::Line || token.text.find('\\') == std::string_view::npos) return std::string(token.text);
+  std::string text;
+  for (std::size_t i = 0, length; i < token.text.size(); i += length) {
+    length = WrittenLength(token.text.substr(i));
+    text += token.text[i + length - 1];
+  }
+  return text;
+}
+
+std::size_t PositionOf(const Token& token, std::size_t character) {
+  if (token.type == Token::Line) return token.extent.begin + character;
+  std::size_t at = 0;
+  for (; character > 0 && at < token.text.size(); --character) at += WrittenLength(token.text.substr(at));
+  return token.extent.begin + 1 + at;
+}
+
+bool CheckText(const Token& token, Diagnostics& diagnostics) {
+  const auto wrong = std::find_if_not(token.text.begin(), token.text.end(), zor::IsInAlphabet);
+  if (wrong != token.text.end()) {
+    const auto at = static_cast<std::size_t>(wrong - token.text.begin());
+    const std::string_view character = token.text.substr(at, CharacterLength(token.text.substr(at)));
+    const std::size_t quote = token.type == Token::Text ? 1 : 0;
+    diagnostics.Error({token.extent.begin + quote + at, character.size()},
+                      fmt::format("{} is no character of a text: those are the ones from space to z, without {{|}}~",
+                                  NameOf(character)));
+    return false;
+  }
+  if (token.text.size() <= zor::kLengthLimit) return true;
+  const std::size_t length = Unescaped(token).size();
+  if (length <= zor::kLengthLimit) return true;
+  diagnostics.Error(token.extent,
+                    fmt::format("a text has at most {} characters, this one has {}", zor::kLengthLimit, length));
+  return false;
+}
 
 // Behind the last error that is told there is nothing worth reading.
 Token Lexer::Next() {
@@ -35,20 +77,35 @@ Token Lexer::Next() {
   if (StartsNumber()) return NextNumber();
   if (c == '"') return NextText();
   if (c == '.' && At(1) == '.') return Make(Token::DotDot, 2);
-  if (std::string_view("(){},:;=").find(c) != std::string_view::npos) return Make(Token::Mark, 1);
+  if (std::string_view("(){}[]|,:;=").find(c) != std::string_view::npos) return Make(Token::Mark, 1);
   return NextBroken();
 }
 
 void Lexer::SkipBlanks() {
-  while (mNext < mText.size() && (IsBlank(At(0)) || At(0) == '%')) {
-    mNext = At(0) == '%' ? std::min(mText.find('\n', mNext), mText.size()) : mNext + 1;
+  while (mNext < mText.size()) {
+    if (IsBlank(At(0))) {
+      ++mNext;
+    } else if (!SkipsComment()) {
+      return;
+    }
   }
 }
 
+// What other languages begin comments with is told once, and skipped as they would.
+bool Lexer::SkipsComment() {
+  const bool block = At(0) == '/' && At(1) == '*', line = At(0) == '#' || (At(0) == '/' && At(1) == '/');
+  if (At(0) != '%' && !block && !line) return false;
+  if (At(0) != '%' && !std::exchange(mToldComment, true))
+    mDiagnostics.Error(Here(At(0) == '#' ? 1 : 2), "a comment begins with '%' and ends with its line");
+  const std::size_t end = block ? mText.find("*/", mNext + 2) : mText.find('\n', mNext);
+  mNext = end == std::string_view::npos ? mText.size() : end + (block ? 2 : 0);
+  return true;
+}
+
 Token Lexer::Make(Token::Type type, std::size_t length) {
-  const Extent extent{mNext, length};
+  const Token token{type, Here(length), mText.substr(mNext, length)};
   mNext += length;
-  return {type, extent, mSource.Text(extent)};
+  return token;
 }
 
 Token Lexer::NextName() {
@@ -73,40 +130,41 @@ Token Lexer::NextNumber() {
 
 // A text ends at its closing quote; one that lacks it ends with its line, so that the next line is read in peace.
 Token Lexer::NextText() {
-  const std::size_t close = std::min(mText.find_first_of("\"\n", mNext + 1), mText.size());
+  std::size_t close = mNext + 1;
+  while (close < mText.size() && mText[close] != '"' && mText[close] != '\n')
+    close += WrittenLength(mText.substr(close));
   if (close == mText.size() || mText[close] == '\n') {
     const std::size_t length = mText.substr(mNext, close - mNext).find_last_not_of("\r \t") + 1;
-    mDiagnostics.Error({mNext, length}, "the text has no closing quote on its line");
+    mDiagnostics.Error(Here(length), "the text has no closing quote on its line");
     return Make(Token::Broken, length);
   }
-  const Extent inside{mNext + 1, close - mNext - 1};
-  CheckText(inside);
-  Token token = Make(Token::Text, close + 1 - mNext);
-  token.text = mSource.Text(inside);
+  const std::string_view inside = mText.substr(mNext + 1, close - mNext - 1);
+  CheckEscapes(inside);
+  Token token = Make(Token::Text, inside.size() + 2);
+  token.text = inside;
   return token;
 }
 
-void Lexer::CheckText(Extent inside) {
-  const std::string_view text = mSource.Text(inside);
-  for (std::size_t i = 0; i < text.size();) {
-    const std::size_t length = CharacterLength(text.substr(i));
-    if (!zor::IsInAlphabet(text[i])) {
-      mDiagnostics.Error({inside.begin + i, length},
-                         fmt::format("{} is no character of a text: those are the ones from space to z, without {{|}}~",
-                                     NameOf(text.substr(i, length))));
-      return;
-    }
-    i += length;
-  }
-  if (text.size() > zor::kLengthLimit) {
-    mDiagnostics.Error(
-        {inside.begin - 1, inside.length + 2},
-        fmt::format("a text has at most {} characters, this one has {}", zor::kLengthLimit, text.size()));
+void Lexer::CheckEscapes(std::string_view inside) {
+  for (std::size_t at = inside.find('\\'); at != std::string_view::npos; at = inside.find('\\', at)) {
+    const std::size_t length = WrittenLength(inside.substr(at));
+    at += length;
+    if (length == 2) continue;
+    const std::size_t next = at < inside.size() ? CharacterLength(inside.substr(at)) : 0;
+    mDiagnostics.Error({mBegin + mNext + at, 1 + next},
+                       fmt::format("'{}' is no escape: a quote is written \\\" and a backslash \\\\",
+                                   inside.substr(at - 1, 1 + next)));
+    return;
   }
 }
 
+// Letters outside ASCII come as one word.
 Token Lexer::NextBroken() {
-  Token token = Make(Token::Broken, CharacterLength(mText.substr(mNext)));
+  const std::string_view rest = mText.substr(mNext);
+  std::size_t length = 0;
+  while (length < rest.size() && CharacterLength(rest.substr(length)) > 1)
+    length += CharacterLength(rest.substr(length));
+  const Token token = Make(Token::Broken, std::max<std::size_t>(length, 1));
   mDiagnostics.Error(token.extent, fmt::format("{} has no meaning here", NameOf(token.text)));
   return token;
 }

@@ -1,42 +1,91 @@
 #include "language/source.h"
 
+#include <locale.h>
+#include <wchar.h>
+
 #include <algorithm>
+#include <iterator>
 #include <utility>
 
 namespace zornet {
 
-Source::Source(std::string name, std::string text) : mName(std::move(name)), mText(std::move(text)), mLines{0} {
-  mLines.reserve(1 + static_cast<std::size_t>(std::count(mText.begin(), mText.end(), '\n')));
-  for (std::size_t end = mText.find('\n'); end != std::string::npos; end = mText.find('\n', end + 1))
-    mLines.push_back(end + 1);
+namespace {
+
+char32_t Decode(std::string_view character) {
+  const auto first = static_cast<unsigned char>(character.front());
+  char32_t code = character.size() == 1 ? first : first & (0x7Fu >> character.size());
+  for (const char c : character.substr(1)) code = code << 6 | (static_cast<unsigned char>(c) & 0x3Fu);
+  return code;
 }
 
-std::string_view Source::Line(std::size_t line) const {
-  const std::size_t begin = LineBegin(line);
-  const std::size_t end = line < mLines.size() ? LineBegin(line + 1) - 1 : mText.size();
-  std::string_view text = Text().substr(begin, end - begin);
-  if (text.ends_with('\r')) text.remove_suffix(1);
-  return text;
+// The library knows widths by locale, and the one of the user need not be of UTF-8.
+int WidthOf(char32_t code) {
+  static const locale_t utf8 = newlocale(LC_CTYPE_MASK, "C.UTF-8", nullptr);
+  if (utf8 == nullptr) return 1;
+  const locale_t before = uselocale(utf8);
+  const int width = wcwidth(static_cast<wchar_t>(code));
+  uselocale(before);
+  return width;
 }
 
-std::string_view Source::InLine(Extent extent) const {
-  const std::size_t line = LineOf(extent.begin);
-  const std::string_view text = Line(line);
-  return text.substr(std::min(extent.begin - LineBegin(line), text.size()), extent.length);
+}  // namespace
+
+std::size_t Source::Add(std::string name, std::string text) {
+  constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+  if (text.starts_with(kByteOrderMark)) text.erase(0, kByteOrderMark.size());
+  const std::size_t begin = mFiles.empty() ? 0 : mFiles.back().begin + mFiles.back().text.size() + 1;
+  File& file = mFiles.emplace_back(File{std::move(name), std::move(text), begin, {begin}});
+  file.lines.reserve(1 + static_cast<std::size_t>(std::count(file.text.begin(), file.text.end(), '\n')));
+  for (std::size_t end = file.text.find('\n'); end != std::string::npos; end = file.text.find('\n', end + 1))
+    file.lines.push_back(begin + end + 1);
+  return mFiles.size() - 1;
+}
+
+const Source::File& Source::FileAt(std::size_t position) const {
+  const auto next = std::upper_bound(mFiles.begin(), mFiles.end(), position,
+                                     [](std::size_t at, const File& file) { return at < file.begin; });
+  return *std::prev(next);
+}
+
+std::string_view Source::Text(Extent extent) const {
+  const File& file = FileAt(extent.begin);
+  return std::string_view(file.text).substr(extent.begin - file.begin, extent.length);
 }
 
 std::size_t Source::LineOf(std::size_t position) const {
-  const auto next = std::upper_bound(mLines.begin(), mLines.end(), position);
-  return static_cast<std::size_t>(next - mLines.begin());
+  const std::vector<std::size_t>& lines = FileAt(position).lines;
+  return static_cast<std::size_t>(std::upper_bound(lines.begin(), lines.end(), position) - lines.begin());
+}
+
+Extent Source::LineAt(std::size_t position) const {
+  const File& file = FileAt(position);
+  const std::size_t line = LineOf(position), begin = file.lines[line - 1];
+  std::size_t end = line < file.lines.size() ? file.lines[line] - 1 : file.begin + file.text.size();
+  if (end > begin && file.text[end - file.begin - 1] == '\r') --end;
+  return {begin, end - begin};
+}
+
+std::vector<Extent> Source::LinesOf(std::size_t file) const {
+  std::vector<Extent> lines;
+  const std::size_t end = All(file).End();
+  for (const std::size_t begin : mFiles[file].lines) {
+    if (begin < end) lines.push_back(LineAt(begin));
+  }
+  return lines;
+}
+
+std::string_view Source::InLine(Extent extent) const {
+  const std::size_t end = LineAt(extent.begin).End(), begin = std::min(extent.begin, end);
+  return Text({begin, std::min(extent.length, end - begin)});
 }
 
 Location Locator::operator()(std::size_t position) {
-  const std::size_t line = mSource.LineOf(position);
-  if (line != mLocation.line || position < mPosition) {
-    mLocation = {line, 1};
-    mPosition = mSource.LineBegin(line);
+  const std::size_t line = mSource.LineAt(position).begin;
+  if (line != mLine || position < mPosition) {
+    mLocation = {mSource.LineOf(position), 1};
+    mLine = mPosition = line;
   }
-  mLocation.column += CountCharacters(mSource.Text({mPosition, position - mPosition}));
+  mLocation.column += CountCells(mSource.Text({mPosition, position - mPosition}));
   mPosition = position;
   return mLocation;
 }
@@ -49,10 +98,16 @@ std::size_t CharacterLength(std::string_view text) {
   return std::all_of(text.begin() + 1, text.begin() + static_cast<std::ptrdiff_t>(length), goesOn) ? length : 1;
 }
 
-std::size_t CountCharacters(std::string_view text) {
-  std::size_t count = 0;
-  for (; !text.empty(); ++count) text.remove_prefix(CharacterLength(text));
-  return count;
+// What no terminal shows stands as one character in its place.
+std::size_t CountCells(std::string_view text) {
+  std::size_t cells = 0;
+  while (!text.empty()) {
+    const std::size_t length = CharacterLength(text);
+    const int width = length == 1 ? 1 : WidthOf(Decode(text.substr(0, length)));
+    cells += width < 0 ? 1 : static_cast<std::size_t>(width);
+    text.remove_prefix(length);
+  }
+  return cells;
 }
 
 }  // namespace zornet

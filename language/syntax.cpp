@@ -2,10 +2,13 @@
 
 #include <fmt/core.h>
 
+#include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <utility>
 
+#include "language/inclusion.h"
 #include "language/spelling.h"
 
 namespace zornet {
@@ -15,8 +18,8 @@ namespace {
 // Thrown where an item cannot be read on; it has been told.
 struct Unreadable {};
 
-constexpr std::string_view kItems[] = {"var", "constraint", "output"};
-constexpr std::string_view kTypes[] = {"string", "set", "int", "bool"};
+constexpr std::string_view kItems[] = {"var", "set", "array", "constraint", "output", "include"};
+constexpr std::string_view kOthers[] = {"var", "constraint", "output", "true", "false"};  // that are no names
 
 bool IsAmong(std::string_view word, std::span<const std::string_view> words) {
   for (const std::string_view other : words) {
@@ -25,35 +28,53 @@ bool IsAmong(std::string_view word, std::span<const std::string_view> words) {
   return false;
 }
 
-bool IsReserved(std::string_view word) {
-  return IsAmong(word, kItems) || IsAmong(word, kTypes) || word == "true" || word == "false";
-}
+bool IsReserved(std::string_view word) { return IsAmong(word, kTypes) || IsAmong(word, kOthers); }
 
 Extent Join(Extent from, Extent to) { return {from.begin, to.End() - from.begin}; }
 
+// Reads the items of one file.
 class Parser {
  public:
-  Parser(const Source& source, Diagnostics& diagnostics)
-      : mSource(source), mDiagnostics(diagnostics), mLexer(source, diagnostics) {
+  Parser(Inclusion& inclusion, std::size_t file, Syntax& syntax, Diagnostics& diagnostics)
+      : mInclusion(inclusion),
+        mSource(inclusion.GetSource()),
+        mDiagnostics(diagnostics),
+        mLexer(mSource, file, diagnostics),
+        mSyntax(syntax) {
     Take();
   }
 
-  Syntax Parse() {
-    while (mToken.type != Token::End && !mDiagnostics.Stopped()) Item();
-    return std::move(mSyntax);
-  }
+  bool IsAtEnd() const { return mToken.type == Token::End || mDiagnostics.Stopped(); }
+  std::optional<std::size_t> ReadItem();  // the file whose items come next
 
  private:
   void Item();
   void Declaration();
+  void NamedSet();
+  void Array();
+  void Include();
   void Constraint();
   void Output();
+  void Finish(DeclarationSyntax& declaration);
+  Range Value(DeclarationSyntax& declaration);
+  Range Indices();
   TypeSyntax Type();
   TypeSyntax NamedType();
-  std::vector<Word> Braces();
+  TypeSyntax Basic();
+  TypeSyntax Interval();
+  Range Braces();
+  Range Lines(Extent word);
+  Range LinesOf(std::size_t file);
+  Range Rows();
+  Range Members(Word (Parser::*member)());
+  Range Keep(const std::vector<Word>& words);
+  Word Literal();
   Word Constant();
   Word Argument();
-  Token NewName();
+  Word List();
+  Word Member();
+  Word NameOrElement();
+  Token NewName(std::string_view what);
 
   Token Take();
   Token Expect(std::string_view mark, std::string_view where);
@@ -61,27 +82,38 @@ class Parser {
   void Recover();
   bool StartsLine(const Token& token) const;
 
+  Inclusion& mInclusion;
   const Source& mSource;
   Diagnostics& mDiagnostics;
   Lexer mLexer;
   Token mToken;  // the next
   Extent mLast;  // of the one before
   Token mDeclared;
-  Syntax mSyntax;
+  std::optional<std::size_t> mIncluded;
+  Syntax& mSyntax;
 };
 
-void Parser::Item() {
+std::optional<std::size_t> Parser::ReadItem() {
   mDeclared = Token();
+  mIncluded.reset();
   try {
-    if (mToken.Is("var")) return Declaration();
-    if (mToken.Is("constraint")) return Constraint();
-    if (mToken.Is("output")) return Output();
-    const std::string near = mToken.type == Token::Name ? Suggestion(mToken.text, kItems) : "";
-    Fail("'var', 'constraint' or 'output'" + near);
+    Item();
   } catch (const Unreadable&) {
     if (mDeclared.type == Token::Name) mSyntax.broken.push_back(mDeclared);
     Recover();
   }
+  return mIncluded;
+}
+
+void Parser::Item() {
+  if (mToken.Is("var")) return Declaration();
+  if (mToken.Is("constraint")) return Constraint();
+  if (mToken.Is("set")) return NamedSet();
+  if (mToken.Is("array")) return Array();
+  if (mToken.Is("output")) return Output();
+  if (mToken.Is("include")) return Include();
+  const std::string near = mToken.type == Token::Name ? Suggestion(mToken.text, kItems) : "";
+  Fail("'var', 'set', 'array', 'constraint', 'output' or 'include'" + near);
 }
 
 void Parser::Declaration() {
@@ -89,31 +121,88 @@ void Parser::Declaration() {
   Take();
   declaration.type = Type();
   Expect(":", "behind the type");
-  declaration.name = mDeclared = NewName();
+  declaration.name = mDeclared = NewName("the name of the variable");
   if (mToken.Is("=")) {
     Take();
-    const Token first = mToken;
-    declaration.setValue = mToken.Is("{");
-    declaration.value = declaration.setValue ? Braces() : std::vector{Constant()};
-    declaration.valueExtent = Join(first.extent, mLast);
+    declaration.value = Value(declaration);
   }
+  Finish(declaration);
+}
+
+Range Parser::Value(DeclarationSyntax& declaration) {
+  const Token first = mToken;
+  declaration.setValue = first.Is("{") || first.Is("lines");
+  const Range value = first.Is("lines") ? (Take(), Lines(first.extent)) : first.Is("{") ? Braces() : Keep({Constant()});
+  declaration.valueExtent = Join(first.extent, mLast);
+  return value;
+}
+
+void Parser::Finish(DeclarationSyntax& declaration) {
   Expect(";", "at the end of the declaration");
   mSyntax.declarations.push_back(std::move(declaration));
 }
 
+// set of string: NAME = SET;
+void Parser::NamedSet() {
+  DeclarationSyntax declaration;
+  declaration.what = DeclarationSyntax::Set;
+  Take();
+  Expect("of", "behind 'set'");
+  const Token members = mToken;
+  if (!members.Is("string") && !members.Is("int")) Fail("'string' or 'int' behind 'set of'");
+  Take();
+  Expect(":", "behind the type");
+  declaration.name = mDeclared = NewName("the name of the set");
+  Expect("=", "behind the name of the set");
+  const Token first = mToken;
+  if (!first.Is("{") && !first.Is("lines") && first.type != Token::Number)
+    Fail("a set: {\"a\", \"b\"}, lines(\"file\"), {1, 3} or 1..9");
+  declaration.type = Type();
+  if (members.Is("string")) declaration.type.sort = Sort::TextSet;
+  if (members.Is("int") && declaration.type.sort != Sort::Interval) declaration.type.sort = Sort::IntegerSet;
+  Finish(declaration);
+}
+
+// array [FIRST..LAST] of var TYPE: NAME; or array [FIRST..LAST] of TYPE: NAME = [CONSTANT, ...];
+void Parser::Array() {
+  DeclarationSyntax declaration;
+  Take();
+  declaration.indices = Indices();
+  Expect("of", "behind the indices of the array");
+  const bool variables = mToken.Is("var");
+  declaration.what = variables ? DeclarationSyntax::Variables : DeclarationSyntax::Constants;
+  if (variables) Take();
+  if (!variables && (mToken.Is("set") || !IsAmong(mToken.text, kTypes)))
+    Fail("'var' and a type, or for constants 'string', 'int' or 'bool'");
+  declaration.type = variables ? Type() : Basic();
+  Expect(":", "behind the type");
+  declaration.name = mDeclared = NewName("the name of the array");
+  if (!variables) {
+    Expect("=", "behind the name of an array without 'var'");
+    const Token first = mToken;
+    Expect("[", "ahead of the constants");
+    declaration.value = Members(&Parser::Constant);
+    Expect("]", "behind the constants");
+    declaration.valueExtent = Join(first.extent, mLast);
+  }
+  Finish(declaration);
+}
+
+Range Parser::Indices() {
+  Expect("[", "behind 'array'");
+  if (mToken.type != Token::Number) Fail("the first and the last index: 1..9");
+  const Range indices = Interval().members;
+  Expect("]", "behind the indices");
+  return indices;
+}
+
 TypeSyntax Parser::Type() {
+  if (mToken.type == Token::Number) return Interval();
   const Token first = mToken;
   TypeSyntax type;
   if (first.Is("{")) {
     type.members = Braces();
-    type.sort = type.members.front().type == Word::Text ? Sort::TextSet : Sort::IntegerSet;
-  } else if (first.type == Token::Number) {
-    type.members.push_back(Constant());
-    if (mToken.type != Token::DotDot) Fail("'..' and the upper end of the interval");
-    Take();
-    if (mToken.type != Token::Number) Fail("the upper end of the interval");
-    type.members.push_back(Constant());
-    type.sort = Sort::Interval;
+    type.sort = mSyntax.Members(type.members).front().type == Word::Text ? Sort::TextSet : Sort::IntegerSet;
   } else {
     type = NamedType();
   }
@@ -121,58 +210,157 @@ TypeSyntax Parser::Type() {
   return type;
 }
 
-TypeSyntax Parser::NamedType() {
-  const Token word = mToken;
-  if (!IsAmong(word.text, kTypes)) {
-    const std::string near = word.type == Token::Name ? Suggestion(word.text, kTypes) : "";
-    Fail("a type: string, set string, {\"a\", \"b\"}, int, 1..9, {1, 3} or bool" + near);
-  }
+TypeSyntax Parser::Interval() {
+  const Word first = Constant();
+  if (mToken.type != Token::DotDot) Fail("'..' and the upper end of the interval");
   Take();
-  if (word.Is("string")) return {Sort::Text, {}, {}};
-  if (word.Is("int")) return {Sort::Integer, {}, {}};
-  if (word.Is("bool")) return {Sort::Boolean, {}, {}};
-  if (!mToken.Is("string")) Fail("'string' behind 'set'");
-  Take();
-  return {Sort::TextSet, {}, {}};
+  if (mToken.type != Token::Number) Fail("the upper end of the interval");
+  const Word last = Constant();
+  return {Sort::Interval, Keep({first, last}), {}, Join(first.token.extent, last.token.extent)};
 }
 
-std::vector<Word> Parser::Braces() {
-  std::vector<Word> members;
+TypeSyntax Parser::NamedType() {
+  const Token word = mToken;
+  if (IsAmong(word.text, kTypes)) return Basic();
+  if (word.type != Token::Name || IsReserved(word.text)) Fail(std::string(kAnyType));
+  Take();
+  if (word.Is("lines") && mToken.Is("(")) return {Sort::TextSet, Lines(word.extent), {}, {}};
+  if (mToken.Is(":") || mToken.type == Token::Name) return {Sort::TextSet, {}, word, {}};
+  mDiagnostics.Error(word.extent, fmt::format("expected {}{}", kAnyType, Suggestion(word.text, kTypes)));
+  throw Unreadable();
+}
+
+TypeSyntax Parser::Basic() {
+  const Token word = mToken;
+  if (word.Is("string") || word.Is("int") || word.Is("bool")) {
+    Take();
+    return {word.Is("string") ? Sort::Text : word.Is("int") ? Sort::Integer : Sort::Boolean, {}, {}, {}};
+  }
+  Take();
+  if (mToken.Is("of")) Take();
+  if (!mToken.Is("string")) Fail("'string' behind 'set'");
+  Take();
+  return {Sort::TextSet, {}, {}, {}};
+}
+
+Range Parser::Braces() {
   Expect("{", "here");
   if (mToken.Is("}")) Fail("at least one text or integer between the braces");
-  members.push_back(Constant());
-  while (mToken.Is(",")) {
-    Take();
-    members.push_back(Constant());
-  }
+  const Range members = Members(&Parser::Constant);
   Expect("}", "at the end of the set");
   return members;
 }
 
-Word Parser::Constant() {
-  switch (mToken.type) {
-    case Token::Text:
-      return {Word::Text, Take()};
-    case Token::Number:
-      return {Word::Number, Take()};
-    default:
-      break;
+// Behind the word lines: a text on each line of a file.
+Range Parser::Lines(Extent word) {
+  Expect("(", "behind 'lines'");
+  if (mToken.type != Token::Text) Fail("the name of a file in quotes");
+  const Token path = Take();
+  Expect(")", "behind the name of the file");
+  const std::optional<std::size_t> file = mInclusion.Load(path);
+  if (!file) throw Unreadable();
+  mSyntax.embedded.push_back({Join(word, mLast), Embedded::Set, *file});
+  const auto [known, isNew] = mSyntax.lines.try_emplace(*file);
+  if (isNew) known->second = LinesOf(*file);
+  if (known->second.count > 0) return known->second;
+  mDiagnostics.Error(path.extent, fmt::format("'{}' has no lines, and a set has at least one text",
+                                              mSource.NameAt(mSource.All(*file).begin)));
+  throw Unreadable();
+}
+
+Range Parser::LinesOf(std::size_t file) {
+  std::vector<Word> lines;
+  for (const Extent line : mSource.LinesOf(file)) {
+    lines.push_back({Word::Text, {Token::Line, line, mSource.Text(line)}});
+    CheckText(lines.back().token, mDiagnostics);
   }
+  return Keep(lines);
+}
+
+Range Parser::Members(Word (Parser::*member)()) {
+  std::vector<Word> members{(this->*member)()};
+  while (mToken.Is(",")) {
+    Take();
+    members.push_back((this->*member)());
+  }
+  return Keep(members);
+}
+
+Range Parser::Keep(const std::vector<Word>& words) {
+  const Range range{mSyntax.members.size(), words.size()};
+  mSyntax.members.insert(mSyntax.members.end(), words.begin(), words.end());
+  return range;
+}
+
+// A constant where it must be one of the domain.
+Word Parser::Constant() {
+  const Word word = Literal();
+  if (word.type == Word::Text) CheckText(word.token, mDiagnostics);
+  return word;
+}
+
+Word Parser::Literal() {
+  if (mToken.type == Token::Text) return {Word::Text, Take()};
+  if (mToken.type == Token::Number) return {Word::Number, Take()};
   if (mToken.Is("true") || mToken.Is("false")) return {Word::Truth, Take()};
   Fail("a text in quotes, an integer, true or false");
 }
 
 Word Parser::Argument() {
-  if (mToken.type == Token::Name && !IsReserved(mToken.text)) return {Word::Name, Take()};
-  if (mToken.Is("{")) Fail("a variable or one constant, since a set stands in a declaration only");
-  if (mToken.type == Token::Name && !mToken.Is("true") && !mToken.Is("false")) Fail("a variable or a constant");
-  return Constant();
+  if (mToken.Is("[")) return List();
+  return Member();
 }
 
-Token Parser::NewName() {
-  if (mToken.type != Token::Name) Fail("the name of the variable");
-  if (IsReserved(mToken.text))
-    Fail(fmt::format("the name of the variable, and '{}' is a word of the language", mToken.text));
+Word Parser::Member() {
+  if (mToken.type == Token::Name && !IsReserved(mToken.text)) return NameOrElement();
+  if (mToken.Is("{")) Fail("a variable or one constant, since a set stands in a declaration only");
+  if (mToken.Is("[")) Fail("a variable or a constant, since a list holds no list");
+  if (mToken.type == Token::Name && !mToken.Is("true") && !mToken.Is("false")) Fail("a variable or a constant");
+  return Literal();
+}
+
+Word Parser::NameOrElement() {
+  Token name = Take();
+  if (!mToken.Is("[")) return {Word::Name, name};
+  Take();
+  if (mToken.type != Token::Number) Fail("the index, an integer");
+  const Range index = Keep({Constant()});
+  Expect("]", "behind the index");
+  name.extent = Join(name.extent, mLast);
+  return {Word::Element, name, index};
+}
+
+// [x, "a", w] or the rows of a table: [| "a", "b" | "c", "d" |]
+Word Parser::List() {
+  Word list{Word::List, Take()};
+  if (mToken.Is("|")) {
+    list.type = Word::Rows;
+    list.members = Rows();
+  } else if (mToken.Is("]")) {
+    Fail("at least one member of the list");
+  } else {
+    list.members = Members(&Parser::Member);
+  }
+  Expect("]", "at the end of the list");
+  list.token.extent = Join(list.token.extent, mLast);
+  return list;
+}
+
+Range Parser::Rows() {
+  std::vector<Word> rows;
+  Take();
+  do {
+    Word& row = rows.emplace_back(Word{Word::List, mToken});
+    row.members = Members(&Parser::Constant);
+    row.token.extent = Join(row.token.extent, mLast);
+    Expect("|", "at the end of the row");
+  } while (!mToken.Is("]"));
+  return Keep(rows);
+}
+
+Token Parser::NewName(std::string_view what) {
+  if (mToken.type != Token::Name) Fail(std::string(what));
+  if (IsReserved(mToken.text)) Fail(fmt::format("{}, and '{}' is a word of the language", what, mToken.text));
   return Take();
 }
 
@@ -199,9 +387,21 @@ void Parser::Output() {
   do {
     Take();
     if (mToken.type != Token::Name || IsReserved(mToken.text)) Fail("the name of a variable");
-    mSyntax.outputs.push_back(Take());
+    mSyntax.outputs.push_back(NameOrElement());
   } while (mToken.Is(","));
   Expect(";", "at the end of the output");
+}
+
+void Parser::Include() {
+  const Token first = Take();
+  if (mToken.type != Token::Text) Fail("the name of a file in quotes");
+  const Token path = Take();
+  Expect(";", "behind the name of the file");
+  const std::optional<std::size_t> file = mInclusion.Load(path);
+  if (!file) return;
+  const bool isNew = mInclusion.Include(*file);
+  mSyntax.embedded.push_back({Join(first.extent, mLast), isNew ? Embedded::Items : Embedded::Nothing, *file});
+  if (isNew) mIncluded = file;
 }
 
 Token Parser::Take() {
@@ -242,13 +442,29 @@ void Parser::Recover() {
 }
 
 bool Parser::StartsLine(const Token& token) const {
-  const std::string_view before = mSource.Text({0, token.extent.begin});
-  const std::size_t last = before.find_last_not_of(" \t");
-  return last == std::string_view::npos || before[last] == '\n';
+  const std::size_t line = mSource.LineAt(token.extent.begin).begin;
+  return mSource.Text({line, token.extent.begin - line}).find_first_not_of(" \t") == std::string_view::npos;
 }
 
 }  // namespace
 
-Syntax Parse(const Source& source, Diagnostics& diagnostics) { return Parser(source, diagnostics).Parse(); }
+// The items of a file stand where it is included.
+Syntax Parse(Source& source, const Files& files, Diagnostics& diagnostics) {
+  Syntax syntax;
+  Inclusion inclusion(source, files, diagnostics);
+  std::vector<std::unique_ptr<Parser>> open;  // each file names the next
+  const auto begin = [&](std::size_t file) {
+    open.push_back(std::make_unique<Parser>(inclusion, file, syntax, diagnostics));
+  };
+  begin(0);
+  while (!open.empty()) {
+    if (open.back()->IsAtEnd()) {
+      open.pop_back();
+    } else if (const auto included = open.back()->ReadItem()) {
+      begin(*included);
+    }
+  }
+  return syntax;
+}
 
 }  // namespace zornet

@@ -109,7 +109,7 @@ SearchResult Network::Search(std::uint64_t most, const std::function<bool()>& fo
   result.outcome = search.Run(most, found);
   result.solutions = search.Found();
   result.open = search.Open();
-  result.openVariable = {search.OpenVariable()};
+  for (const int variable : search.OpenVariables()) result.openVariables.push_back({variable});
   result.complete = search.IsExhausted() && result.open == 0;
   if (search.IsExhausted() && result.open != 0) result.outcome = Outcome::Open;
   if (result.complete && result.solutions == 0) result.outcome = Outcome::Contradiction;
@@ -128,11 +128,22 @@ Explanation Network::Explain(Var variable) const {
   Store store(mInside->session.Types(), mInside->model);
   Log log(mInside->model);
   store.Watch(&log);
-  Propagation(store, {mInside->limits.budget, mInside->propagation.Steps()}).Run();
+  Limits limits;
+  limits.budget = mInside->limits.budget;
+  limits.steps = mInside->propagation.Steps();
+  Propagation(store, limits).Run();
   Explanation explanation = log.Explain(variable.index);
   const Store start(mInside->session.Types(), mInside->model);
   for (Explanation::Start& declared : explanation.declared) declared.value = start[declared.variable.index].Show();
   return explanation;
+}
+
+std::vector<LimitMet> Network::LimitsMet() const {
+  if (mInside->store.HasFailed()) return {};
+  std::vector<LimitMet> met = mInside->store.LimitsMet();
+  mInside->propagation.AddLimitsMet(met);
+  std::erase_if(met, [this](const LimitMet& each) { return (*this)[each.variable].IsOne(); });
+  return met;
 }
 
 void Network::OnNarrowing(std::function<void(const Narrowing&)> told) {

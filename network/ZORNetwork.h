@@ -10,6 +10,8 @@
 // Networks are independent of each other; one belongs to one thread at a time.
 #pragma once
 
+#include <atomic>
+#include <chrono>
 #include <cstddef>
 #include <cstdint>
 #include <functional>
@@ -36,6 +38,8 @@ struct ZOR_EXPORT ModuleFailure : std::runtime_error {
 struct Limits {
   std::size_t budget = 65536;         // combinations of values that one pass over a constraint may try
   std::uint64_t steps = 100'000'000;  // passes over a constraint, and choices of a search, in all
+  std::chrono::steady_clock::time_point deadline = std::chrono::steady_clock::time_point::max();
+  const std::atomic<bool>* stop = nullptr;  // ends it when another thread or a signal makes this true
 };
 
 enum class Outcome {
@@ -43,6 +47,8 @@ enum class Outcome {
   Contradiction,  // there is no solution
   StepLimit,
   Open,  // of a search that tried all: there may be more solutions, as a variable stays unknown in some branch
+  TimeLimit,
+  Stopped,
 };
 
 // What is known of a text that is not listed. Lengths are in characters.
@@ -103,6 +109,25 @@ struct Explanation {
   std::vector<Narrowing> narrowings;  // in the order in which they happened
 };
 
+// What can keep a variable from being narrowed further.
+enum class Limit {
+  Set,         // more values are possible than a set lists
+  Budget,      // the values have more combinations than Limits::budget
+  Narrowings,  // of one interval in a row
+  Steps,       // Limits::steps are made
+  Time,        // Limits::deadline is past
+  Stop,        // Limits::stop is true
+};
+
+// A limit that did so.
+struct LimitMet {
+  Limit limit = Limit::Set;
+  Var variable;
+  int constraint = kNone;   // that would have narrowed it
+  std::uint64_t count = 0;  // the values or combinations; 0 where they were not counted
+  std::uint64_t most = 0;   // what the limit allows
+};
+
 struct OperationCount {
   std::string_view operation;
   std::uint64_t calls = 0, changes = 0, contradictions = 0;
@@ -111,9 +136,9 @@ struct OperationCount {
 struct SearchResult {
   Outcome outcome = Outcome::Settled;  // Contradiction: it is sure that there is no solution
   std::uint64_t solutions = 0;
-  bool complete = false;   // there are no more
-  std::uint64_t open = 0;  // branches left because a variable stays unknown in them
-  Var openVariable;        // one such variable
+  bool complete = false;           // there are no more
+  std::uint64_t open = 0;          // branches left because variables stay unknown in them
+  std::vector<Var> openVariables;  // these variables
 };
 
 class ZOR_EXPORT Network {
@@ -125,7 +150,7 @@ class ZOR_EXPORT Network {
   Network(Network&&) noexcept;
   Network& operator=(Network&&) noexcept;
 
-  // Narrows until nothing changes, until a contradiction, or until the limit of steps.
+  // Narrows until nothing changes, until a contradiction, or until a limit.
   Outcome Narrow();
 
   // Narrows, then looks for solutions, in which every wanted variable has one value, and stops at `most` of them. Each
@@ -143,6 +168,10 @@ class ZOR_EXPORT Network {
 
   // Narrows once more from the start, to tell what brought a variable to its domain.
   Explanation Explain(Var variable) const;
+
+  // What keeps variables from being narrowed further, apart from what is not known of others. None after a
+  // contradiction, and none at a variable that has one value.
+  std::vector<LimitMet> LimitsMet() const;
 
   // The solver's own value, for the bare operations of its modules. What is narrowed after a change is not sound.
   ZORVaDoAny& Bare(Var variable);

@@ -13,6 +13,7 @@ Status AllDifferent::Narrow(const Constraint& constraint) {
   }
   List(constraint.arguments);
   for (std::size_t variable = 0; variable < mVariables.size(); ++variable) {
+    if (mStop.IsAsked()) return Status::Again;
     if (Match(variable)) continue;
     mStore.Fail(mVariables[variable]);
     return Status::Subsumed;

@@ -12,13 +12,14 @@
 
 #include "network/components.h"
 #include "network/status.h"
+#include "network/stop.h"
 #include "network/store.h"
 
 namespace zornet {
 
 class AllDifferent {
  public:
-  explicit AllDifferent(Store& store) : mStore(store) {}
+  AllDifferent(Store& store, Stop& stop) : mStore(store), mStop(stop) {}
 
   Status Narrow(const Constraint& constraint);
 
@@ -49,6 +50,7 @@ class AllDifferent {
   }
 
   Store& mStore;
+  Stop& mStop;
   std::unordered_map<std::string, std::size_t, Hash, std::equal_to<>> mNumbers;  // of all texts that were met
   std::vector<Text> mTexts;                                                      // by number
   std::size_t mPass = 0, mSearch = 0;

@@ -39,11 +39,14 @@ bool Arithmetic::NeedsSupports(const Constraint& constraint) const {
     const Value& value = mStore[variable];
     return mStore.HasCandidates(variable) || (value.Sort() == Sort::IntegerSet && value.IsKnown() && !value.IsOne());
   };
-  const auto isOpen = [this](int variable) { return !mStore[variable].IsOne(); };
-  if (std::count_if(arguments.begin(), arguments.end(), isOpen) > kMostOpen) return false;
   if (std::any_of(arguments.begin(), arguments.end(), hasHoles)) return true;
   return arguments.size() == 3 &&
          (arguments[0] == arguments[1] || arguments[0] == arguments[2] || arguments[1] == arguments[2]);
+}
+
+bool Arithmetic::HasManyOpen(const Constraint& constraint) const {
+  const auto isOpen = [this](int variable) { return !mStore[variable].IsOne(); };
+  return std::count_if(constraint.arguments.begin(), constraint.arguments.end(), isOpen) > kMostOpen;
 }
 
 // Each term is what the others leave to nought.

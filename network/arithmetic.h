@@ -19,6 +19,7 @@ class Arithmetic {
 
   // Whether single values may be left that the bounds do not drop.
   bool NeedsSupports(const Constraint& constraint) const;
+  bool HasManyOpen(const Constraint& constraint) const;  // too many variables have several values for that
 
  private:
   // A variable of a sum that is nought: the inputs count as they are, the result by its opposite.

@@ -93,7 +93,6 @@ double Supports::DrivenCost(const Constraint& constraint) {
 
 // False when it takes more than the budget.
 bool Supports::Drive(const Constraint& constraint) {
-  if (DrivenCost(constraint) == kNever) return false;
   Start();
   mTries = mBudget;
   mLeast = constraint.kind->meaning == Meaning::Minimum;
@@ -102,7 +101,7 @@ bool Supports::Drive(const Constraint& constraint) {
 }
 
 bool Supports::Spend() {
-  if (mTries == 0) return false;
+  if (mTries == 0 || mStop.IsAsked()) return false;
   --mTries;
   return true;
 }

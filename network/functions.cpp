@@ -71,10 +71,10 @@ std::size_t LongestOf(const Listing& listing) {
 
 }  // namespace
 
-Functions::Functions(Store& store, std::size_t budget)
+Functions::Functions(Store& store, std::size_t budget, Stop& stop)
     : mStore(store),
       mSemantics(store.Types()),
-      mSupports(store, mSemantics, budget),
+      mSupports(store, mSemantics, budget, stop),
       mArithmetic(store),
       mX(store.Types(), Sort::TextSet),
       mY(store.Types(), Sort::TextSet),
@@ -109,6 +109,10 @@ Status Functions::Narrow(const Constraint& constraint) {
 Status Functions::NarrowNumbers(const Constraint& constraint) {
   const Status status = mArithmetic.Narrow(constraint);
   if (mStore.HasFailed() || status != Status::Again || !mArithmetic.NeedsSupports(constraint)) return status;
+  if (mArithmetic.HasManyOpen(constraint)) {
+    mSupports.ExceedBudget(constraint, 0);
+    return status;
+  }
   return mSupports.Narrow(constraint) ? Status::Fixpoint : Status::Again;
 }
 

@@ -11,7 +11,7 @@ namespace zornet {
 
 class Functions {
  public:
-  Functions(Store& store, std::size_t budget);
+  Functions(Store& store, std::size_t budget, Stop& stop);
 
   Status Narrow(const Constraint& constraint);
 

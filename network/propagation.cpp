@@ -17,9 +17,10 @@ Propagation::Propagation(Store& store, const Limits& limits)
     : mStore(store),
       mModel(store.Model()),
       mLimits(limits),
+      mStop(limits),
       mRelations(store),
-      mFunctions(store, limits.budget),
-      mAllDifferent(store),
+      mFunctions(store, limits.budget, mStop),
+      mAllDifferent(store, mStop),
       mTables(store),
       mShapes(store) {
   Connect();
@@ -51,13 +52,21 @@ Outcome Propagation::Run() {
   if (mStore.HasFailed()) return Outcome::Contradiction;
   WakeReaders(kNone);
   while (mWaiting != 0) {
-    if (!CountStep()) return Outcome::StepLimit;
+    if (!CountStep()) return mEnd;
     const int constraint = Next();
     const Status status = Narrow(constraint);
     if (mStore.HasFailed()) return Outcome::Contradiction;
     WakeReaders(status == Status::Again ? kNone : constraint);
+    if (mStop.WasAsked()) return LeaveOff(constraint);
   }
   return Outcome::Settled;
+}
+
+// In the middle of a pass, which is still to be made.
+Outcome Propagation::LeaveOff(int constraint) {
+  --mSteps;
+  Wake(constraint);
+  return mEnd = mStop.Why();
 }
 
 // Once, before the first pass.
@@ -72,7 +81,8 @@ void Propagation::FailCycle() {
 }
 
 bool Propagation::CountStep() {
-  if (mSteps >= mLimits.steps) return false;
+  mEnd = mStop.IsAsked() ? mStop.Why() : mSteps >= mLimits.steps ? Outcome::StepLimit : Outcome::Settled;
+  if (mEnd != Outcome::Settled) return false;
   ++mSteps;
   if (mTeller && mSteps % kProgressSteps == 0) mTeller(mSteps, mWaiting);
   return true;
@@ -114,7 +124,19 @@ bool Propagation::IsShaved(int variable) {
   if (value.Sort() != Sort::Interval || value.IsOne()) return false;
   unsigned& shavings = mShavings[static_cast<std::size_t>(variable)];
   if (shavings++ == 0) mShaved.push_back(variable);
+  if (shavings == kMostShavings + 1) mStore.MeetLimit(Limit::Narrowings, variable, 0, kMostShavings);
   return shavings > kMostShavings;
+}
+
+void Propagation::AddLimitsMet(std::vector<LimitMet>& met) const {
+  if (mEnd == Outcome::Settled) return;
+  const bool isSteps = mEnd == Outcome::StepLimit;
+  const Limit limit = isSteps ? Limit::Steps : mEnd == Outcome::TimeLimit ? Limit::Time : Limit::Stop;
+  for (std::size_t i = 0; i < mWaiting; ++i) {
+    const int constraint = mQueue[(mHead + i) % mQueue.size()];
+    for (const int variable : mModel.Constraints()[static_cast<std::size_t>(constraint)].arguments)
+      met.push_back({limit, {variable}, constraint, 0, isSteps ? mLimits.steps : 0});
+  }
 }
 
 std::span<const int> Propagation::ReadersOf(int variable) const {

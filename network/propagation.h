@@ -13,6 +13,7 @@
 #include "network/functions.h"
 #include "network/relations.h"
 #include "network/shapes.h"
+#include "network/stop.h"
 #include "network/store.h"
 #include "network/tables.h"
 
@@ -29,12 +30,15 @@ class Propagation {
   void OnProgress(Teller teller) { mTeller = std::move(teller); }
 
   std::uint64_t Steps() const { return mSteps; }
-  bool CountStep();  // false at the limit: there is none left
+  bool CountStep();  // false when there is none left, and the outcome says why
+  Outcome WhyEnded() const { return mEnd; }
   const Limits& Bounds() const { return mLimits; }
 
   std::span<const int> ReadersOf(int variable) const;  // the constraints, as often as they name it
   bool IsFinished(int constraint) const { return mStates[static_cast<std::size_t>(constraint)] == Finished; }
   bool Waits(int variable) const;  // whether a constraint that reads it is not finished
+
+  void AddLimitsMet(std::vector<LimitMet>& met) const;  // at the variables that waiting constraints would narrow
 
   // As in Store, for what is settled and what waits.
   void Mark() { mMarks.push_back(mFinished.size()); }
@@ -46,6 +50,7 @@ class Propagation {
   void WakeReaders(int except);
   bool IsShaved(int variable);
   void FailCycle();
+  Outcome LeaveOff(int constraint);
   Status Narrow(int constraint);
   Status Narrow(const Constraint& constraint);
   int Next();
@@ -53,6 +58,7 @@ class Propagation {
   Store& mStore;
   const Model& mModel;
   Limits mLimits;
+  Stop mStop;
   Relations mRelations;
   Functions mFunctions;
   AllDifferent mAllDifferent;
@@ -76,6 +82,7 @@ class Propagation {
   std::vector<int> mFinished;  // in the order in which they were
   std::vector<std::size_t> mMarks;
   std::uint64_t mSteps = 0;
+  Outcome mEnd = Outcome::Settled;  // Settled: no limit was met
 };
 
 }  // namespace zornet

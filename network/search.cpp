@@ -41,22 +41,22 @@ Outcome Search::Look(std::uint64_t limit, const Solution& solution) {
       Pop();
       continue;
     }
-    if (!mPropagation.CountStep()) return Outcome::StepLimit;
+    if (!mPropagation.CountStep()) return mPropagation.WhyEnded();
     Mark();
     Choose(mFrames.back());
     const Outcome outcome = mPropagation.Run();
     if (outcome == Outcome::Settled && Visit(solution)) continue;
     if (outcome == Outcome::Contradiction) CountFailure();
     Retract();
-    if (outcome == Outcome::StepLimit) return outcome;
+    if (outcome != Outcome::Settled && outcome != Outcome::Contradiction) return outcome;
   }
   return Outcome::Settled;
 }
 
 // Whether there is something to branch on below what is settled now.
 bool Search::Visit(const Solution& solution) {
-  if (const int variable = Stuck(); variable != kNone) {
-    LeaveOpen(variable);
+  if (IsStuck()) {
+    LeaveOpen();
     return false;
   }
   std::size_t first = mFrames.empty() ? 0 : mFrames.back().first;
@@ -110,7 +110,7 @@ void Search::Pop() {
   mFrames.pop_back();
   if (!mFrames.empty()) Retract();
   if (loose && !IsLoose()) mShown.clear();
-  if (decided && !IsDecided() && mWitnessOpen != kNone) CountOpen(std::exchange(mWitnessOpen, kNone));
+  if (decided && !IsDecided() && !mWitnessOpen.empty()) CountOpen(std::exchange(mWitnessOpen, {}));
 }
 
 void Search::Choose(Frame& frame) {
@@ -155,31 +155,34 @@ bool Search::Needs(std::size_t place) const {
   return !mStore[variable].IsOne() && (place < mWanted || mPropagation.Waits(variable));
 }
 
-// A variable that is needed and cannot become known any more, or kNone.
-int Search::Stuck() {
+// Whether variables that are needed cannot become known any more. Those that unfinished constraints connect cannot
+// together, so that none is met twice.
+bool Search::IsStuck() {
   const std::uint64_t before = mStamp;
+  mStuck.clear();
   for (const std::size_t place : mUnlisted) {
     const int variable = mOrder[place];
-    if (Needs(place) && !mStore.List(variable).known && !CanBecomeKnown(variable, before)) return variable;
+    if (Needs(place) && !mStore.List(variable).known && !CanBecomeKnown(variable, before))
+      mStuck.insert(mStuck.end(), mReached.begin(), mReached.end());
   }
-  return kNone;
+  return !mStuck.empty();
 }
 
-// Whether unfinished constraints connect it to a variable that there are choices for. What has a stamp above before
-// and not the latest was reached from another that can become known.
+// Whether unfinished constraints connect it to a variable that there are choices for, or it has been asked about. What
+// has a stamp above before and not the latest was reached from another that can become known.
 bool Search::CanBecomeKnown(int variable, std::uint64_t before) {
   const auto stamp = [this](int other) -> std::uint64_t& { return mStamps[static_cast<std::size_t>(other)]; };
   if (stamp(variable) > before) return true;
   stamp(variable) = ++mStamp;
-  std::vector<int> reached{variable};
-  for (std::size_t i = 0; i < reached.size(); ++i) {
-    for (const int number : mPropagation.ReadersOf(reached[i])) {
+  mReached.assign(1, variable);
+  for (std::size_t i = 0; i < mReached.size(); ++i) {
+    for (const int number : mPropagation.ReadersOf(mReached[i])) {
       if (mPropagation.IsFinished(number)) continue;
       for (const int other : mStore.Model().Constraints()[static_cast<std::size_t>(number)].arguments) {
         if (mStore[other].IsOne() || stamp(other) == mStamp) continue;
         if (mStore.List(other).known || stamp(other) > before) return true;
         stamp(other) = mStamp;
-        reached.push_back(other);
+        mReached.push_back(other);
       }
     }
   }
@@ -187,23 +190,23 @@ bool Search::CanBecomeKnown(int variable, std::uint64_t before) {
 }
 
 // One open branch is enough to leave a whole assignment of the wanted variables open, unless a witness is found.
-void Search::LeaveOpen(int variable) {
+void Search::LeaveOpen() {
   if (IsDecided()) {
-    mWitnessOpen = variable;
+    mWitnessOpen = mStuck;
   } else {
-    CountOpen(variable);
+    CountOpen(mStuck);
   }
 }
 
-void Search::CountOpen(int variable) {
+void Search::CountOpen(const std::vector<int>& variables) {
   ++mOpen;
-  mOpenVariable = variable;
+  mOpenVariables.insert(variables.begin(), variables.end());
 }
 
 void Search::Leaf(const Solution& solution) {
   if (!Confirm()) return;
   if (IsLoose()) mShown.insert(Shown());
-  mWitnessOpen = kNone;
+  mWitnessOpen.clear();
   for (auto frame = mFrames.rbegin(); frame != mFrames.rend() && frame->decided; ++frame)
     frame->next = frame->halved ? 2 : frame->listing.count;
   ++mFound;

@@ -28,9 +28,9 @@ class Search {
   Outcome Run(std::uint64_t limit, const Solution& solution);
 
   std::uint64_t Found() const { return mFound; }
-  std::uint64_t Open() const { return mOpen; }        // branches left because a variable stays unknown in them
-  int OpenVariable() const { return mOpenVariable; }  // one such variable
-  bool IsExhausted() const { return mExhausted; }     // nothing is left to try
+  std::uint64_t Open() const { return mOpen; }  // branches left because variables stay unknown in them
+  const std::set<int>& OpenVariables() const { return mOpenVariables; }  // these variables
+  bool IsExhausted() const { return mExhausted; }                        // nothing is left to try
 
  private:
   struct Frame {
@@ -56,10 +56,10 @@ class Search {
   void Mark();
   void Retract();
   bool Needs(std::size_t place) const;
-  int Stuck();
+  bool IsStuck();
   bool CanBecomeKnown(int variable, std::uint64_t before);
-  void LeaveOpen(int variable);
-  void CountOpen(int variable);
+  void LeaveOpen();
+  void CountOpen(const std::vector<int>& variables);
   void Leaf(const Solution& solution);
   bool Confirm();
   bool IsDecided() const { return !mFrames.empty() && mFrames.back().decided; }
@@ -74,15 +74,17 @@ class Search {
   std::vector<std::size_t> mUnlisted;  // places in mOrder whose values could not be listed at first
   std::vector<std::uint64_t> mStamps;  // when CanBecomeKnown reached each variable last
   std::uint64_t mStamp = 0;
+  std::vector<int> mReached;             // by CanBecomeKnown, for the latest variable
+  std::vector<int> mStuck;               // variables that cannot become known any more
   std::vector<std::uint64_t> mFailures;  // contradictions of each constraint so far
   std::uint64_t mFailed = 0;             // of all
   std::vector<Frame> mFrames;
-  std::vector<Exact> mExact;     // arguments of the constraint that is confirmed
-  std::set<std::string> mShown;  // solutions below the first loose frame
-  int mWitnessOpen = kNone;      // a variable that stayed open while a witness was looked for
+  std::vector<Exact> mExact;      // arguments of the constraint that is confirmed
+  std::set<std::string> mShown;   // solutions below the first loose frame
+  std::vector<int> mWitnessOpen;  // variables that stayed open while a witness was looked for
   std::uint64_t mFound = 0;
   std::uint64_t mOpen = 0;
-  int mOpenVariable = kNone;
+  std::set<int> mOpenVariables;
   bool mGoOn = true;
   bool mExhausted = false;
 };

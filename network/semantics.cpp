@@ -220,6 +220,11 @@ bool Semantics::CanInvert(const Kind& kind, std::size_t position) {
   }
 }
 
+bool Semantics::IsManifold(const Kind& kind, std::size_t position) {
+  const bool isFold = kind.meaning == Meaning::Lower || kind.meaning == Meaning::Upper;
+  return position == 0 ? isFold && !kind.reified : kind.meaning == Meaning::Contains && !kind.reified;
+}
+
 Semantics::Answers Semantics::Invert(const Constraint& constraint, std::size_t position,
                                      std::span<const Exact> values) {
   if (!constraint.kind->reified) return InvertTrue(constraint, position, values);

@@ -54,6 +54,9 @@ class Semantics {
   // Whether Invert ever lists something for an argument.
   static bool CanInvert(const Kind& kind, std::size_t position);
 
+  // Whether an argument that Invert does not list has many values, rather than all but some.
+  static bool IsManifold(const Kind& kind, std::size_t position);
+
   template <class T>
   static bool Relates(Meaning meaning, const T& x, const T& y);
   bool Holds(const Constraint& constraint, std::span<const Exact> values);

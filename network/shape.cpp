@@ -123,6 +123,7 @@ void Shape::Settle() {
     beginning = ZORString(common);
   }
   if (characters.none()) longest = std::min(longest, 0);
+  if (LengthOf(least) > 0) shortest = std::max(shortest, 1);
   while (shortest <= longest && !Fits(shortest)) ++shortest;
   const Characters needed = CharactersOf(beginning.View()) | CharactersOf(end.View());
   if (shortest > longest || (needed & ~characters).any()) return BecomeNothing();

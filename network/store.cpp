@@ -95,7 +95,10 @@ void Store::Meet(int variable, const Value& outcome) {
     Narrow(variable, outcome);
     if (MeasureOf(held) != before) mTrail.push_back(std::move(saved));
   }
-  if (MeasureOf(held) == before) return;
+  if (MeasureOf(held) == before) {
+    if (before.undefined && !outcome.IsNil()) ExceedSet(variable, outcome.Any().GetCardinality());
+    return;
+  }
   mListed[static_cast<std::size_t>(variable)] = 0;
   Changed(variable, shown);
   if (before.undefined) FitToShape(variable);
@@ -136,7 +139,37 @@ void Store::Bound(int variable, std::int64_t lowest, std::int64_t highest) {
   range.SetRange(static_cast<ZORLong>(lowest), static_cast<ZORLong>(highest));
   const bool unlisted = held.Sort() == Sort::Integer && !HasCandidates(variable);
   if (!unlisted || lowest == highest) return Meet(variable, range);
-  if (highest - lowest < static_cast<std::int64_t>(zor::kSetLimit)) MeetNumbers(variable, range.Numbers());
+  const auto count = static_cast<std::uint64_t>(highest - lowest + 1);
+  if (count > MostListed(variable)) return ExceedSet(variable, count);
+  MeetNumbers(variable, range.Numbers());
+}
+
+std::uint64_t Store::MostListed(int variable) const {
+  return (*this)[variable].Sort() == Sort::IntegerSet ? ZORVadEnumInteger::kListLimit : zor::kSetLimit;
+}
+
+void Store::ExceedSet(int variable, std::uint64_t count) {
+  const std::uint64_t most = MostListed(variable);
+  if (count == 0 || count > most) MeetLimit(Limit::Set, variable, count, most);
+}
+
+// An interval is never narrowed again, which constraint ever is next.
+void Store::MeetLimit(Limit limit, int variable, std::uint64_t count, std::uint64_t most) {
+  const int until = limit == Limit::Narrowings ? kNone : mConstraint;
+  mLimitsMet.try_emplace({until, variable, limit}, LimitMet{limit, {variable}, mConstraint, count, most});
+}
+
+void Store::ForgetLimits() {
+  if (!mMarks.empty() || mConstraint == kNone) return;
+  const auto first = mLimitsMet.lower_bound({mConstraint, 0, Limit()});
+  mLimitsMet.erase(first, mLimitsMet.lower_bound({mConstraint + 1, 0, Limit()}));
+}
+
+std::vector<LimitMet> Store::LimitsMet() const {
+  std::vector<LimitMet> met;
+  met.reserve(mLimitsMet.size());
+  for (const auto& each : mLimitsMet) met.push_back(each.second);
+  return met;
 }
 
 std::int64_t Store::LowestNumber(int variable) const {
@@ -206,7 +239,7 @@ void Store::MeetCandidates(int variable, Listing candidates) {
   if (candidates.count <= 1)
     return candidates.sort == Sort::Text ? MeetTexts(variable, std::move(candidates.texts))
                                          : MeetNumbers(variable, std::move(candidates.numbers));
-  if (!held.known && candidates.count > zor::kSetLimit) return;
+  if (!held.known && candidates.count > MostListed(variable)) return ExceedSet(variable, candidates.count);
   const bool hadNone = !held.known;
   const std::string shown = mWatcher != nullptr ? Show(variable) : "";
   if (!mMarks.empty()) {

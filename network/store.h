@@ -7,8 +7,10 @@
 
 #include <array>
 #include <cstdint>
+#include <map>
 #include <memory>
 #include <string>
+#include <tuple>
 #include <vector>
 
 #include "network/ZORModel.h"
@@ -62,13 +64,21 @@ class Store {
   Value& CopyOf(int variable);
 
   // Changes are recorded under the constraint and operation named last.
-  void StartConstraint(int constraint) { mConstraint = constraint; }
+  void StartConstraint(int constraint) {
+    mConstraint = constraint;
+    if (!mLimitsMet.empty()) ForgetLimits();
+  }
   void StartOperation(Operation operation);
   void Meet(int variable, const Value& outcome);
   void MeetTexts(int variable, std::vector<ZORString> texts);           // ascending; none is a contradiction
   void MeetNumbers(int variable, std::vector<ZORLong> numbers);         // so are these; of an interval both ends
   void Bound(int variable, std::int64_t lowest, std::int64_t highest);  // keeps the numbers from one to the other
   void Fail(int variable);
+
+  // Recorded under the constraint named last, until it is named again; in a search for good.
+  void MeetLimit(Limit limit, int variable, std::uint64_t count, std::uint64_t most);
+  void ExceedSet(int variable, std::uint64_t count);  // of values, or 0
+  std::vector<LimitMet> LimitsMet() const;
 
   bool HasCandidates(int variable) const;  // an Undefined single that is one of those that List answers
 
@@ -114,6 +124,8 @@ class Store {
   void FitToShape(int variable);
   void HoldShape(int variable, Shape shape);
   std::string Show(int variable) const;
+  std::uint64_t MostListed(int variable) const;
+  void ForgetLimits();
 
   const zornet::Types& mTypes;
   const zornet::Model& mModel;
@@ -131,6 +143,7 @@ class Store {
   };
   std::vector<Marked> mMarks;
   std::array<OperationCounts, kOperations> mCounts{};
+  std::map<std::tuple<int, int, Limit>, LimitMet> mLimitsMet;  // by constraint and variable
   Watcher* mWatcher = nullptr;
   int mConstraint = kNone;
   Operation mOperation = Operation::Choice;

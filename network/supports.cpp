@@ -1,6 +1,7 @@
 #include "network/supports.h"
 
 #include <algorithm>
+#include <cmath>
 #include <limits>
 #include <utility>
 
@@ -43,7 +44,7 @@ void Supports::Column::Start() {
   lowest = IsListed() ? listing->count : 0;
   behindHighest = 0;
   found.clear();
-  open = met = false;
+  open = tooMany = met = false;
 }
 
 void Supports::Column::Keep(std::size_t place) {
@@ -56,28 +57,47 @@ void Supports::Column::Keep(std::size_t place) {
   }
 }
 
-Supports::Supports(Store& store, Semantics& semantics, std::size_t budget)
-    : mStore(store), mSemantics(semantics), mBudget(budget), mColumnOfVariable(store.Model().Variables().size(), 0) {}
+Supports::Supports(Store& store, Semantics& semantics, std::size_t budget, Stop& stop)
+    : mStore(store),
+      mSemantics(semantics),
+      mBudget(budget),
+      mStop(stop),
+      mColumnOfVariable(store.Model().Variables().size(), 0) {}
 
 bool Supports::Narrow(const Constraint& constraint) {
   Prepare(constraint);
   mTargets.clear();
+  double beyond = std::numeric_limits<double>::infinity();
   for (std::size_t position = mForward + 1; position-- > 0;) {
     const bool forward = position == mForward;
     if (!forward && !Semantics::CanInvert(*constraint.kind, position)) continue;
     const double combinations = Combinations(constraint, position);
     if (combinations <= static_cast<double>(mBudget)) {
       mTargets.emplace_back(combinations * (forward ? 1 : kInversionCost), position);
+    } else {
+      beyond = std::min(beyond, combinations);
     }
   }
   std::sort(mTargets.begin(), mTargets.end(),
             [](const auto& a, const auto& b) { return a.first != b.first ? a.first < b.first : a.second > b.second; });
   const double driven = DrivenCost(constraint);
-  const bool isCheapest = mTargets.empty() || driven < mTargets.front().first;
+  const bool isDriven = !std::isinf(driven) && (mTargets.empty() || driven < mTargets.front().first);
   const auto reached = [&](const auto& target) { return Try(constraint, target.second); };
-  if (!(isCheapest && Drive(constraint)) && std::none_of(mTargets.begin(), mTargets.end(), reached)) return false;
-  Apply(constraint);
-  return true;
+  if ((isDriven && Drive(constraint)) || std::any_of(mTargets.begin(), mTargets.end(), reached)) {
+    Apply(constraint);
+    return true;
+  }
+  if (mStop.WasAsked()) return false;
+  if (isDriven || !std::isinf(beyond)) ExceedBudget(constraint, std::isinf(beyond) ? 0 : beyond);
+  return false;
+}
+
+void Supports::ExceedBudget(const Constraint& constraint, double combinations) {
+  constexpr double kMostCounted = 1e15;
+  const auto count = static_cast<std::uint64_t>(combinations < kMostCounted ? combinations : 0);
+  for (const int variable : constraint.arguments) {
+    if (!mStore[variable].IsOne()) mStore.MeetLimit(Limit::Budget, variable, count, mBudget);
+  }
 }
 
 void Supports::Prepare(const Constraint& constraint) {
@@ -161,14 +181,14 @@ double Supports::Combinations(const Constraint& constraint, std::size_t target) 
   return combinations;
 }
 
-// False when a listed target has more supports than can be listed.
+// False when a listed target has more supports than can be listed, or it is to end.
 bool Supports::Try(const Constraint& constraint, std::size_t target) {
   const bool none = Combinations(constraint, target) == 0;
   Start();
   if (none) return true;
   for (Column* column : mTried) Choose(*column, 0);
   do {
-    if (!TryOne(constraint, target)) return false;
+    if (mStop.IsAsked() || !TryOne(constraint, target)) return false;
   } while (!HasAll() && Advance());
   return true;
 }
@@ -188,7 +208,10 @@ bool Supports::TryOne(const Constraint& constraint, std::size_t target) {
   } else {
     auto answers = mSemantics.Invert(constraint, target, mExact);
     if (!answers && At(target).IsListed()) return false;
-    if (!answers) accepted = At(target).open = true;
+    if (!answers) {
+      accepted = At(target).open = true;
+      At(target).tooMany = At(target).tooMany || Semantics::IsManifold(*constraint.kind, target);
+    }
     if (answers) {
       for (Answer& answer : *answers) accepted = Accept(target, std::move(answer)) || accepted;
     }
@@ -291,18 +314,19 @@ void Supports::MeetNumbers(Column& column) {
 }
 
 void Supports::MeetFound(Column& column) {
+  if (column.tooMany) mStore.ExceedSet(column.variable, 0);
   if (column.open) return;
   auto& found = column.found;
   std::sort(found.begin(), found.end(), IsBelow);
   found.erase(std::unique(found.begin(), found.end()), found.end());
   if (IsText(mStore[column.variable].Sort())) {
-    if (found.size() > zor::kSetLimit) return;
+    if (found.size() > zor::kSetLimit) return mStore.ExceedSet(column.variable, found.size());
     std::vector<ZORString> texts;
     texts.reserve(found.size());
     for (Answer& answer : found) texts.push_back(std::move(answer.text));
     mStore.MeetTexts(column.variable, std::move(texts));
   } else {
-    if (found.size() > ZORVadEnumInteger::kListLimit) return;
+    if (found.size() > ZORVadEnumInteger::kListLimit) return mStore.ExceedSet(column.variable, found.size());
     std::vector<ZORLong> numbers;
     numbers.reserve(found.size());
     for (const Answer& answer : found) numbers.push_back(answer.number);

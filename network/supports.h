@@ -10,16 +10,18 @@
 #include <vector>
 
 #include "network/semantics.h"
+#include "network/stop.h"
 #include "network/store.h"
 
 namespace zornet {
 
 class Supports {
  public:
-  Supports(Store& store, Semantics& semantics, std::size_t budget);
+  Supports(Store& store, Semantics& semantics, std::size_t budget, Stop& stop);
 
-  // False when the combinations are more than the budget or cannot be listed; then nothing has changed.
+  // False when the combinations are more than the budget, cannot be listed, or it is to end; then nothing has changed.
   bool Narrow(const Constraint& constraint);
+  void ExceedBudget(const Constraint& constraint, double combinations);  // 0 where they were not counted
 
  private:
   // One variable of the constraint: its domain, and the values with a support so far. Of a range of numbers only the
@@ -37,6 +39,7 @@ class Supports {
     std::size_t index = 0;                      // the value that is tried
     std::vector<Answer> found;                  // values of a variable that is not listed
     bool open = false;                          // found does not hold all of them
+    bool tooMany = false;                       // since there are more than a set lists
     bool met = false;                           // its variable has been narrowed
 
     bool IsListed() const { return listing->known; }
@@ -91,6 +94,7 @@ class Supports {
   Store& mStore;
   Semantics& mSemantics;
   std::size_t mBudget;
+  Stop& mStop;
   std::size_t mForward = 0;      // the position of the result, or behind all when there is none: a relation is posted
   std::size_t mCount = 0;        // of the columns in use
   std::vector<Column> mColumns;  // one for each different variable

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstddef>
+#include <string>
 #include <string_view>
 
 #include "host/ZORText.h"
@@ -16,6 +17,16 @@ inline ZORString ToZor(std::string_view text) { return {text.data(), text.size()
 inline std::string_view ToView(const ZORString& text) { return text.View(); }
 
 const ZORString& GreatestText();
+
+// As models write it.
+inline std::string Quoted(std::string_view text) {
+  std::string quoted = "\"";
+  for (const char c : text) {
+    if (c == '"' || c == '\\') quoted += '\\';
+    quoted += c;
+  }
+  return quoted += '"';
+}
 
 // One space is the least value of a single string, the empty text that of a set. The module recognises these values by
 // their state before it looks at their text, so its answers on them are not always about the text.

@@ -2,6 +2,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <limits>
 #include <memory>
 #include <new>
@@ -155,15 +156,31 @@ std::string Value::Print() const {
   return std::string(out.View());
 }
 
-// Prints the greatest text of a set as Max: the union of the greatest value and the rest.
 std::string Value::Show() const {
   if (mSort == Sort::IntegerSet && IsOne()) return fmt::to_string(LowestNumber());
-  if (mSort != Sort::TextSet || !IsKnown() || HighestText() != GreatestText()) return Print();
+  if (!IsText(mSort) || !IsKnown()) return Print();
+  const bool greatest = mSort == Sort::TextSet && HighestText() == GreatestText();
+  std::string shown = greatest ? ShowWithMax() : Print();
+  const std::size_t quoted = (mSort == Sort::Text ? 1 : mValue->GetCardinality()) - (greatest ? 1 : 0);
+  const auto quotes = static_cast<std::size_t>(std::count(shown.begin(), shown.end(), '"'));
+  return quotes > 2 * quoted || shown.find('\\') != std::string::npos ? ShowEscaped() : shown;
+}
+
+// Prints the greatest text of a set as Max: the union of the greatest value and the rest.
+std::string Value::ShowWithMax() const {
   Value shown(*this), rest(*this);
   shown.Text().CalcMaxValue();
   rest.Text().RemoveExactValue(GreatestText());
   shown.Any().Unite(rest.Any());
   return shown.Print();
+}
+
+// The module prints no escapes.
+std::string Value::ShowEscaped() const {
+  std::string shown;
+  for (const ZORString& text : Texts())
+    shown += (shown.empty() ? "" : ", ") + (text == GreatestText() ? "Max" : Quoted(ToView(text)));
+  return IsOne() ? shown : "{ " + shown + " }";
 }
 
 }  // namespace zornet

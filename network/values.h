@@ -69,11 +69,13 @@ class Value {
   ZORLong HighestNumber() const;
   std::vector<ZORLong> Numbers() const;
 
-  std::string Show() const;   // the text form
+  std::string Show() const;   // as models write it
   std::string Print() const;  // as the module prints it: the greatest text of a set in full
 
  private:
   Value(const ZORVaDoObjectDescriptor* descriptor, zornet::Sort sort);
+  std::string ShowWithMax() const;
+  std::string ShowEscaped() const;
 
   const ZORVaDoObjectDescriptor* mDescriptor;
   void* mMemory;

@@ -16,31 +16,31 @@ constexpr std::size_t kMostLayered = 60;  // nodes; layers of more are too wide 
 
 constexpr std::string_view kGrey = "#55606e", kBlue = "#3367a8", kRed = "#b3261e";
 
+std::string_view Entity(char c) {
+  switch (c) {
+    case '&':
+      return "&amp;";
+    case '<':
+      return "&lt;";
+    case '>':
+      return "&gt;";
+    case '"':
+      return "&quot;";
+    case '\\':
+      return "\\\\";
+    default:
+      return "";
+  }
+}
+
+// In labels and tooltips alike dot reads entities, and what stands behind a backslash.
 std::string Escape(std::string_view text) {
   std::string escaped;
   for (const char c : text) {
-    if (c == '&')
-      escaped += "&amp;";
-    else if (c == '<')
-      escaped += "&lt;";
-    else if (c == '>')
-      escaped += "&gt;";
-    else if (c == '"')
-      escaped += "&quot;";
-    else
-      escaped += c;
+    const std::string_view entity = Entity(c);
+    entity.empty() ? escaped += c : escaped += entity;
   }
   return escaped;
-}
-
-// Inside the quotes of a label or tooltip.
-std::string Quote(std::string_view text) {
-  std::string quoted;
-  for (const char c : text) {
-    if (c == '"' || c == '\\') quoted += '\\';
-    quoted += c;
-  }
-  return quoted;
 }
 
 // The first width bytes, or some fewer, so that no character is cut.
@@ -144,8 +144,8 @@ Drawing::Drawing(const Network& network, const Names& names, const Explanation* 
     : mNetwork(network),
       mModel(network.GetModel()),
       mNames(names),
-      mShown(mModel.Variables().size(), explanation == nullptr),
-      mDrawn(mModel.Constraints().size(), explanation == nullptr) {
+      mShown(mModel.Variables().size(), explanation == nullptr ? 1 : 0),
+      mDrawn(mModel.Constraints().size(), explanation == nullptr ? 1 : 0) {
   if (explanation != nullptr) Show(*explanation);
   for (std::size_t v = 0; v < mShown.size(); ++v) {
     if (mModel.Variables()[v].constant) mShown[v] = 0;
@@ -198,7 +198,7 @@ void Drawing::DrawVariable(int variable) {
   Add("  v{} [shape=box, style=\"rounded,filled\", fillcolor=\"{}\", color=\"{}\", penwidth={}, "
       "label=<<b>{}</b><br/>{}>, tooltip=\"{}\"];\n",
       variable, Fill(domain), nil ? kRed : kGrey, nil ? 2 : 1, Escape(mNames.OfVariable(variable)),
-      Fold(domain.Print()), Quote(mNames.DeclarationOf(variable)));
+      Fold(domain.Print()), Escape(mNames.DeclarationOf(variable)));
 }
 
 bool HasResult(const Constraint& constraint) { return !constraint.kind->IsRelation() || constraint.kind->reified; }
@@ -241,11 +241,11 @@ void Drawing::DrawAsEdge(int number) {
   const Constraint& constraint = At(number);
   const auto input = std::find_if(constraint.arguments.begin(), constraint.arguments.end(),
                                   [this](int variable) { return Shows(variable); });
-  const std::string tooltip = Quote(mNames.OfConstraint(number));
+  const std::string tooltip = Escape(mNames.OfConstraint(number));
   Add("  v{} -> v{} [color=\"{}\", fontcolor=\"{}\", penwidth={}, label=\"{}\", tooltip=\"{}\", "
       "labeltooltip=\"{}\"];\n",
       *input, constraint.Result(), Line(number), Line(number), Line(number) == kRed ? 2 : 1,
-      Quote(Label(number, constraint.Inputs())), tooltip, tooltip);
+      Escape(Label(number, constraint.Inputs())), tooltip, tooltip);
 }
 
 void Drawing::DrawAsNode(int number) {
@@ -253,7 +253,7 @@ void Drawing::DrawAsNode(int number) {
   Add("  c{} [shape=ellipse, height=0.3, margin=\"0.05,0.02\", color=\"{}\", fontcolor=\"{}\", penwidth={}, "
       "label=\"{}\", style=filled, fillcolor=white, tooltip=\"{}\"];\n",
       number, Line(number), Line(number), Line(number) == kRed ? 2 : 1,
-      Quote(Label(number, constraint.arguments.size())), Quote(mNames.OfConstraint(number)));
+      Escape(Label(number, constraint.arguments.size())), Escape(mNames.OfConstraint(number)));
   for (std::size_t i = 0; i < constraint.arguments.size(); ++i) {
     if (Shows(constraint.arguments[i])) DrawEdge(constraint, number, i);
   }

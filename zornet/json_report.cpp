@@ -1,5 +1,6 @@
 #include <nlohmann/json.hpp>
 
+#include "zornet/limits.h"
 #include "zornet/render.h"
 #include "zornet/report.h"
 
@@ -19,6 +20,10 @@ std::string_view Describe(Outcome outcome) {
       return "step limit";
     case Outcome::Open:
       return "open";
+    case Outcome::TimeLimit:
+      return "time limit";
+    case Outcome::Stopped:
+      return "interrupted";
   }
   return "";
 }
@@ -49,6 +54,13 @@ Json Describe(const Domain& domain, Sort sort) {
   return json;
 }
 
+// The one value of a variable in a solution.
+Json ValueOf(const Domain& domain, Sort sort) {
+  if (IsText(sort)) return domain.Texts().front();
+  if (sort == Sort::Boolean) return domain.Lowest() != 0;
+  return domain.Lowest();
+}
+
 class JsonReport : public Report {
  public:
   JsonReport(const Source& source, const Places& places, const Model& model, std::ostream& results)
@@ -59,7 +71,7 @@ class JsonReport : public Report {
     for (const Diagnostic& diagnostic : diagnostics.All()) {
       const Location at = locate(diagnostic.extent.begin);
       Tell({{"event", diagnostic.severity == Diagnostic::Error ? "error" : "note"},
-            {"file", source.Name()},
+            {"file", source.NameAt(diagnostic.extent.begin)},
             {"line", at.line},
             {"column", at.column},
             {"length", MarkedLength(source, diagnostic.extent)},
@@ -71,17 +83,21 @@ class JsonReport : public Report {
   void Narrowed(const Narrowing& narrowing) override { Tell(ToJson("narrowing", narrowing)); }
 
   void Variables(const Network& network) override {
+    const LimitsByVariable limits = LimitsOf(network);
     for (const int variable : mModel.Wanted()) {
       const Sort sort = mModel.Variables()[static_cast<std::size_t>(variable)].sort;
       Json json{{"event", "variable"}, {"name", mNames.OfVariable(variable)}, {"type", NamesOf(sort).type}};
       json.update(Describe(network[variable], sort));
+      AddLimits(json, limits, variable);
       Tell(json);
     }
   }
 
   void Solution(const Network& network, std::uint64_t number) override {
     Json values = Json::object();
-    for (const int variable : mModel.Wanted()) values[mNames.OfVariable(variable)] = network[variable].Print();
+    for (const int variable : mModel.Wanted())
+      values[mNames.OfVariable(variable)] =
+          ValueOf(network[variable], mModel.Variables()[static_cast<std::size_t>(variable)].sort);
     Tell({{"event", "solution"}, {"number", number}, {"values", std::move(values)}});
     mResults.flush();
   }
@@ -90,11 +106,13 @@ class JsonReport : public Report {
     Json steps = Json::array(), declared = Json::array();
     for (const auto& start : explanation.declared) declared.push_back(mNames.OfVariable(start.variable));
     for (const Narrowing& step : explanation.narrowings) steps.push_back(ToJson("narrowing", step));
-    Tell({{"event", "explanation"},
-          {"name", mNames.OfVariable(variable)},
-          {"value", network[variable].Print()},
-          {"declared", std::move(declared)},
-          {"narrowings", std::move(steps)}});
+    Json json{{"event", "explanation"},
+              {"name", mNames.OfVariable(variable)},
+              {"value", network[variable].Print()},
+              {"declared", std::move(declared)},
+              {"narrowings", std::move(steps)}};
+    AddLimits(json, LimitsOf(network), variable.index);
+    Tell(json);
   }
 
   void Statistics(const Network& network) override {
@@ -126,9 +144,12 @@ class JsonReport : public Report {
               {"calls", total.calls},
               {"changes", total.changes},
               {"milliseconds", summary.milliseconds}};
-    if (const auto& search = summary.search)
-      json.update({{"solutions", search->solutions}, {"complete", search->complete}, {"open", search->open}});
-    if (summary.search && summary.search->open != 0) json["variable"] = mNames.OfVariable(summary.search->openVariable);
+    if (const auto& search = summary.search) {
+      json.update({{"solutions", search->solutions}, {"complete", search->complete}});
+      json["open"] = Json::array();
+      for (const Var variable : search->openVariables) json["open"].push_back(mNames.OfVariable(variable));
+    }
+    for (const Limit limit : LimitsOf(network, summary.outcome)) json["limits"].push_back(NameOf(limit));
     if (const int failed = network.FailedConstraint(); failed != kNone) {
       json["variable"] = mNames.OfVariable(network.FailedVariable());
       json["constraint"] = mNames.OfConstraint(failed);
@@ -141,10 +162,7 @@ class JsonReport : public Report {
  private:
   Json ToJson(std::string_view event, const Narrowing& narrowing) const {
     Json json{{"event", event}};
-    if (narrowing.constraint != kNone) {
-      json["line"] = mNames.LineOfConstraint(narrowing.constraint);
-      json["constraint"] = mNames.OfConstraint(narrowing.constraint);
-    }
+    AddConstraint(json, narrowing.constraint);
     json["operation"] = narrowing.operation;
     json["target"] = mNames.OfVariable(narrowing.variable);
     json["before"] = narrowing.before;
@@ -152,8 +170,25 @@ class JsonReport : public Report {
     return json;
   }
 
-  // File names and broken models need not be UTF-8.
-  void Tell(const Json& json) { mResults << json.dump(-1, ' ', false, Json::error_handler_t::replace) << '\n'; }
+  void AddConstraint(Json& json, int constraint) const {
+    if (constraint == kNone) return;
+    json["line"] = mNames.LineOfConstraint(constraint);
+    json["constraint"] = mNames.OfConstraint(constraint);
+  }
+
+  void AddLimits(Json& json, const LimitsByVariable& limits, int variable) const {
+    const auto [first, last] = limits.equal_range(variable);
+    for (auto at = first; at != last; ++at) {
+      Json limit{{"limit", NameOf(at->second.limit)}};
+      if (at->second.most != 0) limit["most"] = at->second.most;
+      if (at->second.count != 0) limit["count"] = at->second.count;
+      AddConstraint(limit, at->second.constraint);
+      json["limits"].push_back(std::move(limit));
+    }
+  }
+
+  // File names and broken models need not be UTF-8. In ASCII alone nothing acts on a terminal.
+  void Tell(const Json& json) { mResults << json.dump(-1, ' ', true, Json::error_handler_t::replace) << '\n'; }
 
   const Model& mModel;
   Names mNames;

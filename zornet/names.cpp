@@ -1,5 +1,6 @@
 #include <fmt/core.h>
 
+#include "zornet/render.h"
 #include "zornet/report.h"
 
 namespace zornet {
@@ -23,18 +24,19 @@ OperationCount Total(const std::vector<OperationCount>& counts) {
 // On one line: runs of blanks outside of quotes become one, and comments go.
 std::string Names::Written(Extent extent) const {
   std::string written;
-  bool quoted = false, comment = false;
+  bool quoted = false, escaped = false, comment = false;
   for (const char c : mSource.Text(extent)) {
     if (comment) {
       comment = c != '\n';
       continue;
     }
-    if (c == '"') quoted = !quoted;
+    if (c == '"' && !escaped) quoted = !quoted;
+    escaped = quoted && c == '\\' && !escaped;
     comment = c == '%' && !quoted;
     const bool blank = !quoted && kBlanks.find(c) != std::string_view::npos;
     if (!comment && !(blank && written.ends_with(' '))) written += blank ? ' ' : c;
   }
-  return written;
+  return Harmless(written);
 }
 
 std::string Names::OfConstraint(int constraint) const {
@@ -48,24 +50,24 @@ std::string Names::OfVariable(int variable) const {
 }
 
 std::string Names::DeclarationOf(int variable) const {
-  const std::size_t line = LineOfVariable(variable);
-  return Written({mSource.LineBegin(line), mSource.Line(line).size()});
+  return Written(mSource.LineAt(mPlaces.variables[static_cast<std::size_t>(variable)].begin));
 }
 
 std::size_t Names::LineOfConstraint(int constraint) const {
   return mSource.LineOf(mPlaces.constraints[static_cast<std::size_t>(constraint)].begin);
 }
 
-std::size_t Names::LineOfVariable(int variable) const {
-  return mSource.LineOf(mPlaces.variables[static_cast<std::size_t>(variable)].begin);
-}
-
 std::string Names::PlaceOfConstraint(int constraint) const {
-  return constraint == kNone ? mSource.Name() : fmt::format("{}:{}", mSource.Name(), LineOfConstraint(constraint));
+  return constraint == kNone ? Harmless(mSource.Name())
+                             : Place(mPlaces.constraints[static_cast<std::size_t>(constraint)]);
 }
 
 std::string Names::PlaceOfVariable(int variable) const {
-  return fmt::format("{}:{}", mSource.Name(), LineOfVariable(variable));
+  return Place(mPlaces.variables[static_cast<std::size_t>(variable)]);
+}
+
+std::string Names::Place(Extent extent) const {
+  return fmt::format("{}:{}", Harmless(mSource.NameAt(extent.begin)), mSource.LineOf(extent.begin));
 }
 
 }  // namespace zornet

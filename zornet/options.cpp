@@ -3,7 +3,15 @@
 #include <fmt/core.h>
 
 #include <CLI/CLI.hpp>
+#include <algorithm>
 #include <charconv>
+#include <chrono>
+#include <cmath>
+#include <iostream>
+#include <sstream>
+
+#include "language/spelling.h"
+#include "zornet/render.h"
 
 namespace zornet {
 
@@ -15,7 +23,8 @@ constexpr char kAbout[] =
 
 constexpr char kFooter[] =
     "Exit codes: 0 settled, 1 contradiction, 2 usage or file, 3 error in the model, 4 module not loadable,\n"
-    "5 step limit, 6 searched to the end but a variable stays open, 7 out of memory.\n"
+    "5 step or time limit, 6 searched to the end but variables stay open, 7 out of memory,\n"
+    "130 SIGINT, 143 SIGTERM.\n"
     "The language of models and all else: man zornet.";
 
 // Digits alone: to the library a minus sign is part of an unsigned number, which then wraps.
@@ -30,12 +39,57 @@ CLI::Validator WholeFrom(std::uint64_t least) {
   return {check, ""};
 }
 
+// Fractions too, but no exponents.
+std::optional<double> SecondsIn(const std::string& text) {
+  double seconds = 0;
+  const char* const last = text.data() + text.size();
+  const auto [end, error] = std::from_chars(text.data(), last, seconds, std::chars_format::fixed);
+  const bool good = error == std::errc() && end == last && std::isfinite(seconds) && !std::signbit(seconds);
+  return good ? std::optional(seconds) : std::nullopt;
+}
+
+CLI::Validator Seconds() {
+  const auto check = [](const std::string& text) {
+    return SecondsIn(text) ? std::string() : fmt::format("expected seconds, such as 1.5, not '{}'", text);
+  };
+  return {check, ""};
+}
+
+// From now on, which is close to the start of the program.
+void SetTimeLimit(double seconds, Limits& limits) {
+  constexpr double kMost = 1e9;  // about as long as for ever, and a clock can count it
+  const std::chrono::duration<double> limit(std::min(seconds, kMost));
+  limits.deadline =
+      std::chrono::steady_clock::now() + std::chrono::duration_cast<std::chrono::steady_clock::duration>(limit);
+}
+
+// What is no option and no file.
+std::string RefuseExtra(const CLI::App& app) {
+  const std::vector<std::string> extras = app.remaining();
+  const auto option =
+      std::find_if(extras.begin(), extras.end(), [](const auto& word) { return word.starts_with('-'); });
+  if (option == extras.end()) return fmt::format("one model at a time, not '{}' too", extras.front());
+  std::vector<std::string> names;
+  for (const CLI::Option* known : app.get_options()) names.push_back(known->get_name());
+  const std::vector<std::string_view> views(names.begin(), names.end());
+  const std::string word = option->substr(0, option->find('='));
+  return fmt::format("there is no option '{}'{}", word, Suggestion(word, views));
+}
+
+std::string Failure(const CLI::App* app, const CLI::Error& error) {
+  const bool extra = error.get_exit_code() == static_cast<int>(CLI::ExitCodes::ExtrasError);
+  if (!extra) return CLI::FailureMessage::simple(app, error);
+  return RefuseExtra(*app) + "\nRun with --help for more information.\n";
+}
+
 }  // namespace
 
 std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   Options options;
+  std::optional<double> seconds;
   CLI::App app(kAbout, "zornet");
   app.footer(kFooter);
+  app.failure_message(Failure);
   app.set_version_flag("--version", "zornet " ZORNET_VERSION);
   app.add_option("FILE", options.file, "The model (*.szn); - for standard input")->required();
   auto* solutions =
@@ -71,6 +125,9 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
                  "Passes over a constraint, and choices, before giving up (100000000)")
       ->type_name("N")
       ->check(WholeFrom(0));
+  app.add_option("--time-limit", seconds, "Seconds, fractions too, before giving up")
+      ->type_name("SECONDS")
+      ->check(Seconds());
   app.add_option("--module-path", options.modulePaths, "Look for modules in this folder too; may be repeated")
       ->type_name("DIR")
       ->allow_extra_args(false);
@@ -78,9 +135,13 @@ std::optional<Options> ReadOptions(int argc, char** argv, int& exitCode) {
   try {
     app.parse(argc, argv);
   } catch (const CLI::ParseError& error) {
-    exitCode = app.exit(error) == 0 ? kSettled : kUsage;
+    std::ostringstream told;
+    exitCode = app.exit(error, std::cout, told) == 0 ? kSettled : kUsage;
+    std::istringstream lines(told.str());
+    for (std::string line; std::getline(lines, line);) std::cerr << Harmless(line) << '\n';
     return std::nullopt;
   }
+  if (seconds) SetTimeLimit(*seconds, options.limits);
   return options;
 }
 

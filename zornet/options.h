@@ -34,9 +34,10 @@ enum ExitCode {
   kUsage = 2,
   kModelError = 3,
   kModuleError = 4,
-  kStepLimit = 5,
-  kOpen = 6,  // all is tried, and there may be more solutions
+  kLimit = 5,
+  kOpen = 6,  // all is tried, but there may be more solutions
   kNoMemory = 7,
+  kSignal = 128,  // and its number
 };
 
 // Nothing when the program is to end with exitCode: help or version was asked for, or the command line is wrong.

@@ -51,7 +51,6 @@ OperationCount Total(const std::vector<OperationCount>& counts);
 struct ReportStyle {
   bool colour = false;        // in results
   bool remarkColour = false;  // in remarks
-  bool trace = false;         // tell each narrowing
   bool quiet = false;         // no summary
 };
 std::unique_ptr<Report> MakeTextReport(const Source& source, const Places& places, const Model& model,
@@ -70,12 +69,12 @@ class Names {
   std::string DeclarationOf(int variable) const;  // the line of the source that declares it
   std::string OfVariable(Var variable) const { return OfVariable(variable.index); }
   std::size_t LineOfConstraint(int constraint) const;
-  std::size_t LineOfVariable(int variable) const;
   std::string PlaceOfConstraint(int constraint) const;  // file:line
   std::string PlaceOfVariable(int variable) const;
 
  private:
   std::string Written(Extent extent) const;
+  std::string Place(Extent extent) const;
 
   const Source& mSource;
   const Places& mPlaces;

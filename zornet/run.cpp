@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <cerrno>
 #include <chrono>
+#include <csignal>
 #include <cstring>
 #include <filesystem>
 #include <fstream>
@@ -14,8 +15,10 @@
 #include <stdexcept>
 
 #include "language/reader.h"
+#include "language/spelling.h"
 #include "zornet/colour.h"
 #include "zornet/graph.h"
+#include "zornet/interrupt.h"
 #include "zornet/picture.h"
 #include "zornet/progress.h"
 #include "zornet/raw.h"
@@ -30,29 +33,16 @@ struct UsageError : std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
-constexpr std::size_t kMegabyte = 1 << 20, kMostMegabytes = 256;  // a model is no larger
-
-// In pieces, since some files have no end.
-std::string ReadAll(std::istream& in, const std::string& name) {
-  std::string text;
-  for (std::size_t size = 0; in; text.resize(size)) {
-    if (size > kMostMegabytes * kMegabyte)
-      throw UsageError(fmt::format("{}: is larger than {} MB", name, kMostMegabytes));
-    text.resize(size + kMegabyte);
-    size += static_cast<std::size_t>(in.read(text.data() + size, kMegabyte).gcount());
-  }
-  return text;
-}
-
 // A model may be named without its ending.
 Source Load(std::string file) {
-  if (file == "-") return {"<stdin>", ReadAll(std::cin, "<stdin>")};
-  if (!std::filesystem::exists(file) && std::filesystem::exists(file + ".szn")) file += ".szn";
-  if (std::filesystem::is_directory(file)) throw UsageError(file + ": is a folder");
-  std::ifstream in(file, std::ios::binary);
-  std::string text = ReadAll(in, file);
-  if (!in.is_open() || in.bad()) throw UsageError(fmt::format("{}: {}", file, std::strerror(errno)));
-  return {file, std::move(text)};
+  const bool isInput = file == "-";
+  if (!isInput && !std::filesystem::exists(file) && std::filesystem::exists(file + ".szn")) file += ".szn";
+  const std::string name = isInput ? "<stdin>" : file;
+  try {
+    return {name, isInput ? ReadText(std::cin) : DiskFiles().Read(file)};
+  } catch (const std::runtime_error& error) {
+    throw UsageError(fmt::format("{}: {}", name, error.what()));
+  }
 }
 
 class OneRun {
@@ -64,7 +54,9 @@ class OneRun {
 
  private:
   void FindExplained();
+  std::string SuggestVariable(const std::string& name) const;
   void Solve();
+  static void EndWithoutReader();
   void Tell();
   void WritePictures() const;
   int ExitCode() const;
@@ -97,17 +89,36 @@ void OneRun::FindExplained() {
     const auto found = std::find_if(variables.begin(), variables.end(),
                                     [&](const Variable& variable) { return variable.name == name; });
     if (name.empty() || found == variables.end())
-      throw UsageError(fmt::format("--explain: there is no variable '{}'", name));
+      throw UsageError(fmt::format("--explain: there is no variable '{}'{}", name, SuggestVariable(name)));
     mExplained.push_back({static_cast<int>(found - variables.begin())});
   }
 }
 
+// As a write would, also while there is nothing to write. Where the signal is ignored the flag is left.
+void OneRun::EndWithoutReader() {
+  const bool isGone = IsReaderGone();
+  if (isGone) std::raise(SIGPIPE);
+  if (isGone || !std::cout.good()) Interrupts::Raise();
+}
+
+std::string OneRun::SuggestVariable(const std::string& name) const {
+  std::vector<std::string_view> names;
+  for (const Variable& variable : mNetwork.GetModel().Variables()) {
+    if (variable.name.starts_with(name + "[")) return fmt::format("; did you mean '{}'?", variable.name);
+    if (!variable.constant) names.push_back(variable.name);
+  }
+  return Suggestion(name, names);
+}
+
 // Nobody is told where nobody listens: text forms cost more than the narrowing itself.
 void OneRun::Solve() {
-  if (mOptions.trace || mOptions.json)
-    mNetwork.OnNarrowing([this](const Narrowing& narrowing) { mReport.Narrowed(narrowing); });
+  if (mOptions.trace) mNetwork.OnNarrowing([this](const Narrowing& narrowing) { mReport.Narrowed(narrowing); });
+  const Interrupts interrupts;
   ProgressLine progress(isatty(STDERR_FILENO) != 0 && !mOptions.json);
-  mNetwork.OnProgress([&](std::uint64_t steps, std::size_t waiting) { progress.Show(steps, waiting); });
+  mNetwork.OnProgress([&](std::uint64_t steps, std::size_t waiting) {
+    progress.Show(steps, waiting);
+    EndWithoutReader();
+  });
   mSummary.outcome = mNetwork.Narrow();
   if (mOptions.solutions != 0) {
     std::uint64_t solutions = 0;
@@ -122,6 +133,7 @@ void OneRun::Solve() {
 
 void OneRun::Tell() {
   if (!mSummary.search) mReport.Variables(mNetwork);
+  if (mSummary.outcome == Outcome::Stopped) return mReport.Finish(mNetwork, mSummary);
   for (const Var variable : mExplained) {
     const Explanation explanation = mNetwork.Explain(variable);
     mReport.Explain(mNetwork, variable, explanation);
@@ -151,7 +163,10 @@ int OneRun::ExitCode() const {
     case Outcome::Contradiction:
       return kContradiction;
     case Outcome::StepLimit:
-      return kStepLimit;
+    case Outcome::TimeLimit:
+      return kLimit;
+    case Outcome::Stopped:
+      return Interrupts::Signal() != 0 ? kSignal + Interrupts::Signal() : kUsage;
     case Outcome::Open:
       return kOpen;
   }
@@ -159,12 +174,12 @@ int OneRun::ExitCode() const {
 }
 
 // The names of the files are told on standard output, so that the next program can read them.
-int WriteParts(const Options& options, const Source& source, const Model& model) {
+int WriteParts(const Options& options, const std::string& written, const Model& model) {
   const std::vector<Part> parts = Split(model, options.limits, options.modulePaths, options.split);
   for (std::size_t i = 0; i < parts.size(); ++i) {
     const std::string file = fmt::format("{}.{}.szn", options.parts.empty() ? "part" : options.parts, i + 1);
     std::ofstream out(file, std::ios::binary);
-    out << source.Text() << "\n" << parts[i];
+    out << written << "\n" << parts[i];
     out.close();
     if (!out) throw UsageError(fmt::format("{}: {}", file, std::strerror(errno)));
     std::cout << file << '\n';
@@ -176,7 +191,7 @@ int WriteParts(const Options& options, const Source& source, const Model& model)
 
 int Run(const Options& options) {
   ReportStyle style{WantsColour(options.colour, STDOUT_FILENO), WantsColour(options.colour, STDERR_FILENO),
-                    options.trace, options.quiet};
+                    options.quiet};
   const auto reportOn = [&](const Source& source, const Places& places, const Model& model) {
     return options.json ? MakeJsonReport(source, places, model, std::cout)
                         : MakeTextReport(source, places, model, style, std::cout, std::cerr);
@@ -186,15 +201,17 @@ int Run(const Options& options) {
     return code;
   };
   try {
-    const Source source = Load(options.file);
+    Source source = Load(options.file);
     Diagnostics diagnostics;
-    ReadModel read = Read(source, diagnostics);
+    ReadModel read = Read(source, diagnostics, DiskFiles());
     if (diagnostics.Failed()) {
       reportOn(source, {}, {})->Errors(source, diagnostics);
       return kModelError;
     }
-    if (options.split != 0) return WriteParts(options, source, read.model);
-    Network network(std::move(read.model), options.limits, options.modulePaths);
+    if (options.split != 0) return WriteParts(options, SelfContained(source, read.places.embedded), read.model);
+    Limits limits = options.limits;
+    limits.stop = &Interrupts::Flag();
+    Network network(std::move(read.model), limits, options.modulePaths);
     const Names names(source, read.places, network.GetModel());
     const auto report = reportOn(source, read.places, network.GetModel());
     return OneRun(options, network, names, *report).Go();

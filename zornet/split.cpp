@@ -5,6 +5,8 @@
 #include <deque>
 #include <utility>
 
+#include "network/texts.h"
+
 namespace zornet {
 
 namespace {
@@ -20,16 +22,6 @@ using Choices = std::vector<Choice>;
 std::string_view EqualityOf(Sort sort) {
   if (IsText(sort)) return "str_eq";
   return IsInteger(sort) ? "int_eq" : "bool_eq";
-}
-
-// As models write it. Texts have no control characters.
-std::string Write(const std::string& text) {
-  std::string written = "\"";
-  for (const char c : text) {
-    if (c == '"' || c == '\\') written += '\\';
-    written += c;
-  }
-  return written + '"';
 }
 
 class Splitter {
@@ -128,7 +120,7 @@ Choices Splitter::ChoicesFor(const Network& network, Var variable) const {
   Choices choices;
   const auto add = [&](std::int32_t number) { choices.push_back({variable, number, std::to_string(number)}); };
   if (IsText(sort)) {
-    for (const std::string& text : domain.Texts()) choices.push_back({variable, text, Write(text)});
+    for (const std::string& text : domain.Texts()) choices.push_back({variable, text, Quoted(text)});
   } else if (sort == Sort::Boolean) {
     for (const bool truth : {false, true}) choices.push_back({variable, truth, truth ? "true" : "false"});
   } else if (sort == Sort::IntegerSet) {

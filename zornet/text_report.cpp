@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "zornet/colour.h"
+#include "zornet/limits.h"
 #include "zornet/render.h"
 #include "zornet/report.h"
 
@@ -13,6 +14,13 @@ namespace {
 std::string Counted(std::uint64_t count, std::string_view thing) {
   return fmt::format("{} {}{}", count, thing, count == 1 ? "" : "s");
 }
+
+std::string Ended(Limit limit) {
+  if (limit == Limit::Stop) return "interrupted";
+  return limit == Limit::Time ? "time limit reached" : "step limit reached";
+}
+
+constexpr std::size_t kMostNamed = 8;
 
 class TextReport : public Report {
  public:
@@ -30,21 +38,15 @@ class TextReport : public Report {
   }
 
   void Failure(const std::string& message) override {
-    mRemarks << Paint(mStyle.remarkColour)(Style::Error, "zornet: error:") << ' ' << message << '\n';
+    mRemarks << Paint(mStyle.remarkColour)(Style::Error, "zornet: error:") << ' ' << Harmless(message) << '\n';
   }
 
-  void Narrowed(const Narrowing& narrowing) override {
-    if (mStyle.trace) mResults << Line(narrowing) << '\n';
-  }
+  void Narrowed(const Narrowing& narrowing) override { mResults << Line(narrowing) << '\n'; }
 
-  void Variables(const Network& network) override {
-    for (const int variable : mModel.Wanted()) {
-      mResults << mPaint(Style::Name, mNames.OfVariable(variable)) << " = " << Shown(network[variable]) << '\n';
-    }
-  }
+  void Variables(const Network& network) override { Show(network, LimitsOf(network)); }
 
   void Solution(const Network& network, std::uint64_t) override {
-    Variables(network);
+    Show(network, {});
     mResults << "----------\n" << std::flush;
   }
 
@@ -54,9 +56,14 @@ class TextReport : public Report {
   void Finish(const Network& network, const Summary& summary) override;
 
  private:
+  void Show(const Network& network, const LimitsByVariable& limits);
+  std::string ShownLimits(const LimitsByVariable& limits, int variable) const;
   std::string Line(const Narrowing& narrowing) const;
+  std::string Place(int constraint) const;
   std::string Shown(const Domain& domain) const;
   std::string Result(const Network& network, const Summary& summary) const;
+  std::string Limited(const Network& network, const Summary& summary) const;
+  std::string Listed(const std::vector<Var>& variables) const;
 
   const Model& mModel;
   Names mNames;
@@ -74,11 +81,35 @@ std::string TextReport::Shown(const Domain& domain) const {
   return mPaint(style, domain.HasShape() ? domain.Print() + ": " + domain.PrintShape() : domain.Print());
 }
 
+void TextReport::Show(const Network& network, const LimitsByVariable& limits) {
+  for (const int variable : mModel.Wanted()) {
+    mResults << mPaint(Style::Name, mNames.OfVariable(variable)) << " = " << Shown(network[variable])
+             << ShownLimits(limits, variable) << '\n';
+  }
+}
+
+// One of each kind.
+std::string TextReport::ShownLimits(const LimitsByVariable& limits, int variable) const {
+  std::string shown;
+  std::set<Limit> kinds;
+  const auto [first, last] = limits.equal_range(variable);
+  for (auto at = first; at != last; ++at) {
+    if (!kinds.insert(at->second.limit).second) continue;
+    shown += shown.empty() ? "  % " : "; ";
+    shown += Describe(at->second, mModel.Variables()[static_cast<std::size_t>(variable)].sort);
+  }
+  return shown.empty() ? shown : mPaint(Style::Faint, shown);
+}
+
+// model.szn:12: str_concat(x, y, z)
+std::string TextReport::Place(int constraint) const {
+  return fmt::format("{} {}", mPaint(Style::Faint, mNames.PlaceOfConstraint(constraint) + ":"),
+                     constraint == kNone ? "" : mNames.OfConstraint(constraint) + "  ");
+}
+
 // model.szn:12: str_concat(x, y, z): z: Any -> "ab" (CalcConcatenation)
 std::string TextReport::Line(const Narrowing& narrowing) const {
-  const std::string place = mNames.PlaceOfConstraint(narrowing.constraint);
-  const std::string what = narrowing.constraint == kNone ? "" : mNames.OfConstraint(narrowing.constraint) + "  ";
-  return fmt::format("{} {}{}: {} -> {} {}", mPaint(Style::Faint, place + ":"), what,
+  return fmt::format("{}{}: {} -> {} {}", Place(narrowing.constraint),
                      mPaint(Style::Name, mNames.OfVariable(narrowing.variable)), narrowing.before,
                      mPaint(narrowing.failed ? Style::Error : Style::Known, narrowing.after),
                      mPaint(Style::Faint, fmt::format("({})", narrowing.operation)));
@@ -86,7 +117,9 @@ std::string TextReport::Line(const Narrowing& narrowing) const {
 
 void TextReport::Explain(const Network& network, Var variable, const Explanation& explanation) {
   mResults << fmt::format("{} is {}", mPaint(Style::Name, mNames.OfVariable(variable)), Shown(network[variable]));
-  if (explanation.narrowings.empty()) {
+  const LimitsByVariable limits = LimitsOf(network);
+  const auto [first, last] = limits.equal_range(variable.index);
+  if (explanation.narrowings.empty() && first == last) {
     mResults << (explanation.declared.empty() ? ": no constraint narrowed it\n" : ", as it was declared\n");
     return;
   }
@@ -97,6 +130,9 @@ void TextReport::Explain(const Network& network, Var variable, const Explanation
                             mPaint(Style::Name, mNames.OfVariable(declared)), value);
   }
   for (const Narrowing& narrowing : explanation.narrowings) mResults << "  " << Line(narrowing) << '\n';
+  const Sort sort = mModel.Variables()[static_cast<std::size_t>(variable.index)].sort;
+  for (auto at = first; at != last; ++at)
+    mResults << "  " << Place(at->second.constraint) << Describe(at->second, sort) << '\n';
 }
 
 void TextReport::Statistics(const Network& network) {
@@ -121,15 +157,35 @@ void TextReport::Called(const RawCall& call) {
 std::string TextReport::Result(const Network& network, const Summary& summary) const {
   const auto& search = summary.search;
   const std::string solutions = search ? Counted(search->solutions, "solution") : "";
-  if (summary.outcome == Outcome::StepLimit) return "step limit reached" + (search ? " after " + solutions : "");
+  if (const auto end = EndOf(summary.outcome)) return Ended(*end) + (search ? " after " + solutions : "");
   if (const int failed = network.FailedConstraint(); failed != kNone) {
     return fmt::format("contradiction at {}: {} leaves nothing for {}", mNames.PlaceOfConstraint(failed),
                        mNames.OfConstraint(failed), mNames.OfVariable(network.FailedVariable()));
   }
   if (summary.outcome == Outcome::Contradiction) return "contradiction: no solution";
   if (!search) return "settled";
+  if (summary.outcome == Outcome::Open) return "open after " + solutions;
   if (!search->complete) return solutions + " found, there may be more";
   return search->solutions == 1 ? "the only solution" : "all " + solutions;
+}
+
+// A search that has tried all is sure in spite of them. The outcome itself names one.
+std::string TextReport::Limited(const Network& network, const Summary& summary) const {
+  std::set<Limit> limits = LimitsOf(network, summary.outcome);
+  if (const auto end = EndOf(summary.outcome)) limits.erase(*end);
+  if (limits.empty() || (summary.search && summary.search->complete)) return "";
+  std::string listed;
+  for (const Limit limit : limits) listed += fmt::format("{}{}", listed.empty() ? "" : ", ", NameOf(limit));
+  return fmt::format(" (limits met: {})", listed);
+}
+
+// By name, the first of many.
+std::string TextReport::Listed(const std::vector<Var>& variables) const {
+  const std::size_t named = std::min(variables.size(), kMostNamed);
+  std::string listed;
+  for (std::size_t i = 0; i < named; ++i) listed += (i == 0 ? "" : ", ") + mNames.OfVariable(variables[i]);
+  if (named < variables.size()) listed += fmt::format(" and {} more", variables.size() - named);
+  return listed;
 }
 
 void TextReport::Finish(const Network& network, const Summary& summary) {
@@ -137,15 +193,16 @@ void TextReport::Finish(const Network& network, const Summary& summary) {
   if (search && search->complete) mResults << "==========\n";
   mResults.flush();
   if (summary.outcome == Outcome::Open)
-    mRemarks << fmt::format("unknown: {} stays open\n", mNames.OfVariable(search->openVariable));
+    mRemarks << fmt::format("unknown: {} stay{} open\n", Listed(search->openVariables),
+                            search->openVariables.size() == 1 ? "s" : "");
   if (mStyle.quiet) return;
   const Paint paint(mStyle.remarkColour);
   const OperationCount total = Total(network.Counts());
   const bool good = summary.outcome == Outcome::Settled;
-  mRemarks << fmt::format("{}; {}, {}, {} in {:.1f} ms\n",
+  mRemarks << fmt::format("{}{}; {}, {}, {} in {:.1f} ms\n",
                           paint(good ? Style::Known : Style::Error, Result(network, summary)),
-                          Counted(mModel.Constraints().size(), "constraint"), Counted(total.calls, "call"),
-                          Counted(total.changes, "change"), summary.milliseconds);
+                          Limited(network, summary), Counted(mModel.Constraints().size(), "constraint"),
+                          Counted(total.calls, "call"), Counted(total.changes, "change"), summary.milliseconds);
 }
 
 }  // namespace

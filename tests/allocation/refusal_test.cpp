@@ -58,7 +58,6 @@ namespace {
 
 using Single = ZORVadSingleString;
 using Set = ZORVadEnumString;
-using Vector = ZORISVectorImp_String;
 
 template <class Run>
 void RunRefused(int number, Run run) {
@@ -178,50 +177,6 @@ TEST(Refused, StoredSets) {
     ZORipstream in(texts.Bytes());
     RunRefused(number, [&] { value.Read(in); });
     EXPECT_TRUE(sWasRefused && in.Fail() && value.IsNil() && value.Count() == 0) << number;
-  }
-}
-
-// A vector without places says so, and so does one that takes over what it has no places for.
-TEST(Refused, Vectors) {
-  ZORString texts[30];
-  Vector many(29, 1u);
-  for (ZORString& text : texts) EXPECT_EQ(many.Add(&text), 1);
-  RefuseEach([&] {
-    Vector some(9, 10u);
-    EXPECT_EQ(some.Good() == 0, sWasRefused);
-    const bool wasRefused = sWasRefused;
-    const Vector copy(many);
-    EXPECT_EQ(copy.Good() == 0, sWasRefused && !wasRefused);
-    const bool wasRefusedTwice = sWasRefused;
-    some = many;
-    EXPECT_EQ(some.Good() == 0, sWasRefused && !wasRefusedTwice);
-    EXPECT_EQ(some.Count(), some.Good() == 0 ? 0u : 30u);
-  });
-}
-
-std::vector<ZORString*> Places(const Vector& vector) { return {&vector[0], &vector[0] + vector.Limit()}; }
-
-// A vector that cannot grow stays as it was, and can grow later.
-TEST(Refused, Growth) {
-  ZORString texts[4] = {"a", "b", "c", "d"}, more("bb");
-  Vector full(3, 4u);
-  for (ZORString& text : texts) EXPECT_EQ(full.Add(&text), 1);
-  const std::vector<ZORString*> places = Places(full);
-  int (*const growths[])(Vector & vector, ZORString * text) = {
-      [](Vector& vector, ZORString* text) { return vector.Add(text); },
-      [](Vector& vector, ZORString* text) { return vector.AddUnique(text); },
-      [](Vector& vector, ZORString* text) { return vector.AddAt(text, 1); },
-      [](Vector& vector, ZORString* text) { return vector.AddAt(text, 9); },
-      [](Vector& vector, ZORString*) { return vector.Resize(5); },
-  };
-  for (const auto grow : growths) {
-    RunRefused(0, [&] { EXPECT_EQ(grow(full, &more), 0); });
-    EXPECT_TRUE(sWasRefused);
-    EXPECT_EQ(Places(full), places);
-    EXPECT_EQ(full.Count(), 4u);
-    Vector grown(full);
-    EXPECT_EQ(grow(grown, &more), 1);
-    EXPECT_GT(grown.Limit(), 4u);
   }
 }
 

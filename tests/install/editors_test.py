@@ -31,6 +31,6 @@ for scope, text in (part for kind in kinds for part in parts(f'constraint {kind}
 plain = {text for text in colours.pop('') if text.strip()}
 assert not plain, f'without a colour: {plain}'
 assert colours['support.function.szn'] == kinds, f'constraints: {colours["support.function.szn"] ^ kinds}'
-words = [word for name, pattern in patterns for word in re.findall(r'\w{3,}', pattern.pattern) if '|' in pattern.pattern]
+words = [word for name, pattern in patterns for word in re.findall(r'\w{2,}', pattern.pattern) if '|' in pattern.pattern]
 keywords = [word for row in re.findall(r'^syntax keyword \w+ (.*)$', vim, re.M) for word in row.split()]
 assert sorted(words) == sorted(keywords), f'{words} are not those of Vim, {keywords}'

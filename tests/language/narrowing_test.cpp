@@ -91,7 +91,7 @@ TEST(Search, SaysNoMoreThanItKnows) {
     });
     if (result.outcome == zornet::Outcome::Settled) told += "complete\n";
     if (result.outcome == zornet::Outcome::Contradiction) told += "contradiction\n";
-    if (!result.complete) told += "open: " + solved.Name(result.openVariable) + "\n";
+    if (!result.complete) told += "open: " + solved.Name(result.openVariables.front()) + "\n";
     EXPECT_EQ(told, row.expected) << row.why;
   }
 }

@@ -9,7 +9,7 @@
 namespace {
 
 std::string Told(const std::string& model) {
-  const zornet::Source source("", model);
+  zornet::Source source("", model);
   zornet::Diagnostics diagnostics;
   zornet::Read(source, diagnostics);
   std::string text = zornet::Render(source, diagnostics, false);
@@ -42,7 +42,8 @@ TEST(Reader, StopsAfterTwentyErrors) {
   std::string model;
   for (int i = 0; i < 20; ++i) model += "nonsense;\n";
   const std::string all = Told(model), told = Told(model + "output x;");
-  EXPECT_TRUE(all.ends_with("20:1: error: expected 'var', 'constraint' or 'output'\nnonsense;\n^~~~~~~~\n"));
+  EXPECT_TRUE(all.ends_with(
+      "20:1: error: expected 'var', 'set', 'array', 'constraint', 'output' or 'include'\nnonsense;\n^~~~~~~~\n"));
   EXPECT_EQ(told, all + " stopped after 20 errors\n");
 }
 
@@ -91,7 +92,9 @@ TEST(Reader, ShowsTheNeighbourhoodInALongLine) {
 // Whatever the bytes: it ends, and every place lies in the file.
 TEST(Reader, SurvivesAnyBytes) {
   const std::string good =
-      "var {\"a\", \"b\"}: x = \"a\"; % c\nvar 1..9: n;\nconstraint str_length(x, n);\noutput x, n;\n";
+      "set of string: s = {\"a\", \"\\\"\"}; var s: x = \"a\"; % c\narray [1..2] of var 1..9: n;\n"
+      "constraint str_length(x, n[1]);\nconstraint str_table([x], [| \"a\" | \"b\" |]);\noutput x, n;\ninclude "
+      "\"f\";\n";
   for (std::size_t cut = 0; cut <= good.size(); ++cut) Told(good.substr(0, cut));
   for (std::size_t at = 0; at < good.size(); ++at) {
     for (const char c : {'\0', '"', '{', ';', '\n', '\x80', '-', '.', '%', '\x7F'}) {

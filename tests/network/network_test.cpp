@@ -103,6 +103,27 @@ TEST(Network, MatchesWithoutSearch) {
   EXPECT_EQ(Network(model).Narrow(), Outcome::Contradiction);
 }
 
+TEST(Network, GoesOnWhereItWasStopped) {
+  std::atomic<bool> stop = false;
+  zornet::Limits limits;
+  limits.stop = &stop;
+  Model model;
+  const Var site = model.TextSet("site", {"a", "b"}), shown = model.Text("shown");
+  model.Post("str_ne", {site, "b"});
+  const int upper = model.Post("str_upper", {site, shown});
+  Network network(std::move(model), limits);
+  network.OnNarrowing([&](const zornet::Narrowing&) { stop = true; });
+  EXPECT_EQ(network.Narrow(), Outcome::Stopped);
+  EXPECT_TRUE(network[shown].IsAny());
+  ASSERT_EQ(network.LimitsMet().size(), 1u);
+  EXPECT_EQ(network.LimitsMet()[0].limit, zornet::Limit::Stop);
+  EXPECT_EQ(network.LimitsMet()[0].constraint, upper);
+  stop = false;
+  EXPECT_EQ(network.Narrow(), Outcome::Settled);
+  EXPECT_EQ(network[shown].Print(), "\"A\"");
+  EXPECT_TRUE(network.LimitsMet().empty());
+}
+
 TEST(Network, TellsWhereModulesAreMissing) { EXPECT_NO_THROW(Network(Model(), {}, {"/nowhere"})); }
 
 }  // namespace

@@ -4,15 +4,15 @@ if exists('b:current_syntax')
   finish
 endif
 
-syntax match zornetDelimiter /[:;,(){}]/
+syntax match zornetDelimiter /[][:;,(){}|]/
 syntax match zornetOperator /\.\.\|=/
 syntax match zornetName /\<\h\w*\>/
 syntax match zornetConstraint /\<\h\w*\ze\_s*(/
-syntax keyword zornetItem var constraint output
-syntax keyword zornetType set string int bool
+syntax keyword zornetItem var array constraint output include
+syntax keyword zornetType set of string int bool lines
 syntax keyword zornetTruth true false
 syntax match zornetNumber /-\?\<\d\+\>/
-syntax match zornetText /"[^"]*"/
+syntax match zornetText /"\(\\.\|[^"\\]\)*"/
 syntax match zornetComment /%.*/
 
 highlight default link zornetDelimiter Delimiter

@@ -1,0 +1,50 @@
+#include "language/files.h"
+
+#include <fmt/core.h>
+
+#include <cerrno>
+#include <cstring>
+#include <filesystem>
+#include <fstream>
+#include <stdexcept>
+
+namespace zornet {
+
+namespace fs = std::filesystem;
+
+std::string Files::Identity(const std::string& path) const { return fs::path(path).lexically_normal().string(); }
+
+std::string NoFiles::Read(const std::string&) const { throw std::runtime_error("files are not read here"); }
+
+std::string DiskFiles::Identity(const std::string& path) const {
+  std::error_code error;
+  const fs::path canonical = fs::weakly_canonical(path, error);
+  return error ? path : canonical.string();
+}
+
+std::string DiskFiles::Read(const std::string& path) const {
+  std::error_code error;
+  if (fs::is_directory(path, error)) throw std::runtime_error("is a folder");
+  std::ifstream in(path, std::ios::binary);
+  if (!in) throw std::runtime_error(std::strerror(errno));
+  std::string text = ReadText(in);
+  if (in.bad()) throw std::runtime_error(std::strerror(errno));
+  return text;
+}
+
+// In pieces, since some files have no end.
+std::string ReadText(std::istream& in) {
+  constexpr std::size_t kMegabyte = 1 << 20, kMostMegabytes = 256;
+  std::string text;
+  for (std::size_t size = 0; in; text.resize(size)) {
+    if (size > kMostMegabytes * kMegabyte)
+      throw std::runtime_error(fmt::format("is larger than {} MB", kMostMegabytes));
+    text.resize(size + kMegabyte);
+    size += static_cast<std::size_t>(in.read(text.data() + size, kMegabyte).gcount());
+  }
+  if (text.find('\0') != std::string::npos)
+    throw std::runtime_error("is no text: it is binary, or in UTF-16 and not UTF-8");
+  return text;
+}
+
+}  // namespace zornet

@@ -1,3 +1,4 @@
+#include <algorithm>
 #include <utility>
 
 #include "network/ZORNetwork.h"
@@ -24,6 +25,32 @@ std::vector<std::int32_t> Domain::Numbers() const { return mValue->Numbers(); }
 std::int32_t Domain::Lowest() const { return mValue->LowestNumber(); }
 std::int32_t Domain::Highest() const { return mValue->HighestNumber(); }
 std::string Domain::Print() const { return mValue->Show(); }
+
+TextShape Domain::Shape() const {
+  const auto text = [](const ZORString& held) { return std::string(held.View()); };
+  const zornet::Shape& shape = *mShape;
+  TextShape told{shape.shortest,
+                 shape.longest,
+                 text(shape.beginning),
+                 text(shape.end),
+                 text(shape.Lowest()),
+                 text(shape.orGreatest ? shape.greatest : shape.Highest()),
+                 "",
+                 shape.orGreatest};
+  for (std::size_t bit = 0; bit < shape.characters.size(); ++bit) {
+    if (shape.characters[bit]) told.characters += CharacterAt(bit);
+  }
+  return told;
+}
+
+std::string Domain::PrintShape() const { return HasShape() ? Describe(*mShape) : ""; }
+
+bool Domain::Admits(std::string_view text) const {
+  if (HasShape()) return mShape->Admits(text);
+  if (!IsKnown()) return IsAny();
+  const std::vector<ZORString> texts = mValue->Texts();
+  return std::any_of(texts.begin(), texts.end(), [&](const ZORString& listed) { return listed.View() == text; });
+}
 
 namespace {
 
@@ -90,7 +117,9 @@ SearchResult Network::Search(std::uint64_t most, const std::function<bool()>& fo
 }
 
 const Model& Network::GetModel() const { return mInside->model; }
-Domain Network::operator[](Var variable) const { return Domain(mInside->store[variable.index]); }
+Domain Network::operator[](Var variable) const {
+  return Domain(mInside->store[variable.index], mInside->store.HeldShape(variable.index));
+}
 ZORVaDoAny& Network::Bare(Var variable) { return mInside->store.Bare(variable.index).Any(); }
 Var Network::FailedVariable() const { return {mInside->store.Failed()}; }
 int Network::FailedConstraint() const { return mInside->store.FailedConstraint(); }

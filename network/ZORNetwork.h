@@ -28,6 +28,7 @@ class ZORVaDoAny;
 namespace zornet {
 
 class Value;
+struct Shape;
 
 // The modules of the value types cannot be used: what() says which and why.
 struct ZOR_EXPORT ModuleFailure : std::runtime_error {
@@ -50,10 +51,19 @@ enum class Outcome {
   Stopped,
 };
 
+// What is known of a text that is not listed. Lengths are in characters.
+struct TextShape {
+  int shortest = 0, longest = 255;
+  std::string beginning, end;   // of every possible text
+  std::string least, greatest;  // between which they lie
+  std::string characters;       // that may occur, ascending
+  bool orMax = false;           // the greatest text is possible too, whatever the rest says
+};
+
 // What is still possible for a variable: a view, good until its network changes. Texts and numbers ascend.
 class ZOR_EXPORT Domain {
  public:
-  explicit Domain(const Value& value) : mValue(&value) {}
+  explicit Domain(const Value& value, const zornet::Shape* shape = nullptr) : mValue(&value), mShape(shape) {}
 
   bool IsNil() const;    // nothing: a contradiction
   bool IsAny() const;    // nothing is known
@@ -67,8 +77,15 @@ class ZOR_EXPORT Domain {
 
   std::string Print() const;  // of any domain, as models write it: { "a", "b" }, 1..9, Any
 
+  // Of a text of which nothing is listed but something known.
+  bool HasShape() const { return mShape != nullptr; }
+  TextShape Shape() const;
+  std::string PrintShape() const;            // "ab…", 2 to 255 characters
+  bool Admits(std::string_view text) const;  // also of a domain that lists its texts
+
  private:
   const Value* mValue;
+  const zornet::Shape* mShape;
 };
 
 inline constexpr int kNone = -1;  // no constraint

@@ -30,6 +30,7 @@ enum class Operation {
   Bounds,
   Matching,
   Supports,
+  Shape,
   Choice,
 };
 inline constexpr std::size_t kOperations = static_cast<std::size_t>(Operation::Choice) + 1;
@@ -58,6 +59,7 @@ constexpr std::string_view NameOf(Operation operation) {
                                                                 "bounds",
                                                                 "matching",
                                                                 "supports",
+                                                                "shape",
                                                                 "choice"};
   return kNames[static_cast<std::size_t>(operation)];
 }

@@ -21,7 +21,8 @@ Propagation::Propagation(Store& store, const Limits& limits)
       mRelations(store),
       mFunctions(store, limits.budget, mStop),
       mAllDifferent(store, mStop),
-      mTables(store) {
+      mTables(store),
+      mShapes(store) {
   Connect();
   mShavings.resize(mModel.Variables().size(), 0);
   mStates.resize(mModel.Constraints().size(), Idle);
@@ -89,7 +90,9 @@ bool Propagation::CountStep() {
 
 Status Propagation::Narrow(int constraint) {
   mStore.StartConstraint(constraint);
-  const Status status = Narrow(mModel.Constraints()[static_cast<std::size_t>(constraint)]);
+  const Constraint& posted = mModel.Constraints()[static_cast<std::size_t>(constraint)];
+  Status status = Narrow(posted);
+  if (status != Status::Subsumed && !mStore.HasFailed() && mShapes.Narrow(posted)) status = Status::Again;
   if (status == Status::Subsumed) {
     mStates[static_cast<std::size_t>(constraint)] = Finished;
     mFinished.push_back(constraint);

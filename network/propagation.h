@@ -12,6 +12,7 @@
 #include "network/all_different.h"
 #include "network/functions.h"
 #include "network/relations.h"
+#include "network/shapes.h"
 #include "network/stop.h"
 #include "network/store.h"
 #include "network/tables.h"
@@ -62,6 +63,7 @@ class Propagation {
   Functions mFunctions;
   AllDifferent mAllDifferent;
   Tables mTables;
+  Shapes mShapes;
   Teller mTeller;
 
   // Constraints that read a variable: mReaders[mFirstReader[v]] and those up to mFirstReader[v + 1].

@@ -31,6 +31,7 @@ Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(ty
   for (int i = 0; i < kSorts; ++i) mFresh.emplace_back(types, static_cast<Sort>(i));
   mListings.resize(mValues.size());
   mListed.resize(mValues.size(), 0);
+  mShapeOf.resize(mValues.size(), kNone);
 }
 
 const Listing& Store::List(int variable) {
@@ -100,6 +101,7 @@ void Store::Meet(int variable, const Value& outcome) {
   }
   mListed[static_cast<std::size_t>(variable)] = 0;
   Changed(variable, shown);
+  if (before.undefined) FitToShape(variable);
 }
 
 void Store::Changed(int variable, const std::string& before) {
@@ -238,6 +240,7 @@ void Store::MeetCandidates(int variable, Listing candidates) {
     return candidates.sort == Sort::Text ? MeetTexts(variable, std::move(candidates.texts))
                                          : MeetNumbers(variable, std::move(candidates.numbers));
   if (!held.known && candidates.count > MostListed(variable)) return ExceedSet(variable, candidates.count);
+  const bool hadNone = !held.known;
   const std::string shown = mWatcher != nullptr ? Show(variable) : "";
   if (!mMarks.empty()) {
     Saved saved{variable, (*this)[variable], TakeCandidates(variable)};
@@ -245,6 +248,55 @@ void Store::MeetCandidates(int variable, Listing candidates) {
   }
   mListings[static_cast<std::size_t>(variable)] = std::move(candidates);
   Changed(variable, shown);
+  if (hadNone) FitToShape(variable);
+}
+
+const Shape* Store::HeldShape(int variable) const {
+  const int shape = mShapeOf[static_cast<std::size_t>(variable)];
+  return shape != kNone && !IsListed(variable) ? &mShapes[static_cast<std::size_t>(shape)] : nullptr;
+}
+
+Shape Store::ShapeOf(int variable) {
+  if (const Shape* held = HeldShape(variable)) return *held;
+  return IsListed(variable) ? Shape(List(variable).texts) : Shape();
+}
+
+// A shape that admits one text alone is its value.
+void Store::MeetShape(int variable, const Shape& shape) {
+  if (IsListed(variable)) {
+    const Listing& listing = List(variable);
+    std::vector<ZORString> texts;
+    for (const ZORString& text : listing.texts) {
+      if (shape.Admits(text.View())) texts.push_back(text);
+    }
+    if (texts.size() != listing.texts.size()) MeetTexts(variable, std::move(texts));
+    return;
+  }
+  Shape met = ShapeOf(variable);
+  met.Meet(shape);
+  if (met.IsNothing()) return Fail(variable);
+  if (const auto only = met.Only()) return MeetTexts(variable, {*only});
+  if (const Shape* held = HeldShape(variable); held != nullptr ? met != *held : !met.IsAnything())
+    HoldShape(variable, std::move(met));
+}
+
+void Store::HoldShape(int variable, Shape shape) {
+  const std::string shown = mWatcher != nullptr ? Show(variable) : "";
+  int& at = mShapeOf[static_cast<std::size_t>(variable)];
+  if (at == kNone) {
+    at = static_cast<int>(mShapes.size());
+    mShapes.emplace_back();
+  }
+  Shape& held = mShapes[static_cast<std::size_t>(at)];
+  if (!mMarks.empty()) mShapeTrail.emplace_back(variable, held);
+  held = std::move(shape);
+  Changed(variable, shown);
+}
+
+// What has become listed may be narrower than the shape it had, and wider.
+void Store::FitToShape(int variable) {
+  const int shape = mShapeOf[static_cast<std::size_t>(variable)];
+  if (shape != kNone && !HasFailed()) MeetShape(variable, mShapes[static_cast<std::size_t>(shape)]);
 }
 
 // Null when there are none. Until they come back the listing is not to be read.
@@ -256,6 +308,7 @@ std::unique_ptr<Listing> Store::TakeCandidates(int variable) {
 }
 
 std::string Store::Show(int variable) const {
+  if (const Shape* shape = HeldShape(variable)) return (*this)[variable].Show() + ": " + Describe(*shape);
   if (!HasCandidates(variable)) return (*this)[variable].Show();
   const Listing& candidates = mListings[static_cast<std::size_t>(variable)];
   Value all(mTypes, candidates.sort == Sort::Text ? Sort::TextSet : Sort::IntegerSet);
@@ -277,9 +330,13 @@ void Store::Fail(int variable) {
 }
 
 void Store::Undo() {
-  const std::size_t mark = mMarks.back();
+  const Marked mark = mMarks.back();
   mMarks.pop_back();
-  while (mTrail.size() > mark) {
+  for (; mShapeTrail.size() > mark.shapes; mShapeTrail.pop_back()) {
+    auto& [variable, shape] = mShapeTrail.back();
+    mShapes[static_cast<std::size_t>(mShapeOf[static_cast<std::size_t>(variable)])] = std::move(shape);
+  }
+  while (mTrail.size() > mark.values) {
     Saved& saved = mTrail.back();
     const auto at = static_cast<std::size_t>(saved.variable);
     mListed[at] = saved.candidates != nullptr ? 1 : 0;

@@ -2,6 +2,7 @@
 // value of its own, which Meet intersects with the variable. So no answer of the module can add a value.
 //
 // A single text or integer that could be several stays Undefined, but may have candidates, of which its value is one.
+// A text that is neither known nor has candidates may have a shape.
 #pragma once
 
 #include <array>
@@ -14,6 +15,7 @@
 
 #include "network/ZORModel.h"
 #include "network/operations.h"
+#include "network/shape.h"
 #include "network/values.h"
 
 namespace zornet {
@@ -80,6 +82,11 @@ class Store {
 
   bool HasCandidates(int variable) const;  // an Undefined single that is one of those that List answers
 
+  bool IsListed(int variable) const { return !(*this)[variable].IsUndefined() || HasCandidates(variable); }
+  Shape ShapeOf(int variable);                 // of a text; listed texts and nothing known have one too
+  const Shape* HeldShape(int variable) const;  // of a text that is not listed; null when nothing is known of it
+  void MeetShape(int variable, const Shape& shape);
+
   bool HasFailed() const { return mFailed != kNone; }
   int Failed() const { return mFailed; }  // the variable that became Nil, or kNone
   int FailedConstraint() const { return mFailedConstraint; }
@@ -92,7 +99,7 @@ class Store {
   Value& Bare(int variable) { return mValues[static_cast<std::size_t>(variable)]; }
 
   // Undo takes back the changes since the latest Mark.
-  void Mark() { mMarks.push_back(mTrail.size()); }
+  void Mark() { mMarks.push_back({mTrail.size(), mShapeTrail.size()}); }
   void Undo();
 
  private:
@@ -114,6 +121,8 @@ class Store {
   void MeetCandidates(int variable, Listing candidates);
   std::unique_ptr<Listing> TakeCandidates(int variable);
   void Changed(int variable, const std::string& before);
+  void FitToShape(int variable);
+  void HoldShape(int variable, Shape shape);
   std::string Show(int variable) const;
   std::uint64_t MostListed(int variable) const;
   void ForgetLimits();
@@ -124,9 +133,15 @@ class Store {
   std::vector<Value> mFresh;
   std::vector<Listing> mListings;
   std::vector<char> mListed;  // whether the listing is up to date
+  std::vector<int> mShapeOf;  // by variable: an index into mShapes, or kNone
+  std::vector<Shape> mShapes;
   std::vector<int> mTouched;
   std::vector<Saved> mTrail;
-  std::vector<std::size_t> mMarks;
+  std::vector<std::pair<int, Shape>> mShapeTrail;  // variables with the shapes that they had
+  struct Marked {
+    std::size_t values, shapes;
+  };
+  std::vector<Marked> mMarks;
   std::array<OperationCounts, kOperations> mCounts{};
   std::map<std::tuple<int, int, Limit>, LimitMet> mLimitsMet;  // by constraint and variable
   Watcher* mWatcher = nullptr;

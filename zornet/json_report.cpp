@@ -28,10 +28,18 @@ std::string_view Describe(Outcome outcome) {
   return "";
 }
 
+Json Describe(const TextShape& shape) {
+  return {{"shortest", shape.shortest},     {"longest", shape.longest},
+          {"beginning", shape.beginning},   {"end", shape.end},
+          {"least", shape.least},           {"greatest", shape.greatest},
+          {"characters", shape.characters}, {"orMax", shape.orMax}};
+}
+
 // The text form, and what it holds in a form that a program need not take apart.
 Json Describe(const Domain& domain, Sort sort) {
   Json json{{"value", domain.Print()}};
   json["state"] = domain.IsNil() ? "nil" : domain.IsAny() ? "any" : "known";
+  if (domain.HasShape()) json["shape"] = Describe(domain.Shape());
   if (!domain.IsKnown()) return json;
   if (IsText(sort)) {
     json["texts"] = domain.Texts();

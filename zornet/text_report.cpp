@@ -79,7 +79,7 @@ std::string TextReport::Shown(const Domain& domain) const {
                       : domain.IsOne()   ? Style::Known
                       : domain.IsKnown() ? Style::Open
                                          : Style::Faint;
-  return mPaint(style, domain.Print());
+  return mPaint(style, domain.HasShape() ? domain.Print() + ": " + domain.PrintShape() : domain.Print());
 }
 
 void TextReport::Show(const Network& network, const LimitsByVariable& limits) {

@@ -64,7 +64,9 @@ inline zornet::Var Solved::Find(const std::string& name) const {
 
 inline std::string Solved::Print() const {
   std::string text;
-  for (const int variable : GetModel().Wanted())
-    text += (text.empty() ? "" : ", ") + Network::operator[](variable).Print();
+  for (const int variable : GetModel().Wanted()) {
+    const zornet::Domain domain = Network::operator[](variable);
+    text += (text.empty() ? "" : ", ") + domain.Print() + (domain.HasShape() ? ": " + domain.PrintShape() : "");
+  }
   return text;
 }

@@ -44,20 +44,20 @@ class Check {
 
   bool Allows(std::size_t v, const naive::Value& value) const {
     const zornet::Domain domain = mSolved[static_cast<int>(v)];
+    if (naive::IsText(mNetwork.variables[v].type)) return domain.Admits(value.text);
     if (!domain.IsKnown()) return domain.IsAny();
     const auto holds = [](const auto& values, const auto& one) {
       return std::find(values.begin(), values.end(), one) != values.end();
     };
-    if (naive::IsText(mNetwork.variables[v].type)) return holds(domain.Texts(), value.text);
     if (mNetwork.variables[v].type == naive::Type::IntegerSet) return holds(domain.Numbers(), value.number);
     return domain.Lowest() <= value.number && value.number <= domain.Highest();
   }
 
   void CheckKept(const naive::Assignment& solution) {
     for (std::size_t v = 0; v < solution.size(); ++v) {
-      ASSERT_TRUE(Allows(v, solution[v]))
-          << mText << "v" << v << " became " << mSolved[static_cast<int>(v)].Print() << " and lost\n"
-          << Describe(solution);
+      ASSERT_TRUE(Allows(v, solution[v])) << mText << "v" << v << " became " << mSolved[static_cast<int>(v)].Print()
+                                          << ' ' << mSolved[static_cast<int>(v)].PrintShape() << " and lost\n"
+                                          << Describe(solution);
     }
   }
 

@@ -23,6 +23,64 @@ struct SameFiles : Files {
   std::string text;
 };
 
+// A model that is one, made by the choices in bytes: a few variables of every type, and any constraints on them.
+class Grown {
+ public:
+  explicit Grown(zor::fuzz::Bytes bytes) : mBytes(bytes) {
+    for (std::size_t more = 2 + mBytes.Below(7); more > 0; --more) {
+      const auto& [type, sort] = kTypes[mBytes.Below(std::size(kTypes))];
+      text += "var " + std::string(type) + ": v" + std::to_string(mSorts.size()) + ";\n";
+      mSorts.push_back(sort);
+    }
+    while (!mBytes.Ended()) Constrain(Kinds()[mBytes.Below(Kinds().size())]);
+  }
+  std::string text;
+
+ private:
+  static constexpr std::pair<const char*, Sort> kTypes[] = {{"string", Sort::Text},
+                                                            {"string", Sort::Text},
+                                                            {"set string", Sort::TextSet},
+                                                            {"{\"a\", \"Ab\", \"\", \"b a\"}", Sort::TextSet},
+                                                            {"int", Sort::Integer},
+                                                            {"0..3", Sort::Interval},
+                                                            {"-2147483648..2147483647", Sort::Interval},
+                                                            {"{1, 2, 300}", Sort::IntegerSet},
+                                                            {"bool", Sort::Boolean}};
+  static constexpr const char* kTexts[] = {"\"a\"", "\"\"", "\"aAb\"", "\" \"", "\"z\\\"z\""};
+  static constexpr const char* kTruths[] = {"true", "false"};
+  static constexpr const char* kExpressions[] = {"\"a*b?\"", "\"[^a]{1,3}|A.\"", "\"(a|ab)+\"", "\"\\\\d*\""};
+
+  template <std::size_t kCount>
+  std::string OneOf(const char* const (&choices)[kCount]) {
+    return choices[mBytes.Below(kCount)];
+  }
+  std::string Row() { return OneOf(kTexts) + ", " + OneOf(kTexts); }
+  std::string Argument(Takes takes) {
+    if (takes == Takes::Expression) return OneOf(kExpressions);
+    if (takes == Takes::Rows) return "[|" + Row() + "|" + Row() + "|]";
+    const std::size_t variable = mBytes.Below(mSorts.size());
+    if (Fits(mSorts[variable], takes) && mBytes.Below(4) != 0) return "v" + std::to_string(variable);
+    if (takes == Takes::Boolean) return OneOf(kTruths);
+    return takes == Takes::Integer ? std::to_string(static_cast<int>(mBytes.Below(9)) - 2) : OneOf(kTexts);
+  }
+  std::string List(Takes takes) {
+    std::string list = Argument(MemberOf(takes));
+    for (std::size_t more = 1 + mBytes.Below(3); more > 0; --more) list += ", " + Argument(MemberOf(takes));
+    return "[" + list + "]";
+  }
+  void Constrain(const Kind& kind) {
+    std::string arguments;
+    for (int i = 0; i < kind.arity; ++i) {
+      const Takes takes = kind.takes[static_cast<std::size_t>(i)];
+      arguments += (i == 0 ? "" : ", ") + (IsList(takes) ? List(takes) : Argument(takes));
+    }
+    text += "constraint " + std::string(kind.name) + "(" + arguments + ");\n";
+  }
+
+  zor::fuzz::Bytes mBytes;
+  std::vector<Sort> mSorts;  // of the variables
+};
+
 // Tells report all there is to tell of a model: bare calls, what is narrowed, explanations and solutions.
 Summary Tell(const Source& source, const ReadModel& read, Report& report, bool traces) {
   static const Network kKeepsModulesLoaded{Model()};
@@ -54,9 +112,10 @@ void CheckObjects(std::istringstream lines) {
 
 }  // namespace
 
-// With a listener or without, the outcome is the same.
+// With a listener or without, the outcome is the same. Behind a zero byte stand the choices of a model.
 int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  const SameFiles files(std::string(data, data + size));
+  const bool grown = size > 0 && data[0] == 0;
+  const SameFiles files(grown ? Grown({data + 1, size - 1}).text : std::string(data, data + size));
   Source source("fuzz.szn", files.text);
   Diagnostics diagnostics;
   const ReadModel read = Read(source, diagnostics, files);

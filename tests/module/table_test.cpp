@@ -56,11 +56,8 @@ const Entry kStrings[] = {
   S(CalcInverseStringRepresentation), S(CalcLowerValue), S(CalcInverseLowerValue), S(CalcUpperValue),
   S(CalcInverseUpperValue), S(CalcConcatenation), S(CalcFirstInverseConcatenation), S(CalcSecondInverseConcatenation),
   S(CalcSubString), S(CalcFirstInverseSubString), S(CalcSecondInverseSubString), S(CalcThirdInverseSubString),
+  {"SetLowerBound", Slot(&ZORVadSingleString::SetLowerBound)}, {"SetUpperBound", Slot(&ZORVadSingleString::SetUpperBound)},
 };
-const Entry kSingles[] = {{"SetLowerBound", Slot(&ZORVadSingleString::SetLowerBound)},
-                          {"SetUpperBound", Slot(&ZORVadSingleString::SetUpperBound)}};
-const Entry kSets[] = {{"SetLowerBound", Slot(&ZORVadEnumString::SetLowerBound)},
-                       {"SetUpperBound", Slot(&ZORVadEnumString::SetUpperBound)}};
 using Known = ZORVaDoObject* (ZORVadSingleString::Descriptor::*)(void*, const void*) const;
 using Unknown = ZORVaDoObject* (ZORVadSingleString::Descriptor::*)(void*) const;
 const Entry kDescriptors[] = {
@@ -91,8 +88,8 @@ const Entry kIterators[] = {
 
 TEST(Tables, Order) {
   ExpectInOrder(kStrings);
-  ExpectInOrder(kSingles, 2 + static_cast<std::ptrdiff_t>(std::size(kStrings)));
-  ExpectInOrder(kSets, 2 + static_cast<std::ptrdiff_t>(std::size(kStrings)));
+  EXPECT_EQ(Slot(&ZORVadEnumString::SetLowerBound), Slot(&ZORVadSingleString::SetLowerBound));
+  EXPECT_EQ(Slot(&ZORVadEnumString::SetUpperBound), Slot(&ZORVadSingleString::SetUpperBound));
   ExpectInOrder(kDescriptors);
   ExpectInOrder(kVectors);
   ExpectInOrder(kIterators, 0);

@@ -2,7 +2,6 @@
 #include <dlfcn.h>
 #include <gtest/gtest.h>
 
-#include <algorithm>
 #include <array>
 #include <string>
 #include <vector>
@@ -26,16 +25,11 @@ struct Library {
     return reinterpret_cast<Symbol*>(symbol);
   }
   const ZORVaDoObjectDescriptor* Descriptor(const char* name) { return *Find<const ZORVaDoObjectDescriptor*>(name); }
-  std::array<int, 4> Lengths() {
-    std::array<int, 4> lengths{};
-    std::transform(std::begin(kTexts), std::end(kTexts), lengths.begin(),
-                   [&](const char* name) { return Find<ZORString>(name)->GetLengthInChar(); });
-    return lengths;
+  int Length(const char* text) {
+    return Find<ZORString>((std::string("_ZN13ZORVaDoString16ZorVaDoString") + text + "E").c_str())->GetLengthInChar();
   }
+  std::array<int, 4> Lengths() { return {Length("Min"), Length("Max"), Length("Any"), Length("Nil")}; }
 
-  static constexpr const char* kTexts[] = {
-      "_ZN13ZORVaDoString16ZorVaDoStringMinE", "_ZN13ZORVaDoString16ZorVaDoStringMaxE",
-      "_ZN13ZORVaDoString16ZorVaDoStringAnyE", "_ZN13ZORVaDoString16ZorVaDoStringNilE"};
   void* const handle = dlopen(ZOR_MODULE_FILE, RTLD_NOW | RTLD_LOCAL);
 };
 

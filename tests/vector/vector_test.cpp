@@ -47,6 +47,7 @@ class Walk {
 
   void Step() {
     mIsRefused = Random(4) == 0;
+    const int del = Flag();
     // A vector out of order is changed by place alone.
     const unsigned int action = IsInOrder() ? Random(100) : 60 + Random(40);
     const bool grows = mSteps++ % 1000 < 500;
@@ -56,7 +57,6 @@ class Walk {
       Add(&Vector::AddUnique);
     } else if (action < 60) {
       const ZORString sought(ZORChar(Letter()), 1);
-      const int del = Flag();
       const unsigned int pos = mVector.Find(&sought);
       Expect(DetachAt(pos, 1, del), [&] { return mVector.Detach(&sought, del); });
     } else if (action < 75) {
@@ -65,7 +65,6 @@ class Walk {
       Expect(AddAt(s, pos), [&] { return mVector.AddAt(s, pos); });
     } else if (action < 88) {
       const unsigned int pos = Number(), count = Random(8) != 0 ? 1 : Number();
-      const int del = Flag();
       Expect(DetachAt(pos, count, del), [&] { return mVector.DetachAt(pos, count, del); });
     } else if (action < 94) {
       const unsigned int wanted = Number();
@@ -74,7 +73,6 @@ class Walk {
       Replace();
     } else {
       const unsigned int stop = Random(3) == 0 ? mLimit : Number(), start = stop == mLimit ? 0 : Number();
-      const int del = Flag();
       Flush(del, stop, start);
       Expect(0, [&] { return stop == mLimit ? mVector.Flush(del) : mVector.Flush(del, stop, start), 0; });
     }
@@ -183,30 +181,31 @@ class Walk {
   }
 
   void CompareVisits() {
-    const bool all = Flag() != 0;
-    const unsigned int first = all ? 0 : Number(), last = all ? mTop : Number();
+    const unsigned int top = mVector.Top(), first = Number(), last = Number();
     const unsigned int end = std::min<std::size_t>(last, mPlaces.size()), start = std::min(first, end);
     const Strings range(mPlaces.begin() + start, mPlaces.begin() + end);
     Strings strings, walked;
-    std::copy_if(range.begin(), range.end(), std::back_inserter(strings), [](auto* s) { return s != nullptr; });
-    Seen each, before, behind;
+    std::remove_copy(range.begin(), range.end(), std::back_inserter(strings), nullptr);
+    Seen each, before, behind, all;
     std::sample(strings.begin(), strings.end(), std::back_inserter(before.wanted), Random(3), mRandom);
-    behind.wanted = before.wanted;
+    const Strings wanted = behind.wanted = all.wanted = before.wanted;
     const auto visit = [](ZORString& s, void* seen) { IsWanted(s, seen); };
-    all ? mVector.ForEach(visit, &each) : mVector.ForEach(visit, &each, first, last);
-    const ZORString* const least =
-        all ? mVector.FirstThat(IsWanted, &before) : mVector.FirstThat(IsWanted, &before, first, last);
-    const ZORString* const greatest =
-        all ? mVector.LastThat(IsWanted, &behind) : mVector.LastThat(IsWanted, &behind, first, last);
+    mVector.ForEach(visit, &each, first, last);
     EXPECT_EQ(strings, each.all);
+    EXPECT_EQ(wanted.empty() ? nullptr : wanted.back(), mVector.LastThat(IsWanted, &behind, first, last));
     EXPECT_EQ(strings, behind.all);
-    EXPECT_EQ(before.wanted.empty() ? nullptr : before.wanted.front(), least);
-    EXPECT_EQ(before.wanted.empty() ? nullptr : before.wanted.back(), greatest);
-    if (least != nullptr) strings.erase(std::find(strings.begin(), strings.end(), least) + 1, strings.end());
+    EXPECT_EQ(wanted.empty() ? nullptr : wanted.front(), mVector.FirstThat(IsWanted, &before, first, last));
+    if (!wanted.empty()) strings.erase(std::find(strings.begin(), strings.end(), wanted[0]) + 1, strings.end());
     EXPECT_EQ(strings, before.all);
-
-    for (Iterator i = all ? Iterator(mVector) : Iterator(mVector, start, end); i;) walked.push_back(i++);
+    for (Iterator i(mVector, start, end); i;) walked.push_back(i++);
     EXPECT_EQ(range, walked);
+
+    // Without a range, all elements.
+    EXPECT_EQ(mVector.FirstThat(IsWanted, &all, 0, top), mVector.FirstThat(IsWanted, &all));
+    EXPECT_EQ(mVector.LastThat(IsWanted, &all, 0, top), mVector.LastThat(IsWanted, &all));
+    each.all.clear(), all.all.clear();
+    mVector.ForEach(visit, &each), mVector.ForEach(visit, &all, 0, top);
+    EXPECT_EQ(each.all, all.all);
   }
 
   void CompareSearches() {
@@ -237,7 +236,7 @@ class Walk {
 TEST(Vector, BesideItsPlaces) {
   ZORString text("a");
   Vector full(3, 2u);
-  full.Add(&text);
+  EXPECT_EQ(1, full.Add(&text));
   const auto walk = [](Vector&& start, bool hasArray, int steps = 3000) {
     Walk beside(std::move(start), hasArray);
     for (int step = 0; step < steps && !testing::Test::HasFailure(); ++step) {
@@ -332,28 +331,23 @@ TEST(Vector, Iterators) {
   ZORString texts[5];
   Vector v(20, 20u);
   for (unsigned int i = 1; i < 5; ++i) v.AddAt(&texts[i], i - 1);
-  const auto rest = [&](Iterator& i) {
-    std::string places;
-    for (; i; ++i) places += static_cast<char>('0' + (i.Current() - texts));
-    return places;
+  const auto expect = [&](std::ptrdiff_t first, std::ptrdiff_t last, Iterator& i) {
+    for (; first <= last; ++i) EXPECT_EQ(&texts[first++], i.Current());
+    EXPECT_EQ(nullptr, i++);  // moves on at the end too
+    EXPECT_EQ(0, static_cast<int>(i));
+    i.Restart();
   };
   Iterator all(v), range(v, 1, 3);
-  EXPECT_EQ("23", rest(range));
-  EXPECT_EQ(nullptr, range.Current());
-  range.Restart();
-  EXPECT_EQ(&texts[2], range.Current());
+  expect(2, 3, range);
   EXPECT_EQ(&texts[3], ++range);
   range.Restart(2, 4);
-  EXPECT_EQ("34", rest(range));
+  expect(3, 4, range);
   Iterator copy(range);
-  EXPECT_EQ(nullptr, copy++);  // moves on at the end too
-  copy.Restart();
-  EXPECT_EQ("34", rest(copy));
+  expect(3, 4, copy);
   v.AddAt(&texts[0], 0);  // the places are read now, the end was fixed before
-  EXPECT_EQ("0123", rest(all));
-  copy = all;
-  copy.Restart();
-  EXPECT_EQ("0123", rest(copy));
+  expect(0, 3, all);
+  range = all;
+  expect(0, 3, range);
 }
 
 }  // namespace

@@ -5,80 +5,20 @@
 #include <climits>
 #include <csignal>
 #include <cstdio>
-#include <cstdlib>
+#include <functional>
 #include <memory>
-#include <new>
 #include <string>
 #include <utility>
-#include <vector>
 
 #include "enum/ZORVadEnumString.h"
 #include "module/InitModule.h"
+#include "tests/allocation/memory.h"
 
 namespace {
 
-constexpr int kNone = -1;
-int sRefused = kNone;  // how many can be had before one is refused
-bool sWasRefused = false;
-std::ptrdiff_t sLive = 0;
-
-void* Allocate(std::size_t size) {
-  void* const memory = std::malloc(size);
-  if (memory == nullptr) std::abort();
-  ++sLive;
-  return memory;
-}
-
-void Free(void* memory) {
-  if (memory != nullptr) --sLive;
-  std::free(memory);
-}
-
-// Only what asks for an answer is refused; the rest could not tell.
-void* AllocateOrRefuse(std::size_t size) {
-  if (sRefused != kNone && sRefused-- == 0) {
-    sWasRefused = true;
-    return nullptr;
-  }
-  return Allocate(size);
-}
-
-}  // namespace
-
-void* operator new(std::size_t size) { return Allocate(size); }
-void* operator new[](std::size_t size) { return Allocate(size); }
-void* operator new(std::size_t size, const std::nothrow_t&) noexcept { return AllocateOrRefuse(size); }
-void* operator new[](std::size_t size, const std::nothrow_t&) noexcept { return AllocateOrRefuse(size); }
-void operator delete(void* memory) noexcept { Free(memory); }
-void operator delete[](void* memory) noexcept { Free(memory); }
-void operator delete(void* memory, std::size_t) noexcept { Free(memory); }
-void operator delete[](void* memory, std::size_t) noexcept { Free(memory); }
-
-namespace {
-
+using namespace zor::test;
 using Single = ZORVadSingleString;
 using Set = ZORVadEnumString;
-
-template <class Run>
-void RunRefused(int number, Run run) {
-  sRefused = number;
-  sWasRefused = false;
-  run();
-  sRefused = kNone;
-}
-
-// Refuses each allocation of run in turn, the last time none; run must leave nothing allocated. Answers how many
-// allocations one run makes.
-template <class Run>
-int RefuseEach(Run run) {
-  for (int number = 0;; ++number) {
-    SCOPED_TRACE(number);
-    const std::ptrdiff_t live = sLive;
-    RunRefused(number, run);
-    EXPECT_EQ(sLive, live);
-    if (!sWasRefused) return number;
-  }
-}
 
 std::string Form(const ZORVaDoObject& value) {
   ZORostrstream out;
@@ -86,85 +26,82 @@ std::string Form(const ZORVaDoObject& value) {
   return std::string(out.View());
 }
 
-// The classes never free their descriptors.
+// The classes never free their descriptors. Answers whether there was one.
 template <class Class>
-void DeleteDescriptor() {
-  delete std::exchange(Class::sDescriptor, nullptr);
+bool DeleteDescriptor() {
+  const std::unique_ptr<const ZORVaDoObjectDescriptor> former(std::exchange(Class::sDescriptor, nullptr));
+  return former != nullptr;
 }
 
-// Each class makes its descriptor, or answers null and has none, not even the one that it had.
+// A class makes its descriptor, or answers null and has none, not even the one that it had.
 template <class Class>
-void RefuseDescriptor() {
-  const std::unique_ptr<const ZORVaDoObjectDescriptor> former(Class::MakeDescriptor());
-  EXPECT_EQ(RefuseEach([] {
-              const auto* const descriptor = Class::MakeDescriptor();
-              EXPECT_EQ(descriptor == nullptr, sWasRefused);
-              EXPECT_EQ(descriptor, Class::sDescriptor);
-              DeleteDescriptor<Class>();
-            }),
-            1);
+void RemakeDescriptor() {
+  static const typename Class::Descriptor kFormer("former", nullptr, 0);
+  Class::sDescriptor = &kFormer;
+  const auto* const made = Class::MakeDescriptor();
+  EXPECT_EQ(made == nullptr, sWasRefused);
+  EXPECT_EQ(made, Class::sDescriptor);
+  DeleteDescriptor<Class>();
 }
 
-TEST(Refused, Descriptors) {
-  RefuseDescriptor<ZORVaDoString>();
-  RefuseDescriptor<Single>();
-  RefuseDescriptor<Set>();
+void Init() {
+  ZORVaDoModuleManager manager;
+  ZORVaDoModule module(ZORString("ZORVadStrings"));
+  EXPECT_EQ(InitModule(&module, &manager), 1);
+  std::vector<const ZORVaDoObjectDescriptor*> expected = {Single::sDescriptor, Set::sDescriptor};
+  std::erase(expected, nullptr);
+  EXPECT_EQ(module.GetDescriptors(), expected);
+  const int made = DeleteDescriptor<ZORVaDoString>() + DeleteDescriptor<Single>() + DeleteDescriptor<Set>();
+  EXPECT_EQ(made < 3, sWasRefused);
 }
 
-TEST(Refused, InitModule) {
-  RefuseEach([] {
-    ZORVaDoModuleManager manager;
-    ZORVaDoModule module(ZORString("ZORVadStrings"));
-    EXPECT_EQ(InitModule(&module, &manager), 1);
-    std::vector<const ZORVaDoObjectDescriptor*> expected;
-    if (Single::sDescriptor != nullptr) expected.push_back(Single::sDescriptor);
-    if (Set::sDescriptor != nullptr) expected.push_back(Set::sDescriptor);
-    EXPECT_EQ(module.GetDescriptors(), expected);
-    EXPECT_EQ(expected.size() < 2 || ZORVaDoString::sDescriptor == nullptr, sWasRefused);
-    DeleteDescriptor<ZORVaDoString>();
-    DeleteDescriptor<Single>();
-    DeleteDescriptor<Set>();
-  });
-}
-
-// Every class that streams know by name.
-TEST(Refused, Factories) {
+// Each allocation of a run is refused in turn, the last time none; the run leaves nothing allocated.
+TEST(Refused, OneByOne) {
+  InitStrings();
+  const Single stored("text");
+  ZORopstream texts, pointers;
+  stored.Write(texts);
+  pointers.WriteObjectPointer(&stored);
+  int number = 0;
+  std::vector<std::pair<std::string, std::function<void()>>> runs = {
+      {"descriptor of strings", RemakeDescriptor<ZORVaDoString>},
+      {"descriptor of single strings", RemakeDescriptor<Single>},
+      {"descriptor of sets", RemakeDescriptor<Set>},
+      {"module", Init},
+      {"text from a stream",
+       [&] {
+         ZORipstream in(texts.Bytes());
+         Single value;
+         value.Read(in);
+         EXPECT_EQ(Form(value), sWasRefused ? "Nil" : "\"text\"");
+         EXPECT_EQ(in.Fail(), sWasRefused);
+       }},
+      {"object from a stream",
+       [&] {
+         ZORipstream in(pointers.Bytes());
+         const std::unique_ptr<ZORStreamable> object(in.ReadObjectPointer());
+         EXPECT_EQ(in.Fail(), sWasRefused);
+         const auto* const value = Single::DynamicCast(ZORVaDoBase::FromStream(object.get()));
+         EXPECT_TRUE(value == nullptr || Form(*value) == (sWasRefused ? "Nil" : "\"text\""));
+       }},
+  };
   for (const char* name : {"ZORVadSingleString", "ZORVadSingleString_Descriptor", "ZORVadEnumString",
                            "ZORVadEnumString_Descriptor", "ZORVaDoString_Descriptor", "ZORVadSingleInteger",
-                           "ZORVadIntervalInteger", "ZORVadEnumInteger", "ZORVadSingleBoolean"}) {
-    SCOPED_TRACE(name);
-    const auto* const record = ZORStreamableClass::Find(name);
-    ASSERT_NE(record, nullptr);
-    int built = 0;
-    const int allocations = RefuseEach([&] {
-      const std::unique_ptr<ZORStreamable> object(record->Build());
-      built += object != nullptr ? 1 : 0;
+                           "ZORVadIntervalInteger", "ZORVadEnumInteger", "ZORVadSingleBoolean"})
+    runs.emplace_back(name, [name, &number] {
+      const std::unique_ptr<ZORStreamable> object(ZORStreamableClass::Find(name)->Build());
+      EXPECT_EQ(object == nullptr, number == 0);  // what it has besides can be missing
     });
-    EXPECT_EQ(built, allocations);  // all but the one whose first allocation is refused
+  for (const auto& [name, run] : runs) {
+    number = 0;
+    do {
+      SCOPED_TRACE(testing::Message() << name << " without allocation " << number);
+      const std::ptrdiff_t live = sLive;
+      RunRefused(number, run);
+      EXPECT_EQ(sLive, live);
+      EXPECT_TRUE(sWasRefused || number > 0);
+    } while (sWasRefused && ++number < 100);
   }
-}
-
-// What is missing reads as null, and a value without its text as Nil.
-TEST(Refused, Streams) {
-  ZORopstream out;
-  Single("text").Write(out);
-  RefuseEach([&] {
-    ZORipstream in(out.Bytes());
-    Single value;
-    value.Read(in);
-    EXPECT_EQ(Form(value), sWasRefused ? "Nil" : "\"text\"");
-    EXPECT_EQ(in.Fail(), sWasRefused);
-  });
-  const Single stored("text");
-  ZORopstream pointers;
-  pointers.WriteObjectPointer(&stored);
-  RefuseEach([&] {
-    ZORipstream in(pointers.Bytes());
-    const std::unique_ptr<ZORStreamable> object(in.ReadObjectPointer());
-    EXPECT_EQ(in.Fail(), sWasRefused);
-    const auto* const value = Single::DynamicCast(ZORVaDoBase::FromStream(object.get()));
-    EXPECT_TRUE(value == nullptr || Form(*value) == (sWasRefused ? "Nil" : "\"text\""));
-  });
 }
 
 // A set that was read in part keeps none of it.
@@ -219,38 +156,35 @@ std::string Operate() {
 TEST(RefusedDeathTest, TextsAndPlaces) {
   InitStrings();
   const std::string expected = Operate();
-  const auto endsWell = [](int status) {
-    return testing::ExitedWithCode(0)(status) || testing::KilledBySignal(SIGABRT)(status);
-  };
-  int allocations = 0;
-  RunRefused(INT_MAX, [&] { Operate(), allocations = INT_MAX - sRefused; });
   const auto refuse = [&](int number) {
-    std::string told;
-    RunRefused(number, [&] { told = Operate(); });
+    const std::string told = RunRefused(number, Operate);
     if (told == expected) std::fputs("no difference\n", stderr);
     std::exit(told == expected ? 0 : 1);
   };
+  const auto endsWell = [](int status) {
+    return testing::ExitedWithCode(0)(status) || testing::KilledBySignal(SIGABRT)(status);
+  };
+  const int allocations = RunRefused(INT_MAX, [] { return Operate(), INT_MAX - sRefused; });
   EXPECT_GT(allocations, 100);
   for (int number = 0; number < allocations; ++number)
     EXPECT_EXIT(refuse(number), endsWell, "ZORString: out of memory|no memory for a set of texts|no difference")
         << number;
 }
 
-template <class Run>
-void ExpectDeath(Run run, const char* message) {
-  EXPECT_DEATH(RunRefused(0, run), message);
-}
-
 TEST(RefusedDeathTest, OneByOne) {
   const ZORString text('a', 40);
   Set full("a");
   for (int i = 0; full.Count() < 21; ++i) full.Insert(std::to_string(i).c_str());
-  ExpectDeath([] { new ZORString; }, "ZORString: out of memory");
-  ExpectDeath([&] { ZORString copy(text); }, "ZORString: out of memory");
-  ExpectDeath([&] { ZORString().Append(text); }, "ZORString: out of memory");
-  ExpectDeath([&] { Single value(text); }, "ZORString: out of memory");
-  ExpectDeath([] { Set value("a"); }, "no memory for a set of texts");
-  ExpectDeath([&] { Set copy(full); }, "no memory for a set of texts");
+  const char *const kText = "ZORString: out of memory", *const kSet = "no memory for a set of texts";
+  const std::pair<std::function<void()>, const char*> runs[] = {
+      {[] { new ZORString; }, kText},
+      {[&] { ZORString copy(text); }, kText},
+      {[&] { ZORString().Append(text); }, kText},
+      {[&] { Single value(text); }, kText},
+      {[] { Set value("a"); }, kSet},
+      {[&] { Set copy(full); }, kSet},
+  };
+  for (const auto& [run, message] : runs) EXPECT_DEATH(RunRefused(0, run), message);
 }
 
 }  // namespace

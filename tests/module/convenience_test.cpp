@@ -10,16 +10,13 @@
 namespace {
 
 TEST(Conveniences, TextsFromAndToTheStandardLibrary) {
-  const std::string long_text(40, 'a'), with_zero("a\0b", 3);
-  for (const std::string& text : {std::string(), std::string("abc"), long_text, with_zero}) {
+  for (const std::string& text : {std::string(), std::string(40, 'a'), std::string("a\0b", 3)}) {
     const ZORString copied = text, viewed = std::string_view(text);
     EXPECT_EQ(copied.View(), text);
     EXPECT_EQ(std::string_view(viewed), text);
-    EXPECT_TRUE(copied == viewed);
+    EXPECT_EQ(ZORVadEnumString(text + 'a').GetLowerBound().View(), text + 'a');
   }
   EXPECT_EQ(ZORString(std::string_view()).GetLengthInChar(), 0);
-  const ZORVadEnumString set(long_text);
-  EXPECT_EQ(set.GetLowerBound().View(), long_text);
 }
 
 TEST(Conveniences, AreShownOnStreams) {

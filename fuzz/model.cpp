@@ -1,4 +1,6 @@
 // Models: any text is a model or is answered with errors, and a model is narrowed, searched and told about.
+#include <fmt/format.h>
+
 #include <nlohmann/json.hpp>
 #include <sstream>
 
@@ -29,7 +31,7 @@ class Grown {
   explicit Grown(zor::fuzz::Bytes bytes) : mBytes(bytes) {
     for (std::size_t more = 2 + mBytes.Below(7); more > 0; --more) {
       const auto& [type, sort] = kTypes[mBytes.Below(std::size(kTypes))];
-      text += "var " + std::string(type) + ": v" + std::to_string(mSorts.size()) + ";\n";
+      text += fmt::format("var {}: v{};\n", type, mSorts.size());
       mSorts.push_back(sort);
     }
     while (!mBytes.Ended()) Constrain(Kinds()[mBytes.Below(Kinds().size())]);
@@ -54,27 +56,27 @@ class Grown {
   std::string OneOf(const char* const (&choices)[kCount]) {
     return choices[mBytes.Below(kCount)];
   }
-  std::string Row() { return OneOf(kTexts) + ", " + OneOf(kTexts); }
+  std::string Row() { return fmt::format("{}, {}", OneOf(kTexts), OneOf(kTexts)); }
   std::string Argument(Takes takes) {
     if (takes == Takes::Expression) return OneOf(kExpressions);
-    if (takes == Takes::Rows) return "[|" + Row() + "|" + Row() + "|]";
+    if (takes == Takes::Rows) return fmt::format("[|{}|{}|]", Row(), Row());
     const std::size_t variable = mBytes.Below(mSorts.size());
-    if (Fits(mSorts[variable], takes) && mBytes.Below(4) != 0) return "v" + std::to_string(variable);
+    if (Fits(mSorts[variable], takes) && mBytes.Below(4) != 0) return fmt::format("v{}", variable);
     if (takes == Takes::Boolean) return OneOf(kTruths);
     return takes == Takes::Integer ? std::to_string(static_cast<int>(mBytes.Below(9)) - 2) : OneOf(kTexts);
   }
   std::string List(Takes takes) {
     std::string list = Argument(MemberOf(takes));
     for (std::size_t more = 1 + mBytes.Below(3); more > 0; --more) list += ", " + Argument(MemberOf(takes));
-    return "[" + list + "]";
+    return fmt::format("[{}]", list);
   }
   void Constrain(const Kind& kind) {
     std::string arguments;
     for (int i = 0; i < kind.arity; ++i) {
       const Takes takes = kind.takes[static_cast<std::size_t>(i)];
-      arguments += (i == 0 ? "" : ", ") + (IsList(takes) ? List(takes) : Argument(takes));
+      arguments += fmt::format("{}{}", i == 0 ? "" : ", ", IsList(takes) ? List(takes) : Argument(takes));
     }
-    text += "constraint " + std::string(kind.name) + "(" + arguments + ");\n";
+    text += fmt::format("constraint {}({});\n", kind.name, arguments);
   }
 
   zor::fuzz::Bytes mBytes;

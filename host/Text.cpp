@@ -24,6 +24,8 @@ std::string_view ViewOf(const char* text) { return text != nullptr ? std::string
 
 }  // namespace
 
+void ZOR_STANDARD_LIBRARY() {}
+
 ZORChar::ZORChar(const ZORChar& other) = default;
 ZORChar& ZORChar::operator=(const ZORChar& other) = default;
 ZORChar::~ZORChar() = default;

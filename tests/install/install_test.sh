@@ -52,6 +52,16 @@ pkg_config() {
   try_linked "$scratch/linked"
 }
 
+# What does not fit does not link, and the message says why.
+mismatch() {
+  local flags told
+  flags=$(PKG_CONFIG_PATH=$tree/lib/pkgconfig pkg-config --cflags --libs zorvadstrings)
+  # shellcheck disable=SC2086  # flags are words
+  ! told=$("$CXX" -std=c++20 $CXXFLAGS -D_GLIBCXX_DEBUG "$here/consumer/linked.cpp" $flags -o "$scratch/other" 2>&1) ||
+    fail "the debug mode of the standard library is linked"
+  [[ $told == *ZorIsNotBuiltForDebugModeOfLibstdcxx* ]] || fail "$told"
+}
+
 opening() { "$scratch/consumer/opening" "$tree/lib/libZORVadStrings.so"; }
 
 zornet() { narrow "$tree"; }

@@ -454,11 +454,13 @@ void Resolver::RefuseExpression(const Kind& kind, std::span<const Word> argument
 
 // Answers false.
 bool Resolver::Refuse(const Kind& kind, std::size_t place, const Word& word, std::string_view is) {
-  const bool named = word.type == Word::Name || word.type == Word::Element;
+  const bool hasName = word.type == Word::Name || word.type == Word::Element;
+  const Named* const named = hasName ? Find(word.token) : nullptr;
+  if (hasName && named == nullptr) return false;
   mDiagnostics.Error(word.token.extent,
                      fmt::format("{} takes {} for {}, and {} is {}", kind.name, Describe(kind.takes[place]),
-                                 kind.roles[place], named ? Written(word) : "this", is));
-  if (named) TellPlace(word.token, mNames.at(word.token.text));
+                                 kind.roles[place], hasName ? Written(word) : "this", is));
+  if (hasName) TellPlace(word.token, *named);
   return false;
 }
 

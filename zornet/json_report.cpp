@@ -56,7 +56,7 @@ Json ValueOf(const Domain& domain, Sort sort) {
 class JsonReport : public Report {
  public:
   JsonReport(const Source& source, const Places& places, const Model& model, std::ostream& results)
-      : mModel(model), mNames(source, places, model), mResults(results) {}
+      : mFile(source.Name()), mModel(model), mNames(source, places, model), mResults(results) {}
 
   void Errors(const Source& source, const Diagnostics& diagnostics) override {
     Locator locate(source);
@@ -118,13 +118,14 @@ class JsonReport : public Report {
   }
 
   void Called(const RawCall& call) override {
-    Tell({{"event", "call"},
-          {"line", mNames.LineOfConstraint(call.constraint)},
-          {"call", call.call},
-          {"answer", call.answer},
-          {"target", call.target},
-          {"before", call.before},
-          {"after", call.after}});
+    Json json{{"event", "call"}};
+    AddLine(json, call.constraint);
+    json.update({{"call", call.call},
+                 {"answer", call.answer},
+                 {"target", call.target},
+                 {"before", call.before},
+                 {"after", call.after}});
+    Tell(json);
   }
 
   void Finish(const Network& network, const Summary& summary) override {
@@ -145,7 +146,7 @@ class JsonReport : public Report {
     if (const int failed = network.FailedConstraint(); failed != kNone) {
       json["variable"] = mNames.OfVariable(network.FailedVariable());
       json["constraint"] = mNames.OfConstraint(failed);
-      json["line"] = mNames.LineOfConstraint(failed);
+      AddLine(json, failed);
     }
     Tell(json);
     mResults.flush();
@@ -162,9 +163,16 @@ class JsonReport : public Report {
     return json;
   }
 
+  // The file where it is not that of the model.
+  void AddLine(Json& json, int constraint) const {
+    const std::string& file = mNames.FileOfConstraint(constraint);
+    if (file != mFile) json["file"] = file;
+    json["line"] = mNames.LineOfConstraint(constraint);
+  }
+
   void AddConstraint(Json& json, int constraint) const {
     if (constraint == kNone) return;
-    json["line"] = mNames.LineOfConstraint(constraint);
+    AddLine(json, constraint);
     json["constraint"] = mNames.OfConstraint(constraint);
   }
 
@@ -182,6 +190,7 @@ class JsonReport : public Report {
   // File names and broken models need not be UTF-8. In ASCII alone nothing acts on a terminal.
   void Tell(const Json& json) { mResults << json.dump(-1, ' ', true, Json::error_handler_t::replace) << '\n'; }
 
+  const std::string& mFile;
   const Model& mModel;
   Names mNames;
   std::ostream& mResults;

@@ -57,6 +57,10 @@ std::size_t Names::LineOfConstraint(int constraint) const {
   return mSource.LineOf(mPlaces.constraints[static_cast<std::size_t>(constraint)].begin);
 }
 
+const std::string& Names::FileOfConstraint(int constraint) const {
+  return mSource.NameAt(mPlaces.constraints[static_cast<std::size_t>(constraint)].begin);
+}
+
 std::string Names::PlaceOfConstraint(int constraint) const {
   return constraint == kNone ? Harmless(mSource.Name())
                              : Place(mPlaces.constraints[static_cast<std::size_t>(constraint)]);

@@ -69,6 +69,7 @@ class Names {
   std::string DeclarationOf(int variable) const;  // the line of the source that declares it
   std::string OfVariable(Var variable) const { return OfVariable(variable.index); }
   std::size_t LineOfConstraint(int constraint) const;
+  const std::string& FileOfConstraint(int constraint) const;
   std::string PlaceOfConstraint(int constraint) const;  // file:line
   std::string PlaceOfVariable(int variable) const;
 

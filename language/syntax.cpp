@@ -55,7 +55,7 @@ class Parser {
   void Include();
   void Constraint();
   void Output();
-  void Finish(DeclarationSyntax& declaration);
+  void Finish(const DeclarationSyntax& declaration);
   Range Value(DeclarationSyntax& declaration);
   Range Indices();
   TypeSyntax Type();
@@ -137,9 +137,9 @@ Range Parser::Value(DeclarationSyntax& declaration) {
   return value;
 }
 
-void Parser::Finish(DeclarationSyntax& declaration) {
+void Parser::Finish(const DeclarationSyntax& declaration) {
   Expect(";", "at the end of the declaration");
-  mSyntax.declarations.push_back(std::move(declaration));
+  mSyntax.declarations.push_back(declaration);
 }
 
 // set of string: NAME = SET;

@@ -171,20 +171,21 @@ TEST(RefusedDeathTest, TextsAndPlaces) {
         << number;
 }
 
+template <class Run>
+void ExpectDeath(Run run, const char* message) {
+  EXPECT_DEATH(RunRefused(0, run), message);
+}
+
 TEST(RefusedDeathTest, OneByOne) {
   const ZORString text('a', 40);
   Set full("a");
   for (int i = 0; full.Count() < 21; ++i) full.Insert(std::to_string(i).c_str());
-  const char *const kText = "ZORString: out of memory", *const kSet = "no memory for a set of texts";
-  const std::pair<std::function<void()>, const char*> runs[] = {
-      {[] { new ZORString; }, kText},
-      {[&] { ZORString copy(text); }, kText},
-      {[&] { ZORString().Append(text); }, kText},
-      {[&] { Single value(text); }, kText},
-      {[] { Set value("a"); }, kSet},
-      {[&] { Set copy(full); }, kSet},
-  };
-  for (const auto& [run, message] : runs) EXPECT_DEATH(RunRefused(0, run), message);
+  ExpectDeath([] { delete new ZORString; }, "ZORString: out of memory");
+  ExpectDeath([&] { std::vector<ZORString>(1, text); }, "ZORString: out of memory");
+  ExpectDeath([&] { ZORString().Append(text); }, "ZORString: out of memory");
+  ExpectDeath([&] { Single value(text); }, "ZORString: out of memory");
+  ExpectDeath([] { Set value("a"); }, "no memory for a set of texts");
+  ExpectDeath([&] { std::vector<Set>(1, full); }, "no memory for a set of texts");
 }
 
 }  // namespace

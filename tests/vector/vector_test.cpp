@@ -101,7 +101,7 @@ class Walk {
   int Grow(unsigned int wanted) {
     if (wanted <= mLimit || !mHasArray) return 0;
     const unsigned int extra = mVector.NextDelta(wanted - mLimit);
-    if (extra == 0 || mIsRefused || std::uint64_t{mLimit} + extra >= kTooMuch / sizeof(ZORString*)) return 0;
+    if (extra == 0 || mIsRefused || std::uint64_t{mLimit} + extra >= kTooMuch / sizeof(void*)) return 0;
     mPlaces.resize(mLimit += extra);
     return 1;
   }

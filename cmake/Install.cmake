@@ -14,7 +14,7 @@ function(install_library name)
     SOVERSION ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR}
     INSTALL_RPATH "\$ORIGIN")
   target_compile_features(${name} PUBLIC cxx_std_20)
-  export_interface(${name} ${ARGN})
+  export_interface(${name} host/ZORExport.h ${ARGN})
   target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${PROJECT_SOURCE_DIR} FILES ${ARGN})
   install(TARGETS ${name} EXPORT ZORVadStrings
     LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR}

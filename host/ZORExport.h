@@ -12,7 +12,7 @@
 #define ZOR_INTERNAL __attribute__((visibility("hidden")))
 
 // Public classes have strings and vectors of the standard library as members, and a program must lay these out as the
-// libraries do. One that does not fails to link, since the host library lacks the function that it names.
+// libraries do. One that does not fails to link, since the libraries lack the function that it names.
 #if defined(_LIBCPP_VERSION)
 ZOR_EXPORT void ZorIsNotBuiltForLibcxx();
 #define ZOR_STANDARD_LIBRARY ZorIsNotBuiltForLibcxx

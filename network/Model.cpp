@@ -9,6 +9,8 @@
 #include "network/tables.h"
 #include "network/texts.h"
 
+void ZOR_STANDARD_LIBRARY() {}  // programs need not link the host library
+
 namespace zornet {
 
 namespace {

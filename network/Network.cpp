@@ -80,13 +80,13 @@ struct Network::Inside {
   Inside(zornet::Model given, const Limits& bounds, const std::vector<std::string>& folders)
       : model(WithWanted(std::move(given))),
         limits(bounds),
-        session(folders),
-        store(session.Types(), model),
+        session(Session::Open(folders)),
+        store(session->Types(), model),
         propagation(store, limits) {}
 
   const Model model;
   const Limits limits;
-  const Session session;
+  const std::shared_ptr<const Session> session;
   Store store;
   Propagation propagation;
   std::unique_ptr<Teller> teller;
@@ -125,7 +125,7 @@ Var Network::FailedVariable() const { return {mInside->store.Failed()}; }
 int Network::FailedConstraint() const { return mInside->store.FailedConstraint(); }
 
 Explanation Network::Explain(Var variable) const {
-  Store store(mInside->session.Types(), mInside->model);
+  Store store(mInside->session->Types(), mInside->model);
   Log log(mInside->model);
   store.Watch(&log);
   Limits limits;
@@ -133,7 +133,7 @@ Explanation Network::Explain(Var variable) const {
   limits.steps = mInside->propagation.Steps();
   Propagation(store, limits).Run();
   Explanation explanation = log.Explain(variable.index);
-  const Store start(mInside->session.Types(), mInside->model);
+  const Store start(mInside->session->Types(), mInside->model);
   for (Explanation::Start& declared : explanation.declared) declared.value = start[declared.variable.index].Show();
   return explanation;
 }

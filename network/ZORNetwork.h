@@ -143,8 +143,8 @@ struct SearchResult {
 
 class ZOR_EXPORT Network {
  public:
-  // Opens the modules, from beside the program, from the folders given, or from where this library is installed.
-  // Throws ModuleFailure.
+  // Opens the modules, from beside the program, from the folders given, or from where this library is installed. While
+  // there are other networks their modules are taken. Throws ModuleFailure.
   explicit Network(Model model, const Limits& limits = {}, const std::vector<std::string>& moduleFolders = {});
   ~Network();
   Network(Network&&) noexcept;

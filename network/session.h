@@ -10,16 +10,18 @@
 
 namespace zornet {
 
-// Values must die before the session in which they were made.
+// Values must die before the session in which they were made. All networks of a process share one, as opening a module
+// anew would write what values in other threads read.
 class Session {
  public:
-  // Looks for the modules in the program's own folder, in the folders given and in that of the host library. Throws
-  // ModuleFailure.
-  explicit Session(const std::vector<std::string>& folders = {});
+  // Looks for the modules in the program's own folder, in the folders given and in that of the host library, unless
+  // there is a session already. Throws ModuleFailure.
+  static std::shared_ptr<const Session> Open(const std::vector<std::string>& folders);
 
   const zornet::Types& Types() const { return *mTypes; }
 
  private:
+  explicit Session(const std::vector<std::string>& folders);
   const ZORVaDoModule& Open(const char* name);
 
   ZORVaDoModuleManager mManager;

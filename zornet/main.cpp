@@ -1,17 +1,37 @@
 #include <cstdio>
+#include <cstdlib>
 #include <iostream>
 #include <new>
 
 #include "zornet/run.h"
 
+namespace {
+
+bool sTellsJson = false;
+
+// Where memory is refused, whoever asked for it: what was found is kept, and nothing more is asked for.
+[[noreturn]] void EndWithoutMemory() {
+  std::cout.flush();
+  if (sTellsJson) {
+    std::fputs("{\"event\":\"failure\",\"message\":\"out of memory\"}\n", stdout);
+    std::fflush(stdout);
+  } else {
+    std::fputs("zornet: error: out of memory\n", stderr);
+  }
+  std::_Exit(zornet::kNoMemory);
+}
+
+}  // namespace
+
 int main(int argc, char** argv) {
+  std::set_new_handler(EndWithoutMemory);
   int exitCode = 0;
   try {
     const auto options = zornet::ReadOptions(argc, argv, exitCode);
+    sTellsJson = options && options->json;
     if (options) exitCode = zornet::Run(*options);
-  } catch (const std::bad_alloc&) {  // even where telling of it needs memory
-    std::fputs("zornet: error: out of memory\n", stderr);
-    exitCode = zornet::kNoMemory;
+  } catch (const std::bad_alloc&) {  // more than any memory has
+    EndWithoutMemory();
   }
   if (std::cout.flush()) return exitCode;
   std::cerr << "zornet: error: standard output cannot be written\n";

@@ -219,8 +219,6 @@ int Run(const Options& options) {
     return fail(error.what(), kModuleError);
   } catch (const std::runtime_error& error) {
     return fail(error.what(), kUsage);
-  } catch (const std::bad_alloc&) {
-    return fail("out of memory", kNoMemory);
   }
 }
 

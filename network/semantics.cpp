@@ -44,6 +44,7 @@ std::optional<std::vector<Answer>> CaseVariants(const ZORString& text) {
     }
   }
   std::vector<Answer> found;
+  found.reserve(variants.size());
   for (const std::string& variant : variants) found.push_back({ToZor(variant), 0});
   return found;
 }
@@ -94,6 +95,7 @@ std::optional<std::vector<Answer>> Parts(std::string_view text) {
     if (parts.size() > zor::kSetLimit) return std::nullopt;
   }
   std::vector<Answer> found;
+  found.reserve(parts.size());
   for (const std::string_view part : parts) found.push_back({ToZor(part), 0});
   return found;
 }

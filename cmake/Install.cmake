@@ -80,6 +80,8 @@ install(CODE "
   file(INSTALL \"${PROJECT_SOURCE_DIR}/gdb/zorvadstrings.py\"
        DESTINATION \"\${CMAKE_INSTALL_PREFIX}/\${folder}\" RENAME ${printers})")
 
+execute_process(COMMAND git log -1 --format=%ct WORKING_DIRECTORY ${PROJECT_SOURCE_DIR}
+  OUTPUT_VARIABLE CPACK_SOURCE_TIME OUTPUT_STRIP_TRAILING_WHITESPACE ERROR_QUIET)
 set(CPACK_GENERATOR DEB TGZ)
 set(CPACK_PACKAGE_NAME zorvadstrings)
 set(ZOR_MAINTAINER "The ZORVadStrings authors <zorvadstrings@example.org>" CACHE STRING "Who answers for the packages")

@@ -93,15 +93,15 @@ TEST(Program, PictureThatFails) {
   fs::remove_all(folder);
 }
 
-// Copies of the program and the host library find no module, unless they are told where to look.
+// Copies of the program and of the libraries that it links find no module, unless they are told where to look.
 TEST(Program, ModuleNotFound) {
   const fs::path root = fs::canonical(testing::TempDir()) / "zornet-alone", bin = root / "bin", lib = root / "lib";
-  const fs::path home = fs::path(kProgram).parent_path(), host = ZORNET_HOST;
+  const fs::path home = fs::path(kProgram).parent_path();
   fs::remove_all(root);
   fs::create_directories(bin);
   fs::create_directories(lib);
   fs::copy_file(kProgram, bin / "zornet");
-  fs::copy_file(host, lib / host.filename());
+  for (const fs::path library : {ZORNET_HOST, ZORNET_NETWORK}) fs::copy_file(library, lib / library.filename());
   const std::string start = "-h >/dev/null; LD_LIBRARY_PATH=" + Quoted(lib) + " " + Quoted(bin / "zornet") + " ";
   const Ran alone = Zornet(start + "--module-path /nowhere " + Example("hello") + " 2>&1");
   EXPECT_EQ(alone.code, 4);

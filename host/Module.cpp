@@ -134,7 +134,9 @@ ZORVaDoModule* ZORVaDoModuleManager::OpenModule(const ZORString& name) {
   }
   if (name == kNumbers) return OpenNumbers(name);
   const std::string file = "lib" + TextOf(name) + ".so";
-  if (name == "" || file.find('/') != std::string::npos) return Fail(file, "not the name of a module");
+  const std::string_view asked = name.View();
+  if (asked.empty() || asked.find('/') != asked.npos || asked.find("..") != asked.npos)
+    return Fail(file, "not the name of a module");
   std::string places;
   for (auto folder = mSearchPath.begin(); folder != mSearchPath.end(); ++folder) {
     if (folder->empty() || std::find(mSearchPath.begin(), folder, *folder) != folder) continue;

@@ -4,6 +4,7 @@
 #include <filesystem>
 #include <fstream>
 #include <memory>
+#include <sstream>
 #include <string>
 #include <vector>
 
@@ -59,7 +60,12 @@ TEST_F(Manager, TellsWhyAModuleCannotBeOpened) {
   EXPECT_EQ(FailureOf("Unknown"), "libUnknown.so: not found in " + own + ", " + folder.Path());
   EXPECT_EQ(FailureOf(""), "lib.so: not the name of a module");
   EXPECT_EQ(FailureOf("../bin/ProbeAlone"), "lib../bin/ProbeAlone.so: not the name of a module");
+  EXPECT_EQ(FailureOf(".."), "lib...so: not the name of a module");
   EXPECT_EQ(FailureOf("Broken"), file + ": file too short");
+  const std::string probe = own + "/libProbeAlone.so", foreign = folder.Path() + "/libForeign.so";
+  std::filesystem::copy_file(probe, foreign);
+  std::fstream(foreign, std::ios::in | std::ios::out | std::ios::binary).seekp(18).write("\xff\xfe", 2);  // the machine
+  EXPECT_NE(FailureOf("Foreign").find(foreign + ": "), std::string::npos);
   EXPECT_NE(FailureOf("ProbeWithoutEntry").find("libProbeWithoutEntry.so: has no InitModule"), std::string::npos);
   EXPECT_NE(FailureOf("ProbeRefuses").find("/libProbeRefuses.so: InitModule answered 0"), std::string::npos);
 
@@ -102,6 +108,13 @@ TEST_F(Manager, DescriptorsLiveAsLongAsTheirLibrary) {
   ASSERT_NE(other.OpenModule("ProbeAlone"), nullptr);
   mManager.reset();
   EXPECT_TRUE(sEvents.empty());
+}
+
+TEST_F(Manager, NothingIsLeftOfAModule) {
+  for (int i = 0; i < 1000; ++i) ASSERT_NE(ZORVaDoModuleManager().OpenModule("ProbeAlone"), nullptr);
+  std::ostringstream maps;
+  maps << std::ifstream("/proc/self/maps").rdbuf();
+  EXPECT_EQ(maps.str().find("libProbeAlone"), std::string::npos);
 }
 
 TEST_F(Manager, ADescriptorThatIsDeletedEarlierIsForgotten) {

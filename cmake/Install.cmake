@@ -82,9 +82,6 @@ install(CODE "
 
 execute_process(COMMAND git log -1 --format=%ct WORKING_DIRECTORY ${PROJECT_SOURCE_DIR}
   OUTPUT_VARIABLE CPACK_SOURCE_TIME OUTPUT_STRIP_TRAILING_WHITESPACE ERROR_QUIET)
-# Whatever the rules of whoever makes the packages are for new folders.
-set(CPACK_INSTALL_DEFAULT_DIRECTORY_PERMISSIONS
-  OWNER_READ OWNER_WRITE OWNER_EXECUTE GROUP_READ GROUP_EXECUTE WORLD_READ WORLD_EXECUTE)
 set(CPACK_GENERATOR DEB TGZ)
 set(CPACK_PACKAGE_NAME zorvadstrings)
 set(ZOR_MAINTAINER "The ZORVadStrings authors <zorvadstrings@example.org>" CACHE STRING "Who answers for the packages")

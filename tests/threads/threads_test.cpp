@@ -19,6 +19,7 @@ void InTwoThreads(Run run) {
 }
 
 TEST(Threads, ValuesOfTheirOwn) {
+  const zornet::Network keepsTheModuleInUse{zornet::Model()};
   InTwoThreads([] {
     for (int i = 0; i < kRounds; ++i) {
       ZORVadEnumString x("a"), y("b"), z;

@@ -52,9 +52,12 @@ class ZOR_EXPORT ZORString {
   ZORString& operator=(const ZORString& other);
   ZORString& operator=(ZORString&& other) noexcept;
 
-  static void* operator new(std::size_t size);  // never null
+  // Never null. What a thread deletes serves its next strings, up to 3 MB of it. A program that counts or refuses
+  // allocations turns that off first: for the calling thread, and for those that have not deleted any string yet.
+  static void* operator new(std::size_t size);
   static void* operator new(std::size_t, void* place) noexcept { return place; }
-  static void operator delete(void* memory) noexcept { ::operator delete(memory); }
+  static void operator delete(void* memory, std::size_t size) noexcept;
+  static void KeepFreed(bool keep);
 
   bool operator==(const ZORString& other) const;
   bool operator==(const char* text) const;
@@ -110,8 +113,6 @@ inline void* ZORString::Allocate(std::size_t size) {
   if (memory == nullptr) DieOutOfMemory();
   return memory;
 }
-
-inline void* ZORString::operator new(std::size_t size) { return Allocate(size); }
 
 inline void ZORString::Mirror(const ZORString& other) noexcept {
   std::memcpy(mInside, other.mInside, kRoom);

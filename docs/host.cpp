@@ -1,11 +1,11 @@
-// A host in small. Loads the module, narrows z = x + y, stores z and reads it back.
+// A small host. Loads the module, narrows z = x + y, stores z and reads it back.
 #include <iostream>
 #include <memory>
 
 #include "host/ZORPrint.h"
 #include "module/ZORVaDoString.h"
 
-// A value of any string type, made in memory of the host's.
+// A value of any string type, in memory that the host provides.
 class Value {
  public:
   explicit Value(const ZORVaDoObjectDescriptor* type)
@@ -36,7 +36,7 @@ class Value {
 static void Print(const char* name, const ZORVaDoObject& value) { std::cout << name << " = " << value << '\n'; }
 
 int main() {
-  ZORVaDoModuleManager manager;  // goes last: values and what was read die before it
+  ZORVaDoModuleManager manager;  // destroyed last: after the values and what was read
   const ZORVaDoModule* const module = manager.OpenModule("ZORVadStrings");
   if (module == nullptr) {
     std::cerr << manager.GetFailure() << '\n';

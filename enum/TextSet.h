@@ -14,7 +14,7 @@
 namespace zor {
 
 // Texts in ascending order at positions from 0; the set owns them all. Inserting copies a text, or moves an rvalue.
-// Equal texts are adjacent, and only there when they were accepted. Capacity grows by half, so building a large set is
+// Equal texts, if they were accepted, are adjacent. Capacity grows by half, so that building a large set in order is
 // linear. Running out of memory ends the process: a lost text would be a wrong answer.
 class TextSet {
  public:
@@ -52,8 +52,8 @@ class TextSet {
   bool Insert(Text&& text, Equals equals = Equals::Refused);
   bool Merge (const ZORISVectorImp_String& texts, Equals equals);
 
-  // Keep drops the texts that are not in others, ascending, or not marked, and returns whether it dropped any. Cut
-  // drops the positions [first, last).
+  // Keep drops the texts that are not in others, which ascend, or that are not marked, and returns whether it dropped
+  // any. Cut drops the positions [first, last).
   bool Keep (const ZORISVectorImp_String& others);
   bool Keep (const Marks& marks);
   void Cut  (unsigned int first, unsigned int last) { if (first < last) mVector.DetachAt(first, last - first, 1); }

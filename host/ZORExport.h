@@ -1,5 +1,5 @@
-// Marks what a library exports; everything else is hidden. A class is exported with all its members, but for templates
-// and classes of its own that are marked as internal.
+// Marks what a library exports; everything else is hidden. A class is exported with all its members, except templates
+// and nested classes marked ZOR_INTERNAL.
 #pragma once
 
 #if __cplusplus <= 201703L
@@ -12,7 +12,8 @@
 #define ZOR_INTERNAL __attribute__((visibility("hidden")))
 
 // Public classes have strings and vectors of the standard library as members, and a program must lay these out as the
-// libraries do. One that does not fails to link, since the libraries lack the function that it names.
+// libraries do. One that does not fails to link: the libraries lack the function that it refers to, whose name says
+// why.
 #if defined(_LIBCPP_VERSION)
 ZOR_EXPORT void ZorIsNotBuiltForLibcxx();
 #define ZOR_STANDARD_LIBRARY ZorIsNotBuiltForLibcxx

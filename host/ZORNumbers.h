@@ -2,9 +2,9 @@
 // "interval integer" and "enum integer".
 //
 // Every operation narrows by intersection: it keeps each number or truth value that the relation still allows, as far
-// as the class can represent the result. A Nil operand makes the target Nil. An operand of another kind (no integer, no
-// Boolean) changes nothing, 0, but makes the target of Assign, Intersect and Unite Nil. A reified relation leaves its
-// Boolean alone while the relation is open.
+// as the class can represent the result. A Nil operand makes the target Nil. An operand of another kind (not an
+// integer, not a Boolean) changes nothing, 0, but makes the target of Assign, Intersect and Unite Nil. A reified
+// relation leaves its Boolean alone while the relation is open.
 //
 // Text forms: Nil, Any, true, false, 7, 2..9, { 1, 5 }. Any other input gives Nil.
 #pragma once
@@ -42,7 +42,7 @@ class ZOR_EXPORT ZORVaDoBoolean : public ZORVaDoAny {
   ZOR_DECLARE_TYPE_TEST(ZORVaDoBoolean);
 
  public:
-  // Keep false, true.
+  // Keep only false, only true.
   virtual int CalcFalseValue() = 0;
   virtual int CalcTrueValue() = 0;
 
@@ -81,14 +81,14 @@ class ZOR_EXPORT ZORVadSingleBoolean : public ZORVaDoBoolean {
   unsigned mTruths = kEither;
 };
 
-// A domain of 32-bit integers. Undefined has them all. An order relation narrows nothing by an Undefined operand: that
-// would only shave the ends off the full range, one number at a time.
+// A domain of 32-bit integers; Undefined is all of them. An Undefined operand of an order relation narrows nothing: it
+// would only cut the ends off the full range, one number at a time.
 class ZOR_EXPORT ZORVaDoInteger : public ZORVaDoScalar {
   ZOR_DECLARE_TYPE_TEST(ZORVaDoInteger);
 
  public:
-  // Assign takes the smallest domain of the class that has every number of other. CalcMinValue() and CalcMaxValue()
-  // keep the least and the greatest 32-bit number.
+  // Assign takes the smallest domain that the class can represent and that has every number of other. CalcMinValue()
+  // and CalcMaxValue() keep the least and the greatest 32-bit number.
   ZOR_DECLARE_VALUE_OPERATIONS();
   int CalcUnequalValue(const ZORVaDoAny& other) override;
   int CalcInverseUnequalValue(ZORVaDoAny& target) const override;
@@ -106,16 +106,16 @@ class ZOR_EXPORT ZORVaDoInteger : public ZORVaDoScalar {
   // clang-format on
 
   virtual void SetExactValue(ZORLong value);  // keeps value alone
-  virtual ZORLong GetExactValue() const;      // the greatest number, so that a negative one means all are
+  virtual ZORLong GetExactValue() const;      // the greatest number; sNC_INT_ANY if Nil or Undefined
 
   // The nearest number of the domain that is at least, at most value; beyond the 32-bit range when there is none.
   virtual std::int64_t FindAtLeast(std::int64_t value) const = 0;
   virtual std::int64_t FindAtMost(std::int64_t value) const = 0;
 
  protected:
-  // What a class of integers implements. Keep intersects with allowed, which may be a view of *this. Join adds the
-  // numbers of other; neither side is Nil or Undefined. The forms are those of a value that is neither; *this is Nil
-  // when one is read.
+  // What a class of integers implements. Keep intersects with allowed, which may be a view of *this, and returns
+  // whether it changed *this. Join adds the numbers of other; neither side is Nil or Undefined. ...Known print, read
+  // and store a value that is neither; when they read, *this is Nil.
   virtual int Keep(const ZORIntegerSet& allowed) = 0;
   virtual void Join(const ZORVaDoInteger& other) = 0;
   virtual void PrintKnown(ZORostrstream& out) const = 0;
@@ -158,7 +158,7 @@ class ZOR_EXPORT ZORVadSingleInteger : public ZORVaDoInteger {
   static const ZORLong sNC_INT_ANY;  // the least number; GetValue of a Nil or Undefined integer
 
   explicit ZORVadSingleInteger(ZORLong value);
-  // No number of another type, which may not fit, and no tag.
+  // Not from a number of another type, which may not fit, or from an enumeration.
   template <class Other>
   requires std::is_arithmetic_v<Other> || std::is_enum_v<Other>
   explicit ZORVadSingleInteger(Other) = delete;
@@ -199,14 +199,15 @@ class ZOR_EXPORT ZORSVectorImp_SubIntBase {
   std::vector<ZORLong>::const_iterator begin() const { return mValues.begin(); }
   std::vector<ZORLong>::const_iterator end() const { return mValues.end(); }
   std::vector<ZORLong>::const_iterator FindLowerBound(std::int64_t value) const;  // the first number >= value
-  void Insert(ZORLong value);
+  void Insert(ZORLong value);                                                     // unless it is there
   void Flush() { mValues.clear(); }
 
  private:
   std::vector<ZORLong> mValues;
 };
 
-// An integer domain that lists up to kListLimit numbers; one more makes it Undefined. IntersectInverse narrows target.
+// An integer domain that lists up to kListLimit numbers. Insert adds a number, also to a Nil value, and one number more
+// than the limit makes the value Undefined; an Undefined one stays. IntersectInverse narrows target.
 class ZOR_EXPORT ZORVadEnumInteger : public ZORVaDoInteger {
   ZOR_DECLARE_INTEGER_CLASS(ZORVadEnumInteger);
 

@@ -8,7 +8,7 @@
 // The characters, without quotes.
 inline std::ostream& operator<<(std::ostream& out, const ZORString& text) { return out << text.View(); }
 
-// The text form.
+// The text form: a text in quotes, Any, { 1, 2 }.
 inline std::ostream& operator<<(std::ostream& out, const ZORVaDoObject& value) {
   ZORostrstream form;
   value.PrintOn(form);

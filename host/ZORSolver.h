@@ -2,7 +2,7 @@
 // manager. The declaration order of virtual functions is part of the binary interface.
 //
 // An operation named Calc... narrows one target: *this, or for a const operation its only non-const argument. It
-// returns 1 when the target changed, else 0. A contradiction makes the target Nil. Operands are never kept.
+// returns 1 when the target changed, else 0. A contradiction makes the target Nil. No reference to an operand is kept.
 #pragma once
 
 #include <cstddef>
@@ -69,13 +69,13 @@ class ZOR_EXPORT ZORVaDoAny : public ZORVaDoObject {
  public:
   static const char* const sIdent;
 
-  // The part that Bisect keeps. Callers may pass other numbers.
+  // The part that Bisect keeps. Other numbers may be passed, too.
   enum ValueSelection : int { ZorSelectLeast, ZorSelectGreatest, ZorSelectLowerHalf, ZorSelectUpperHalf };
 
   // Whole domains. Assign copies other, Intersect keeps what both have, Unite adds what other has; all three make the
   // value Nil when other is of an unrelated class. IsIntersected: whether both share an element. Bisect keeps the
-  // selected part and moves the rest to other. Width and cardinality count elements; the relative width is a fraction
-  // of whole, 0 unless whole is positive.
+  // selected part and moves the rest to other. Width and cardinality count elements; the relative width is the width
+  // divided by whole, or 0 unless whole is positive.
   // clang-format off
   virtual void          Assign            (const ZORVaDoAny& other) = 0;
   virtual void          SetNilValue       () = 0;
@@ -90,8 +90,8 @@ class ZOR_EXPORT ZORVaDoAny : public ZORVaDoObject {
   virtual double        GetRelativeWidth  (double whole) const;
   virtual void          Bisect            (ZORVaDoObject& other, ValueSelection selection) = 0;
 
-  // Relations of *this and other, reified ones into result. *this = min(x, y), max(x, y); without operands, *this is
-  // the least or greatest element.
+  // Relations of *this and other: =, <>, <=, >. CalcIs... narrows the Boolean result to whether the relation holds.
+  // CalcMinValue and CalcMaxValue: *this = min(x, y), max(x, y); without operands, *this = the least, greatest element.
   virtual int CalcMinValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) = 0;
   virtual int CalcMinValue                     () = 0;
   virtual int CalcMaxValue                     (const ZORVaDoAny& x, const ZORVaDoAny& y) = 0;
@@ -148,7 +148,7 @@ class ZOR_EXPORT ZORVaDoScalar : public ZORVaDoAny {
   ZORVaDoScalar() = default;
   explicit ZORVaDoScalar(ZORStreamableInit) {}
 
-  // *this < other, *this >= other, *this = the successor of other.
+  // *this < other, *this >= other, *this = the successor of other, which is the least element greater than it.
   // clang-format off
   virtual int CalcLessValue          (const ZORVaDoScalar& other) = 0;
   virtual int CalcInverseLessValue   (ZORVaDoScalar& target) const = 0;
@@ -168,8 +168,8 @@ class ZOR_EXPORT ZORVaDoObjectDescriptor : public ZORVaDoBase {
  public:
   static const char* const sIdent;
 
-  // Copies name and stores flag. A descriptor made while a module is being opened is owned by that module, which
-  // deletes it when it is unloaded.
+  // Copies name and stores flag, which is for the solver's use. A descriptor made while a module is being opened is
+  // owned by that module, which deletes it when it is unloaded.
   ZORVaDoObjectDescriptor(const ZORString& name, const ZORVaDoObjectDescriptor* parent, int flag);
   explicit ZORVaDoObjectDescriptor(ZORStreamableInit);
   ~ZORVaDoObjectDescriptor() override;
@@ -183,8 +183,9 @@ class ZOR_EXPORT ZORVaDoObjectDescriptor : public ZORVaDoBase {
   int IsDerivedFrom(const char* ident) const override;
 
  public:
-  // CreateObject makes an Undefined value, or one from text, zero-terminated; null for a null place and for an abstract
-  // type. DestroyObject runs the destructor and frees nothing.
+  // CreateObject makes an Undefined value, or one from a zero-terminated text; null for a null place and for an
+  // abstract type. DestroyObject runs the destructor and frees nothing; null is ignored. GetNumberOfArguments and
+  // GetArgumentsSize return 0 unless overridden.
   virtual ZORVaDoObject* CreateObject(void* place, const void* text) const = 0;
   virtual ZORVaDoObject* CreateObject(void* place) const = 0;
   virtual void DestroyObject(ZORVaDoObject* object) const;
@@ -247,8 +248,8 @@ class ZOR_EXPORT ZORVaDoModuleManager {
   ZORVaDoModuleManager(const ZORVaDoModuleManager&) = delete;
   ZORVaDoModuleManager& operator=(const ZORVaDoModuleManager&) = delete;
 
-  // OpenModule returns the same object each time, null on failure; GetFailure then has "file: reason", and is empty
-  // after a success.
+  // OpenModule returns the same object each time, which the manager owns, or null on failure; GetFailure then has
+  // "file: reason". It is empty after a success.
   virtual ZORVaDoModule* OpenModule(const ZORString& name);
   void AddSearchPath(const ZORString& folder);
   const ZORString& GetFailure() const { return mFailure; }

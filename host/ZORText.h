@@ -1,5 +1,5 @@
 // Characters, strings, the registry of streamable classes, binary streams for storage and text streams for people.
-// Nothing here throws. Lengths and positions are in characters, positions from 0.
+// Nothing here throws. Lengths and positions count characters of one byte, positions from 0.
 #pragma once
 
 #include <bit>
@@ -66,16 +66,19 @@ class ZOR_EXPORT ZORString {
   const ZORChar operator[](int position) const;  // zero outside the string
   int GetLengthInChar() const { return static_cast<int>(mLength); }
   const char* CastToCharPtr() const { return mCapacity == kInside ? mInside : mOutside; }  // zero-terminated
-  std::string_view View() const { return {CastToCharPtr(), mLength}; }  // until it changes; orders as the text does
+  std::string_view View() const { return {CastToCharPtr(), mLength}; }  // valid until the string changes
   explicit operator std::string_view() const { return View(); }
 
   static ZORString Concatenation(const ZORString& head, const ZORString& tail);  // at most one allocation
   bool IsConcatenation(const ZORString& head, const ZORString& tail) const;      // no allocation
   ZORString& Append(const ZORString& tail);                                      // tail may be *this
-  // Empty when start is outside the string or length is a converted negative number; truncated at the end.
+  // Ends at the end of the string at the latest. Empty when start is outside the string or length is a converted
+  // negative number.
   ZORString SubString(std::size_t start, std::size_t length) const;
   // First position of pattern at or after start, -1 when there is none. The empty pattern is found at start.
   int FindPosition(const ZORString& pattern, int start) const;
+  // Puts text in place of length characters from start, or of those up to the end. A negative length, or a start
+  // outside the string, changes nothing.
   void ReplaceSubString(int start, int length, const ZORString& text);
   void ToLower();  // ASCII letters only, in any locale
   void ToUpper();
@@ -198,7 +201,7 @@ class ZORopstream;
 // Selects the constructor of an object that Read will fill.
 enum ZORStreamableInit { ZorStreamableInit = 0 };
 
-// An object that can be stored.
+// An object that can be stored. Write and Read handle its content; here they do nothing.
 class ZOR_EXPORT ZORStreamable {
  public:
   virtual ~ZORStreamable();
@@ -207,8 +210,8 @@ class ZOR_EXPORT ZORStreamable {
   virtual void Read(ZORipstream& in);
 };
 
-// Registers a streamable class under a name: a static object of the library that defines the class. The registry is
-// the list of live records; of two with one name the later is found.
+// The record that registers a streamable class under a name: a static object of the library that defines the class. Of
+// two live records with one name the later is found.
 class ZOR_EXPORT ZORStreamableClass {
  public:
   using Factory = ZORStreamable* (*)(ZORStreamable* object);  // makes a new object when given null
@@ -241,7 +244,7 @@ class ZOR_EXPORT ZORopstream {
   ~ZORopstream();
 
   ZORopstream& operator<<(ZORLong value);
-  void WriteString(const char* text);                    // zero-terminated
+  void WriteString(const char* text);                    // zero-terminated; null is empty
   void WriteObject(const ZORStreamable* object);         // class name and content
   void WriteObjectPointer(const ZORStreamable* object);  // null, a new object, or a reference to one written before
   const std::string& Bytes() const { return mBytes; }
@@ -259,8 +262,8 @@ class ZOR_EXPORT ZORipstream {
   ~ZORipstream();
 
   ZORipstream& operator>>(ZORLong& value);
-  char* ReadString();                       // owned by the caller, freed with delete[]
-  void ReadObject(ZORStreamable*& object);  // fills object, or a new one when it is null
+  char* ReadString();                       // zero-terminated; the caller frees it with delete[]
+  void ReadObject(ZORStreamable*& object);  // fills object, or makes one for the caller when it is null
   ZORStreamable* ReadObjectPointer();       // the caller owns a new object; null for an unknown class
   bool Fail() const { return mFail; }
   void SetFail() { mFail = true; }                                // for a Read that rejects its content

@@ -5,8 +5,8 @@
 
 extern "C" {
 
-// Called by the module manager. Opens "ZORVadNumbers", registers the descriptors of the single and of the enum string
-// with module, in this order, and calls InitStrings. Returns 1; 0, with nothing registered, when an argument is null or
+// Called by the module manager. Opens "ZORVadNumbers", registers the descriptors "single string" and "enum string" with
+// module, in this order, and calls InitStrings. Returns 1, or 0 with nothing registered when an argument is null or
 // "ZORVadNumbers" cannot be opened.
 ZOR_EXPORT int InitModule(ZORVaDoModule* module, ZORVaDoModuleManager* manager);
 
@@ -14,5 +14,6 @@ ZOR_EXPORT int InitModule(ZORVaDoModule* module, ZORVaDoModuleManager* manager);
 ZOR_EXPORT int TARVOS_WORKSHOP_BDK2_INTERNAL_ZORVadStrings();
 }
 
-// Sets ZorVaDoStringMin, ZorVaDoStringMax and ZorVaDoStringAny. May be called again.
+// Sets ZorVaDoStringMin, ZorVaDoStringMax and ZorVaDoStringAny. A program that links the module calls this before it
+// makes a value; further calls do no harm.
 ZOR_EXPORT void InitStrings();

@@ -5,8 +5,9 @@
 
 // Members of a string class. Its type is identified by the address of sIdent; CastableIdent is the same name, public.
 // DynamicCast returns null for null and for an object of another class; StaticCast is unchecked.
-// sDescriptor is null until MakeDescriptor has run. MakeDescriptor returns null when out of memory; every call makes a
-// new descriptor, which the class never frees. readPtr gives null and fails the stream for an object of another class.
+// sDescriptor is null until MakeDescriptor has run. Each call of MakeDescriptor makes a new descriptor, which the class
+// never frees, or returns null when out of memory. readPtr makes an object, which the caller owns, and readRef fills
+// one; for an object of another class readPtr gives null and fails the stream.
 #define ZOR_DECLARE_STRING_CLASS(Class)                                                                   \
  public:                                                                                                  \
   class ZOR_EXPORT Descriptor : public ZORVaDoObjectDescriptor {                                          \
@@ -43,8 +44,8 @@
  public:                                                                                                  \
   static_assert(true)
 
-// The overrides of a concrete class. The contracts of operations are with the typed forms of the class and in the base
-// classes. SetLowerBound and SetUpperBound are new and end the virtual table.
+// The overrides of a concrete class. The contracts of the operations stand at the typed forms of the class and in the
+// base classes. SetLowerBound and SetUpperBound are new and end the virtual table.
 #define ZOR_DECLARE_STRING_OPERATIONS()                                                                       \
   ZOR_DECLARE_VALUE_OPERATIONS();                                                                             \
   void SetNilValue() override;                                                                                \

@@ -11,8 +11,8 @@
 #include "host/ZORText.h"
 #include "module/ZORStringClass.h"
 
-// What ZORVadSingleString and ZORVadEnumString have in common. See there for what an operation does with either class;
-// here is what it means, and on the right what it narrows.
+// What ZORVadSingleString and ZORVadEnumString have in common: what each operation means, and on the right what it
+// narrows. What it does with each state is said in the two classes.
 class ZOR_EXPORT ZORVaDoString : public ZORVaDoScalar {
   ZOR_DECLARE_STRING_CLASS(ZORVaDoString);
 
@@ -42,10 +42,10 @@ class ZOR_EXPORT ZORVaDoString : public ZORVaDoScalar {
   int Nil();
   int Any();
 
-  // Unequal: removes the text of an other that has only one; a Nil other makes *this Nil, an Undefined one changes
+  // Unequal: when other has only one text, removes it from *this; a Nil other makes *this Nil, an Undefined one changes
   // nothing. The inverse is the same with the operands exchanged.
-  // Reified: result becomes Undefined when an operand is, else Nil when one is Nil or no string (CalcIsLess: no string
-  // comes first). It becomes true or false when the states and bounds of the operands decide, else it stays.
+  // Reified: result becomes Undefined when an operand is, else Nil when one is Nil or not a string (CalcIsLess tests
+  // for a string first). It narrows to true or false when the states and bounds of the operands decide, else it stays.
   // clang-format off
   int CalcUnequalValue       (const ZORVaDoAny& other) override;
   int CalcInverseUnequalValue(ZORVaDoAny& target) const override;
@@ -61,7 +61,8 @@ class ZOR_EXPORT ZORVaDoString : public ZORVaDoScalar {
   virtual int IsFull() const = 0;
 
   // SetExactValue makes text the only one, InsertExactValue adds it, RemoveExactValue drops it and returns 1 if it was
-  // there. The bounds are the least and the greatest text, the neighbours those next to text. Texts are copied.
+  // there. The bounds are the least and the greatest text; GetNextExactValue and GetPrevExactValue look for the nearest
+  // text from text on, upwards and downwards. Texts are copied.
   virtual void      SetExactValue    (const ZORString& text) = 0;
   virtual void      InsertExactValue (const ZORString& text) = 0;
   virtual int       RemoveExactValue (const ZORString& text) = 0;
@@ -97,7 +98,7 @@ class ZOR_EXPORT ZORVaDoString : public ZORVaDoScalar {
   // clang-format on
 
  protected:
-  // Settle on Min, Max: an Undefined value becomes that, a value that is it stays, any other becomes Nil.
+  // Settle on Min, Max: an Undefined value becomes that extreme, a value that is it stays, any other becomes Nil.
   int MeetLeast();
   int MeetGreatest();
 

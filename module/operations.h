@@ -66,7 +66,7 @@
 
 namespace zor {
 
-// The index of the operand that is narrowed, kNoTarget when none is.
+// The index of the operand that is narrowed, or kNoTarget.
 constexpr std::size_t kNoTarget = 4;
 
 template <class... Operands>

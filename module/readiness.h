@@ -1,4 +1,4 @@
-// Values rely on the texts that InitStrings sets. A debug build says so, once, when a value is made before that.
+// Values rely on the texts that InitStrings sets. A debug build prints a message, once, if a value is made before that.
 #pragma once
 
 namespace zor {

@@ -8,7 +8,7 @@ namespace zor {
 // Writes Nil, Any, Max or Min if value is one of them, and returns whether it is.
 bool PrintWord(const ZORVaDoString& value, ZORostrstream& out);
 
-// Skips white space and sets value to the word or the quoted text that follows, to Nil when there is neither.
+// Skips white space and sets value to the word or the quoted text that follows, or to Nil when there is neither.
 void InputWordOrText(ZORVaDoString& value, ZORistrstream& in);
 
 // Reads the text after an opening quote, up to the closing one but at most kReadableLimit characters. There are no

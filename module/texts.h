@@ -26,10 +26,10 @@ inline ZORString Folded(ZORString text, Fold fold) {
 // Whether folding leaves text as it is.
 inline bool IsFolded(const ZORString& text, Fold fold) { return text == Folded(text, fold); }
 
-// Not exported. The successor is the least greater text: a shorter text gets a space appended; one of kLengthLimit
-// loses its trailing z, and the character before them is incremented. There is none when all characters are z.
-// The predecessor of a text that is not empty has its last character decremented, a space dropped, and is padded with
-// z.
+// Not exported. The successor is the least greater text. A text shorter than kLengthLimit gets a space appended; any
+// other loses its trailing z's, and the character before them is incremented. There is none when all are z.
+// The predecessor of a text, which must not be empty, has its last character decremented, or dropped if it is a space,
+// and is padded with z to kLengthLimit. Of a text that ends in a space it is therefore not the greatest lesser text.
 std::optional<ZORString> Successor(const ZORString& text);
 ZORString Predecessor(const ZORString& text);
 

@@ -4,8 +4,8 @@
 //   const zornet::Var host = model.TextSet("host", {"north-7", "south-7"});
 //   model.Post("str_concat", {"north", "-7", host});
 //
-// A text has at most 255 characters, from the space to z. An integer has 32 bits. What a model cannot hold throws
-// std::invalid_argument, whose what() names it; the model is then as before.
+// A text has at most 255 characters, from the space to z. An integer has 32 bits. Anything else, such as a constraint
+// with wrong arguments, throws std::invalid_argument, whose what() says what is wrong; the model is then as before.
 #pragma once
 
 #include <array>
@@ -45,15 +45,16 @@ ZOR_EXPORT const SortNames& NamesOf(Sort sort);
 constexpr bool IsText(Sort sort) { return sort == Sort::Text || sort == Sort::TextSet; }
 constexpr bool IsInteger(Sort sort) { return !IsText(sort) && sort != Sort::Boolean; }
 
-// A variable or constant of a model, by its number there.
+// A variable or constant of a model, by its number there. Post and Want refuse a number that the model does not have;
+// elsewhere it is not checked.
 struct Var {
   int index = -1;
 
   friend bool operator==(Var, Var) = default;
 };
 
-// A variable as it is declared. Nothing is known of it when both lists are empty; else it is one of the texts, or one
-// of the numbers (of an interval its two ends, of a truth value 0 or 1).
+// A variable as it is declared. Nothing is known of it when both lists are empty; else it is one of the texts or of the
+// numbers. The numbers of an interval are its two ends, those of a truth value 0 or 1.
 struct Variable {
   std::string name;
   Sort sort = Sort::Text;
@@ -62,9 +63,9 @@ struct Variable {
   bool constant = false;
 };
 
-// What a constraint says: a relation between its arguments, or a function that gives the last one. A reified constraint
-// has one argument more, which tells whether that is so. Of truth values, which are 0 and 1 where numbers are asked
-// for, unequal is "not", less or equal is "implies", the minimum is "and" and the maximum "or".
+// What a constraint says: a relation between its arguments, or a function whose result is the last one. A reified
+// constraint has one more argument, which tells whether the relation holds. Truth values count as 0 and 1: for them
+// Unequal is "not", LessOrEqual is "implies", Minimum is "and" and Maximum is "or".
 enum class Meaning {
   Equal,
   Unequal,
@@ -72,8 +73,8 @@ enum class Meaning {
   Less,
   Prefix,    // the second text begins with the first
   Suffix,    // the second text ends with the first
-  Contains,  // the second text stands somewhere in the first
-  Matches,   // the regular expression describes the whole text
+  Contains,  // the second text occurs in the first
+  Matches,   // the regular expression matches the whole text
   AllDifferent,
   Row,  // the texts are a row of the table
   Concatenation,
@@ -92,8 +93,8 @@ enum class Meaning {
   Product,
 };
 
-// What stands at one place of a constraint. The plural is a list, as str_concat([a, "-", b], z) has one; a constraint
-// has at most one list. An expression and rows are no variables.
+// What a constraint takes as one argument. A plural is a list, as in str_concat([a, "-", b], z); a constraint has at
+// most one list. An expression and rows are not variables.
 enum class Takes {
   Text,
   Integer,
@@ -110,7 +111,7 @@ constexpr bool IsVariable(Takes takes) { return takes != Takes::Expression && ta
 constexpr bool IsNumber(Takes takes) {
   return takes == Takes::Integer || takes == Takes::Boolean || takes >= Takes::Integers;
 }
-ZOR_EXPORT Takes MemberOf(Takes list);  // what the list holds; of another place what stands there
+ZOR_EXPORT Takes MemberOf(Takes list);  // what the members of the list are; anything but a list gives itself
 
 inline constexpr int kMostArguments = 5;
 
@@ -120,7 +121,7 @@ struct ZOR_EXPORT Kind {
   Meaning meaning;
   bool mirrored;  // the relation with first and second exchanged
   bool reified;
-  int arity;  // arguments as they are written, where a list is one
+  int arity;  // number of arguments as they are written: a list is one
   std::array<Takes, kMostArguments> takes;
   std::array<std::string_view, kMostArguments> roles;
 
@@ -134,6 +135,7 @@ ZOR_EXPORT std::span<const Kind> Kinds();
 
 // The constraint of that name; of two forms the one with a list, or the one without. Null when there is none.
 ZOR_EXPORT const Kind* FindKind(std::string_view name, bool list = false);
+// Whether a variable of this sort may stand for such an argument.
 ZOR_EXPORT bool Fits(Sort sort, Takes takes);
 
 // The rows of a table, all of one length.
@@ -141,7 +143,7 @@ struct Rows {
   std::vector<std::vector<std::string>> rows;
 };
 
-// A regular expression cannot be read from this character on: what() says why.
+// A regular expression that cannot be read from the character at offset on: what() says why.
 struct ZOR_EXPORT ExpressionError : std::invalid_argument {
   ExpressionError(const std::string& what, std::size_t at) : std::invalid_argument(what), offset(at) {}
   std::size_t offset;
@@ -150,17 +152,18 @@ struct ZOR_EXPORT ExpressionError : std::invalid_argument {
 class Expression;
 class Table;
 
-// A constraint of a model, to which all that it points at belongs.
+// A constraint of a model. The model owns everything that it points to.
 struct ZOR_EXPORT Constraint {
   const Kind* kind = nullptr;
-  std::span<const int> arguments = {};  // variables by number; a list's members stand in its place one by one
+  std::span<const int> arguments = {};  // variables by number; the members of a list take its place one by one
   const Expression* expression = nullptr;
   const Table* table = nullptr;
 
-  std::size_t Inputs() const { return arguments.size() - 1; }  // of a function, or reified: the result comes last
+  // Of a function or a reified constraint: how many arguments come before the result, and the result, which is last.
+  std::size_t Inputs() const { return arguments.size() - 1; }
   int Result() const { return arguments.back(); }
 
-  // Where arguments[position] stands as the constraint is written: an index into takes and roles.
+  // To which of the written arguments arguments[position] belongs: an index into takes and roles.
   std::size_t Place(std::size_t position) const;
   std::string_view RoleOf(std::size_t position) const { return kind->roles[Place(position)]; }
 };
@@ -187,6 +190,7 @@ class Argument {
   std::variant<Var, std::string, std::int32_t, bool, std::vector<Argument>, Rows> mValue;
 };
 
+// The variables and constraints of one problem, numbered from 0 as they are added. Copies share nothing that changes.
 class ZOR_EXPORT Model {
  public:
   Model() = default;
@@ -196,7 +200,7 @@ class ZOR_EXPORT Model {
   ~Model() = default;
 
   // clang-format off
-  // Variables, by a name for people, which may be empty. Without a value nothing is known of them.
+  // Add a variable. Its name is for people and may be empty. Without a value nothing is known of it.
   Var Text      (std::string name);
   Var Text      (std::string name, std::string text);
   Var TextSet   (std::string name);
@@ -212,14 +216,14 @@ class ZOR_EXPORT Model {
   Var AddConstant(const Argument& value);
 
   // Posts the constraint of that name, such as "str_concat"; docs/language.md lists them with their arguments.
-  // Answers its number.
+  // Returns its number.
   //
   //   model.Post("str_concat", {x, "-7", z});
   //   model.Post("str_concat", {{a, "-", b}, z});  // with a list; FindKind chooses the form
   int Post(std::string_view name, std::initializer_list<Argument> arguments);
   int Post(const Kind& kind, std::span<const Argument> arguments);
 
-  // Names a variable that is wanted: solutions that differ elsewhere only are one solution. Without any, all
+  // Makes a variable wanted: solutions that differ only in other variables are one solution. Without a call, all
   // variables are wanted.
   void Want(Var variable);
 
@@ -228,7 +232,7 @@ class ZOR_EXPORT Model {
   const std::vector<Constraint>& Constraints() const { return mConstraints; }
   const std::vector<int>& Wanted() const { return mWanted; }  // by number
 
-  void Reserve(std::size_t variables, std::size_t constraints);  // room, for large models
+  void Reserve(std::size_t variables, std::size_t constraints);  // makes room for large models
 
  private:
   struct ZOR_INTERNAL Block {

@@ -7,7 +7,7 @@
 //   network.Search(10, [&] { ... return true; });
 //   for (const auto& step : network.Explain(host).narrowings) ...
 //
-// Networks are independent of each other; one belongs to one thread at a time.
+// Networks are independent of each other; each is used by one thread at a time.
 #pragma once
 
 #include <atomic>
@@ -39,14 +39,14 @@ struct Limits {
   std::size_t budget = 65536;         // combinations of values that one pass over a constraint may try
   std::uint64_t steps = 100'000'000;  // passes over a constraint, and choices of a search, in all
   std::chrono::steady_clock::time_point deadline = std::chrono::steady_clock::time_point::max();
-  const std::atomic<bool>* stop = nullptr;  // ends it when another thread or a signal makes this true
+  const std::atomic<bool>* stop = nullptr;  // set to true by another thread or a signal, it ends narrowing and search
 };
 
 enum class Outcome {
   Settled,        // no constraint narrows anything further
   Contradiction,  // there is no solution
   StepLimit,
-  Open,  // of a search that tried all: there may be more solutions, as a variable stays unknown in some branch
+  Open,  // a search has tried everything, but a variable stays unknown in some branch: there may be more solutions
   TimeLimit,
   Stopped,
 };
@@ -55,21 +55,22 @@ enum class Outcome {
 struct TextShape {
   int shortest = 0, longest = 255;
   std::string beginning, end;   // of every possible text
-  std::string least, greatest;  // between which they lie
+  std::string least, greatest;  // bounds of the possible texts
   std::string characters;       // that may occur, ascending
   bool orMax = false;           // the greatest text is possible too, whatever the rest says
 };
 
-// What is still possible for a variable: a view, good until its network changes. Texts and numbers ascend.
+// What is still possible for a variable: a view, valid until its network changes. Texts and numbers ascend.
 class ZOR_EXPORT Domain {
  public:
   explicit Domain(const Value& value, const zornet::Shape* shape = nullptr) : mValue(&value), mShape(shape) {}
 
   bool IsNil() const;    // nothing: a contradiction
-  bool IsAny() const;    // nothing is known
-  bool IsKnown() const;  // neither: what follows is for a known domain
+  bool IsAny() const;    // nothing is listed; a text may still have a shape
+  bool IsKnown() const;  // neither: the values are listed, or lie in an interval
   bool IsOne() const;    // one text, number or truth value is left
 
+  // Of a known domain.
   std::vector<std::string> Texts() const;
   std::vector<std::int32_t> Numbers() const;  // of a set of integers
   std::int32_t Lowest() const;                // of integers; of a truth value 0 or 1
@@ -77,11 +78,11 @@ class ZOR_EXPORT Domain {
 
   std::string Print() const;  // of any domain, as models write it: { "a", "b" }, 1..9, Any
 
-  // Of a text of which nothing is listed but something known.
+  // Of a text of which nothing is listed but something is known.
   bool HasShape() const { return mShape != nullptr; }
   TextShape Shape() const;
-  std::string PrintShape() const;            // "ab…", 2 to 255 characters
-  bool Admits(std::string_view text) const;  // also of a domain that lists its texts
+  std::string PrintShape() const;            // "ab…", 2 to 255 characters; empty without a shape
+  bool Admits(std::string_view text) const;  // whether the text is possible; also of a domain that lists its texts
 
  private:
   const Value* mValue;
@@ -90,9 +91,9 @@ class ZOR_EXPORT Domain {
 
 inline constexpr int kNone = -1;  // no constraint
 
-// A step: a variable lost values by an operation of a constraint, or by a choice of a search.
+// A step: a variable lost values through an operation of a constraint, or through a choice of a search.
 struct Narrowing {
-  int constraint = kNone;
+  int constraint = kNone;  // its number in the model
   std::string_view operation;
   Var variable;
   std::string before, after;  // as Domain::Print
@@ -105,25 +106,25 @@ struct Explanation {
     Var variable;
     std::string value;  // as Domain::Print
   };
-  std::vector<Start> declared;        // variables that took part with what they were declared as
+  std::vector<Start> declared;        // variables that took part, and what they were declared as
   std::vector<Narrowing> narrowings;  // in the order in which they happened
 };
 
 // What can keep a variable from being narrowed further.
 enum class Limit {
-  Set,         // more values are possible than a set lists
+  Set,         // more values are possible than are listed: 256 texts, 4096 integers, 256 for one Integer
   Budget,      // the values have more combinations than Limits::budget
-  Narrowings,  // of one interval in a row
-  Steps,       // Limits::steps are made
-  Time,        // Limits::deadline is past
+  Narrowings,  // an interval was narrowed 4096 times in a row
+  Steps,       // Limits::steps were made
+  Time,        // Limits::deadline has passed
   Stop,        // Limits::stop is true
 };
 
-// A limit that did so.
+// A limit that kept a variable from being narrowed further.
 struct LimitMet {
   Limit limit = Limit::Set;
   Var variable;
-  int constraint = kNone;   // that would have narrowed it
+  int constraint = kNone;   // the one that would have narrowed it
   std::uint64_t count = 0;  // the values or combinations; 0 where they were not counted
   std::uint64_t most = 0;   // what the limit allows
 };
@@ -134,17 +135,18 @@ struct OperationCount {
 };
 
 struct SearchResult {
-  Outcome outcome = Outcome::Settled;  // Contradiction: it is sure that there is no solution
-  std::uint64_t solutions = 0;
-  bool complete = false;           // there are no more
-  std::uint64_t open = 0;          // branches left because variables stay unknown in them
-  std::vector<Var> openVariables;  // these variables
+  Outcome outcome = Outcome::Settled;  // Contradiction: there is certainly no solution
+  std::uint64_t solutions = 0;         // found
+  bool complete = false;               // there are no more
+  std::uint64_t open = 0;              // branches left because variables stay unknown in them
+  std::vector<Var> openVariables;      // these variables
 };
 
+// A copy of a model with the domains of its variables. Narrow and Search change them.
 class ZOR_EXPORT Network {
  public:
-  // Opens the modules, from beside the program, from the folders given, or from where this library is installed. While
-  // there are other networks their modules are taken. Throws ModuleFailure.
+  // Opens the modules, from the program's own folder, from moduleFolders, or from where this library is installed.
+  // While other networks exist, it shares their modules. Throws ModuleFailure.
   explicit Network(Model model, const Limits& limits = {}, const std::vector<std::string>& moduleFolders = {});
   ~Network();
   Network(Network&&) noexcept;
@@ -153,30 +155,32 @@ class ZOR_EXPORT Network {
   // Narrows until nothing changes, until a contradiction, or until a limit.
   Outcome Narrow();
 
-  // Narrows, then looks for solutions, in which every wanted variable has one value, and stops at `most` of them. Each
-  // comes once; unless constraints need them, variables that are not wanted stay as they are. found is called at each,
-  // while the domains show it; it answers whether to go on. Afterwards the domains are as narrowed.
+  // Narrows, then looks for solutions, in which every wanted variable has one value, and stops after `most` of them.
+  // Each comes once; variables that are not wanted get a value only where a constraint needs it. found is called for
+  // each solution, while the domains show it, and returns whether to continue. Afterwards the domains are as narrowed.
   SearchResult Search(std::uint64_t most, const std::function<bool()>& found);
 
   const Model& GetModel() const;
   Domain operator[](Var variable) const;
   Domain operator[](int variable) const { return (*this)[Var{variable}]; }
 
-  // After a contradiction: what nothing is left for, and the constraint that said so. Else -1 in both.
+  // After a contradiction: the variable for which nothing is left, and the constraint that found it. Else both are -1.
   Var FailedVariable() const;
   int FailedConstraint() const;
 
-  // Narrows once more from the start, to tell what brought a variable to its domain.
+  // Says what brought a variable to its domain, by narrowing once more from the start.
   Explanation Explain(Var variable) const;
 
-  // What keeps variables from being narrowed further, apart from what is not known of others. None after a
-  // contradiction, and none at a variable that has one value.
+  // The limits that keep variables from being narrowed further. None after a contradiction, and none for a variable
+  // that has one value.
   std::vector<LimitMet> LimitsMet() const;
 
-  // The solver's own value, for the bare operations of its modules. What is narrowed after a change is not sound.
+  // The solver's own value, for direct calls of the modules' operations. The network owns it. After a change to it,
+  // narrowing is no longer sound.
   ZORVaDoAny& Bare(Var variable);
 
-  // Are called while it narrows: at each step, and now and then with the steps made and the constraints that wait.
+  // Set what is called while it narrows: at each narrowing; and from time to time, with the steps made and the number
+  // of waiting constraints.
   void OnNarrowing(std::function<void(const Narrowing&)> told);
   void OnProgress(std::function<void(std::uint64_t steps, std::size_t waiting)> told);
 

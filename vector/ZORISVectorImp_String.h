@@ -6,19 +6,19 @@
 #include "host/ZORExport.h"
 #include "host/ZORText.h"
 
-// An array of ZORString pointers, positions from 0. It owns the array and no string: only the del flag of Flush, Detach
-// and DetachAt deletes strings, the destructor frees the array alone, and copies share the strings.
+// An array of ZORString pointers, positions from 0. It owns the array but no string: strings are deleted only by Flush,
+// Detach and DetachAt with del != 0; the destructor frees just the array, and copies share the strings.
 // Top() <= Limit(). Elements are the positions below top; they ascend, equal ones adjacent, as long as only Add and
 // AddUnique insert. A null element, which AddAt can leave, orders before every string. Positions from top to limit are
 // null, except those that a Flush of a part of the range leaves.
 // A vector whose array could not be allocated is not Good: it finds, visits and stores nothing and does not grow,
-// whatever Limit() is.
+// whatever Limit() says.
 class ZOR_EXPORT ZORISVectorImp_String {
  public:
   using Action = void (*)(ZORString& s, void* arg);
   using Test = int (*)(const ZORString& s, void* arg);
 
-  // With a size, capacity is size + 1 and grows by multiples of delta, or by ratio times the limit at each step; a
+  // With a size, the capacity is size + 1 and grows by multiples of delta, or by ratio times the limit at each step; a
   // ratio that is not positive counts as 1.0. Without a size, or with delta 0, a vector cannot grow.
   ZORISVectorImp_String();
   ZORISVectorImp_String(unsigned int size, unsigned int delta);
@@ -39,7 +39,7 @@ class ZOR_EXPORT ZORISVectorImp_String {
   virtual int          Good() const;
   virtual int          Good();
 
-  // 1: s is stored, and deleted by whoever flushes the vector. 0: allocation failed, the vector is unchanged and the
+  // 1: s is stored, and whoever flushes the vector deletes it. 0: allocation failed, the vector is unchanged and the
   // caller keeps s. AddUnique also returns 1 for a string that is present; the caller then keeps s, too.
   virtual int          Add      (ZORString* s);                    // after its equals
   virtual int          AddAt    (ZORString* s, unsigned int pos);  // ignores the order; pos > top extends the elements to pos
@@ -66,8 +66,8 @@ class ZOR_EXPORT ZORISVectorImp_String {
   virtual unsigned int Top  () const;
   virtual unsigned int Count() const;  // the same as Top
 
-  // Growth. NextDelta: by how much capacity grows to fit needed more, UINT_MAX on overflow. Resize: 1 grown, in one
-  // allocation; 0 nothing changed, because the capacity suffices or allocation failed.
+  // Growth. NextDelta: by how much the capacity grows to fit needed more, UINT_MAX on overflow. Resize: 1 grown, in one
+  // allocation; 0 nothing changed, because the capacity suffices, cannot grow, or allocation failed.
   virtual unsigned int GetDelta () const;
   virtual unsigned int NextDelta(unsigned int needed);
   virtual int          Resize   (unsigned int wanted);
@@ -122,8 +122,8 @@ inline unsigned int ZORISVectorImp_String::Top() const { return mTop; }
 inline unsigned int ZORISVectorImp_String::Count() const { return mTop; }
 inline unsigned int ZORISVectorImp_String::GetDelta() const { return mDelta; }
 
-// An iterator over a vector that must outlive it. The range is fixed when it is constructed or restarted, must be
-// within the vector's limit, and does not grow with the vector.
+// An iterator over a vector, which must outlive it. The range is fixed when the iterator is constructed or restarted;
+// it must lie within the vector's limit, and does not grow with the vector.
 //   for (ZORISVectorIteratorImp_String i(v); i; ++i) Use(*i.Current());
 class ZOR_EXPORT ZORISVectorIteratorImp_String {
  public:

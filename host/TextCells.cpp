@@ -74,8 +74,9 @@ void ZORString::operator delete(void* memory, std::size_t size) noexcept {
   --tCells.room;
 }
 
-void ZORString::KeepFreed(bool keep) {
+bool ZORString::KeepFreed(bool keep) {
   sKeeps = keep && kCanKeep;
   Close();
   Open();
+  return sKeeps;
 }

@@ -52,12 +52,13 @@ class ZOR_EXPORT ZORString {
   ZORString& operator=(const ZORString& other);
   ZORString& operator=(ZORString&& other) noexcept;
 
-  // Never null. What a thread deletes serves its next strings, up to 3 MB of it. A program that counts or refuses
-  // allocations turns that off first: for the calling thread, and for those that have not deleted any string yet.
+  // Never null. A thread keeps the memory of the strings it deletes for its next ones, 3 MB at most, until it ends.
   static void* operator new(std::size_t size);
   static void* operator new(std::size_t, void* place) noexcept { return place; }
   static void operator delete(void* memory, std::size_t size) noexcept;
-  static void KeepFreed(bool keep);
+  // For programs that count or refuse allocations: keeps no memory for the calling thread any more, nor for threads
+  // that have not yet deleted a string; or keeps it again. Answers whether it is kept; with sanitizers it never is.
+  static bool KeepFreed(bool keep);
 
   bool operator==(const ZORString& other) const;
   bool operator==(const char* text) const;

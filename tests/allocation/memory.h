@@ -7,11 +7,14 @@
 #include <new>
 #include <vector>
 
+#include "host/ZORText.h"
+
 namespace zor::test {
 
 constexpr int kNone = -1;
-constexpr std::size_t kTooMuch = std::size_t{1} << 30;  // no test may ask the machine for that
-inline int sRefused = kNone;                            // how many can be had before one is refused
+constexpr std::size_t kTooMuch = std::size_t{1} << 30;        // no test may ask the machine for that
+inline const bool sKeepsFreed = ZORString::KeepFreed(false);  // or texts would not be seen
+inline int sRefused = kNone;                                  // how many can be had before one is refused
 inline bool sWasRefused = false;
 inline std::ptrdiff_t sLive = 0;
 inline std::vector<void*>* sDeletions = nullptr;  // of single objects, while set and as many as it has places for

@@ -8,6 +8,7 @@
 #include <functional>
 #include <memory>
 #include <string>
+#include <thread>
 #include <utility>
 
 #include "enum/ZORVadEnumString.h"
@@ -53,6 +54,25 @@ void Init() {
   EXPECT_EQ(module.GetDescriptors(), expected);
   const int made = DeleteDescriptor<ZORVaDoString>() + DeleteDescriptor<Single>() + DeleteDescriptor<Set>();
   EXPECT_EQ(made < 3, sWasRefused);
+}
+
+// What a thread deletes is kept for its next texts, up to a limit, and given back when it ends, whoever made it.
+TEST(Refused, KeptTexts) {
+  if (!ZORString::KeepFreed(true)) GTEST_SKIP() << "freed texts are not kept under a sanitizer";
+  constexpr int kKept = 65536;
+  std::vector<ZORString*> texts(kKept + 100);
+  const std::ptrdiff_t atFirst = sLive;
+  for (ZORString*& text : texts) text = new ZORString("text");
+  std::thread([&] {
+    const std::ptrdiff_t before = sLive - std::ssize(texts);
+    for (const ZORString* const text : texts) delete text;
+    EXPECT_EQ(sLive - before, kKept);
+    for (ZORString*& text : texts) text = new ZORString("text");
+    EXPECT_EQ(sLive - before, std::ssize(texts));
+    for (const ZORString* const text : texts) delete text;
+  }).join();
+  EXPECT_EQ(sLive, atFirst);
+  EXPECT_FALSE(ZORString::KeepFreed(false));
 }
 
 // Each allocation of a run is refused in turn, the last time none; the run leaves nothing allocated.

@@ -5,6 +5,8 @@
 
 #include <cstdlib>
 
+#include "host/ZORText.h"
+
 #if defined(__SANITIZE_ADDRESS__)
 #define ZOR_HAS_OWN_MALLOC
 #elif defined(__has_feature)
@@ -15,6 +17,7 @@
 
 namespace zor::test {
 inline int sAllocations = 0, sFreed = 0;
+inline const bool sKeepsFreed = ZORString::KeepFreed(false);  // or texts would not be seen
 }  // namespace zor::test
 
 #ifndef ZOR_HAS_OWN_MALLOC

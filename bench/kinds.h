@@ -7,10 +7,12 @@
 
 #include <algorithm>
 #include <boost/container/flat_set.hpp>
+#include <cstring>
 #include <iterator>
 #include <memory>
 #include <set>
 #include <string>
+#include <string_view>
 #include <type_traits>
 #include <utility>
 #include <vector>
@@ -127,16 +129,28 @@ struct Flat   : Standard<boost::container::flat_set<std::string>> { static const
 struct BTree  : Standard<absl::btree_set<std::string>>           { static constexpr const char* kName = "btree_set"; };
 // clang-format on
 
-// What no set in order can do without: a walk, or a bisection, over pointers to texts. Builds and changes nothing.
+// A pointer to a text of its own.
+struct Own : std::unique_ptr<const std::string> {
+  using std::unique_ptr<const std::string>::unique_ptr;
+  explicit Own(const std::string& text) : unique_ptr(std::make_unique<const std::string>(text)) {}
+  Own(const Own& other) : Own(*other) {}
+  Own(Own&&) noexcept = default;
+  Own& operator=(Own&&) noexcept = default;
+  Own& operator=(const Own&) = delete;
+  ~Own() = default;
+};
+
+// What no set in order can do without: a walk, or a bisection, over pointers to texts, which allocates nothing and
+// changes nothing. Where texts have to be made or dropped, pointers to std::string are.
 struct Floor {
   static constexpr const char* kName = "floor";
   using Text = std::string;
-  using Set = std::vector<std::unique_ptr<const std::string>>;
+  using Set = std::vector<Own>;
 
   static Text Make(const std::string& text) { return text; }
   static std::size_t Size(const Set&) { return 0; }
   static void Build(Set& set, const std::vector<Text>& texts) {
-    for (const Text& text : texts) set.push_back(std::make_unique<const std::string>(text));
+    for (const Text& text : texts) set.emplace_back(text);
   }
   static void Walk(const Set& a, const Set& b) {
     std::size_t equal = 0;
@@ -150,10 +164,44 @@ struct Floor {
   }
   static void Intersect(Set& target, const Set& other) { Walk(target, other); }
   static void Unite(Set& target, const Set& other) { Walk(target, other); }
+  static bool Less(const Own& a, const std::string& b) { return *a < b; }
   static bool Contains(const Set& set, const Text& text) {
-    const auto found =
-        std::lower_bound(set.begin(), set.end(), text, [](const auto& a, const std::string& b) { return *a < b; });
+    const auto found = std::lower_bound(set.begin(), set.end(), text, Less);
     return found != set.end() && **found == text;
+  }
+  static void Cut(Set& set, const Text& lower, const Text& upper) {
+    set.erase(set.begin(), std::lower_bound(set.begin(), set.end(), lower, Less));
+    const auto greater = [](const std::string& a, const Own& b) { return a < *b; };
+    set.erase(std::upper_bound(set.begin(), set.end(), upper, greater), set.end());
+  }
+  // Each candidate is made in a place on the stack and compared with the next text of the target.
+  struct Candidates {
+    explicit Candidates(const Set& set) : next(set.begin()), end(set.end()) {}
+    ~Candidates() { benchmark::DoNotOptimize(next); }
+    void Meet(std::size_t length) {
+      benchmark::DoNotOptimize(place);
+      if (next != end && **next == std::string_view(place, length)) ++next;
+    }
+    Set::const_iterator next, end;
+    char place[64];
+  };
+  static void Concatenate(Set& target, const Set& x, const Set& y) {
+    Candidates candidates(target);
+    for (const Own& head : x) {
+      for (const Own& tail : y) {
+        std::memcpy(candidates.place, head->data(), head->size());
+        std::memcpy(candidates.place + head->size(), tail->data(), tail->size());
+        candidates.Meet(head->size() + tail->size());
+      }
+    }
+  }
+  static void Fold(Set& target, const Set& x) {
+    Candidates candidates(target);
+    for (const Own& text : x) {
+      std::transform(text->begin(), text->end(), candidates.place,
+                     [](char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c + ('a' - 'A')) : c; });
+      candidates.Meet(text->size());
+    }
   }
 };
 

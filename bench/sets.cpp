@@ -125,17 +125,18 @@ void RegisterSets() {
   RegisterCases<Module, Tree, Vector, Flat, BTree, Floor>("unite", sizes, Overlapping, unite);
   Register<Module, Tree, Vector, Flat, BTree, Floor>(
       "contains", sizes, []<class Kind>(State& state, int size) { Contains<Kind>(state, size); });
-  RegisterCases<Module, Tree, Vector, Flat, BTree>("concatenate, 256 new", {256}, Crossed, concatenate);
-  RegisterCases<Module, Tree, Vector, Flat, BTree>("concatenate, 31 new", {256}, Runs, concatenate);
-  RegisterCases<Module, Tree, Vector, Flat, BTree>("concatenate, all kept", {256}, CrossedAll, concatenate);
-  RegisterCases<Module, Tree, Vector, Flat, BTree>("concatenate, 16 of 32 kept", {256}, CrossedSome, concatenate);
-  RegisterCases<Module, Tree, Vector, Flat, BTree>("fold, all kept", {16, 256}, Folds, fold);
-  Register<Module, Tree, Vector, Flat, BTree>("copy", sizes,
-                                              []<class Kind>(State& state, int size) { Copy<Kind>(state, size); });
-  RegisterBuild<Module, Tree, Vector, Flat, BTree>("build, ascending", sizes, Same);
+  RegisterCases<Module, Tree, Vector, Flat, BTree, Floor>("concatenate, 256 new", {256}, Crossed, concatenate);
+  RegisterCases<Module, Tree, Vector, Flat, BTree, Floor>("concatenate, 31 new", {256}, Runs, concatenate);
+  RegisterCases<Module, Tree, Vector, Flat, BTree, Floor>("concatenate, all kept", {256}, CrossedAll, concatenate);
+  RegisterCases<Module, Tree, Vector, Flat, BTree, Floor>("concatenate, 16 of 32 kept", {256}, CrossedSome,
+                                                          concatenate);
+  RegisterCases<Module, Tree, Vector, Flat, BTree, Floor>("fold, all kept", {16, 256}, Folds, fold);
+  Register<Module, Tree, Vector, Flat, BTree, Floor>(
+      "copy", sizes, []<class Kind>(State& state, int size) { Copy<Kind>(state, size); });
+  RegisterBuild<Module, Tree, Vector, Flat, BTree, Floor>("build, ascending", sizes, Same);
   RegisterBuild<Module, Tree, Vector, BTree>("build, shuffled", {16, 256, 4096}, Shuffled);
-  Register<Module, Tree, Vector, Flat, BTree>("cut", sizes,
-                                              []<class Kind>(State& state, int size) { Cut<Kind>(state, size); });
+  Register<Module, Tree, Vector, Flat, BTree, Floor>(
+      "cut", sizes, []<class Kind>(State& state, int size) { Cut<Kind>(state, size); });
 }
 
 }  // namespace zor::bench

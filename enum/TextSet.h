@@ -14,17 +14,16 @@
 namespace zor {
 
 // Texts in ascending order at positions from 0; the set owns them all. Inserting copies a text, or moves an rvalue.
-// Equal texts, if they were accepted, are adjacent. Capacity grows by half, so that building a large set in order is
-// linear. Running out of memory ends the process: a lost text would be a wrong answer.
+// Equal texts, if they were accepted, are adjacent. An empty set has no array; capacity grows by half, so that building
+// a large set in order is linear. Running out of memory ends the process: a lost text would be a wrong answer.
 class TextSet {
  public:
   enum class Equals { Refused, Accepted };  // whether a text that is present is inserted again
   using Marks = std::bitset<kSetLimit>;     // of positions
 
-  // Reserves capacity for the expected texts, up to kSetLimit.
-  explicit TextSet(std::size_t expected = kFew)
-      : mVector(static_cast<unsigned int>(std::min(expected, kSetLimit)), kFew) {}
-  ~TextSet() { Clear(); }
+  TextSet() = default;
+  explicit TextSet(std::size_t expected) { Reserve(static_cast<unsigned int>(std::min(expected, kSetLimit))); }
+  ~TextSet() { DeleteAll(); }
   TextSet(const TextSet&) = delete;
   TextSet& operator=(const TextSet&) = delete;
 
@@ -36,15 +35,16 @@ class TextSet {
 
   // The texts as a vector, and as a range of pointers.
   const ZORISVectorImp_String& Vector() const { return mVector; }
-  std::span<const ZORString* const> All() const { return {&mVector[0], Count()}; }
+  std::span<const ZORString* const> All() const { return {PlacesOf(mVector), Count()}; }
 
   // Positions as the vector returns them, greater than Count() when there is none. The counts are of texts less than
   // bound, and less than or equal to it.
   unsigned int Find            (const ZORString* text)  const { return mVector.Find(text); }
   unsigned int FindLowerBound  (const ZORString& text)  const { return mVector.FindLowerBound(&text, 0); }
   unsigned int FindUpperBound  (const ZORString& text)  const { return mVector.FindUpperBound(&text, 0); }
-  unsigned int CountLess       (const ZORString& bound) const { return CountLess(mVector, bound); }
+  unsigned int CountLess       (const ZORString& bound) const { return CountLess(All(), bound); }
   unsigned int CountLessOrEqual(const ZORString& bound) const;
+  unsigned int CountLess       (const ZORString& bound, unsigned int near) const;  // the same, fast if it is near
 
   // Insert returns whether text was inserted; it comes after its equals. Merge inserts ascending texts and returns
   // whether all were inserted.
@@ -57,20 +57,22 @@ class TextSet {
   bool Keep (const ZORISVectorImp_String& others);
   bool Keep (const Marks& marks);
   void Cut  (unsigned int first, unsigned int last) { if (first < last) mVector.DetachAt(first, last - first, 1); }
-  void Clear() { if (Count() > 0) mVector.Flush(1); }
+  void Clear() { DeleteAll(), mVector.Flush(0, Count(), 0); }
   void Swap (TextSet& other) { mVector.Swap(other.mVector); }
 
   // Narrowing without building the candidates: Mark each, then Keep the marked texts. CanMark: neither side is too
-  // large for that. Mark marks text if it is present, the first of its equals; next is a hint that starts at 0 and
-  // makes ascending candidates cheap.
+  // large for that. Mark marks text if it is present, the first of its equals; near is where to look first, and then
+  // where the next candidate may be.
   bool CanMark(std::size_t candidates) const { return Count() > 0 && Count() <= kSetLimit && candidates <= kSetLimit; }
-  void Mark   (const ZORString& text, Marks& marks, unsigned int& next) const;
+  void Mark   (const ZORString& text, Marks& marks, unsigned int& near) const;
   // clang-format on
 
  private:
-  static constexpr unsigned int kFew = 20;  // initial capacity, and growth of the vector
+  static constexpr unsigned int kFirst = 4, kMore = 20;  // the first capacity; it grows by a multiple of the other
 
-  static unsigned int CountLess(const ZORISVectorImp_String& texts, const ZORString& bound);
+  static ZORString** PlacesOf(const ZORISVectorImp_String& texts) { return texts.Limit() == 0 ? nullptr : &texts[0]; }
+  static unsigned int CountLess(std::span<const ZORString* const> texts, const ZORString& bound);
+  void DeleteAll();
   template <class Test>
   bool KeepThose(Test test);
   void Reserve(unsigned int places);
@@ -82,10 +84,10 @@ class TextSet {
   ZORISVectorImp_String mVector;
 };
 
-inline unsigned int TextSet::CountLess(const ZORISVectorImp_String& texts, const ZORString& bound) {
-  ZORString* const* const places = &texts[0];
+inline unsigned int TextSet::CountLess(std::span<const ZORString* const> texts, const ZORString& bound) {
   const auto less = [](const ZORString* listed, const ZORString& limit) { return *listed < limit; };
-  return static_cast<unsigned int>(std::lower_bound(places, places + texts.Count(), bound, less) - places);
+  const ZORString* const* const first = texts.data();
+  return static_cast<unsigned int>(std::lower_bound(first, first + texts.size(), bound, less) - first);
 }
 
 // Texts mostly arrive in order, so the end is tried first.

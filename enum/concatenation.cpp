@@ -10,20 +10,25 @@ namespace {
 using zor::TextSet;
 
 // Marks the texts that are a head followed by a tail. Texts with the same head are adjacent and ordered by what follows
-// it, so one pass compares them with the tails. Of equal texts only the first is marked.
+// it, so one pass compares them with the tails, and often the next text is the next pair. Of equal texts only the first
+// is marked.
 TextSet::Marks MarkPairs(const TextSet& texts, const TextSet& heads, const TextSet& tails) {
   const unsigned int count = texts.Count(), tailCount = tails.Count();
   TextSet::Marks marks;
-  for (const ZORString* const first : heads.All()) {
-    const std::string_view head = first->View();
-    unsigned int t = 0;
-    for (unsigned int i = texts.CountLess(*first); i < count; ++i) {
-      const std::string_view text = texts[i].View();
-      if (text.substr(0, head.size()) != head) break;
-      const std::string_view rest = text.substr(head.size());
-      while (t < tailCount && tails[t].View() < rest) ++t;
-      if (t == tailCount) break;
-      if (tails[t].View() == rest && (i == 0 || texts[i - 1] != texts[i])) marks.set(i);
+  unsigned int i = 0;
+  for (const ZORString* const head : heads.All()) {
+    i = texts.CountLess(*head, i);
+    for (unsigned int t = 0; i < count; ++i) {
+      const ZORString& text = texts[i];
+      if (!text.IsConcatenation(*head, tails[t])) {
+        if (!text.View().starts_with(head->View())) break;
+        const std::string_view rest = text.View().substr(head->View().size());
+        while (t < tailCount && tails[t].View() < rest) ++t;
+        if (t == tailCount) break;
+        if (tails[t].View() != rest) continue;
+      }
+      if (i == 0 || texts[i - 1] != text) marks.set(i);
+      if (t + 1 < tailCount) ++t;
     }
   }
   return marks;

@@ -59,8 +59,8 @@ int ZORVadEnumString::CalcFoldValue(const X& x, Fold fold) {
 int ZORVadEnumString::MeetFolds(const Enum& x, Fold fold) {
   if (CanMark(x.mTexts.Count())) {
     Texts::Marks marks;
-    unsigned int next = 0;
-    for (const ZORString* const text : x.mTexts.All()) mTexts.Mark(Folded(*text, fold), marks, next);
+    unsigned int near = 0;
+    for (const ZORString* const text : x.mTexts.All()) mTexts.Mark(Folded(*text, fold), marks, near);
     return Keep(marks);
   }
   Texts folds(x.mTexts.Count());

@@ -4,9 +4,9 @@
 int ZORVadEnumString::Contains(const ZORString& text) const { return Contains(&text); }
 
 int ZORVadEnumString::Contains(const ZORString* text) const {
-  if (IsUndefined()) return 0;
-  if (IsNil()) return 0;
-  if (IsFull()) return -1;
+  if (mState == ZorStringAny) return 0;
+  if (mState == ZorStringNil) return 0;
+  if (mState == ZorStringMax && Count() == 0) return -1;
   const unsigned int position = mTexts.Find(text);
   return position <= mTexts.Count() ? static_cast<int>(position + 1) : 0;
 }

@@ -110,10 +110,10 @@ void ZORString::ToUpper() { FlipCase('a', 'z'); }
 void ZORString::FlipCase(char first, char last) {
   constexpr char kCaseBit = 'a' ^ 'A';
   if (mCapacity == kShared && last != kRunCharacter) return;
-  char* text = Reserve(mLength);
-  for (std::size_t i = 0; i < mLength; ++i) {
-    if (text[i] >= first && text[i] <= last) text[i] = static_cast<char>(text[i] ^ kCaseBit);
-  }
+  const auto flip = [&](char* text, std::size_t length) {
+    for (std::size_t i = 0; i < length; ++i) text[i] ^= text[i] >= first && text[i] <= last ? kCaseBit : '\0';
+  };
+  mCapacity == kInside ? flip(mInside, kRoom) : flip(Reserve(mLength), mLength);  // the zeros that pad a room stay
 }
 
 // Ensures owned storage for length characters and the terminating zero.

@@ -43,10 +43,12 @@ int ZORVadEnumString::CalcConcatenation(const ZORVadEnumString& x, const ZORVadE
   const std::size_t pairs = std::size_t{x.mTexts.Count()} * y.mTexts.Count();
   if (CanMark(pairs)) return Keep(MarkPairs(mTexts, x.mTexts, y.mTexts));
   Texts candidates(pairs);
+  ZORString candidate;
   for (const ZORString* const head : x.mTexts.All()) {
     for (const ZORString* const tail : y.mTexts.All()) {
       if (candidates.Count() == zor::kSetLimit) return 0;  // too many results: nothing is narrowed
-      candidates.Insert(ZORString::Concatenation(*head, *tail));
+      candidate.Concatenate(*head, *tail);                 // NOLINT(bugprone-use-after-move): whatever it was
+      candidates.Insert(std::move(candidate));             // which leaves it its memory if the text is there
     }
   }
   return Narrow(std::move(candidates));

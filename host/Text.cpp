@@ -111,7 +111,8 @@ void ZORString::FlipCase(char first, char last) {
   constexpr char kCaseBit = 'a' ^ 'A';
   if (mCapacity == kShared && last != kRunCharacter) return;
   const auto flip = [&](char* text, std::size_t length) {
-    for (std::size_t i = 0; i < length; ++i) text[i] ^= text[i] >= first && text[i] <= last ? kCaseBit : '\0';
+    for (std::size_t i = 0; i < length; ++i)
+      text[i] = static_cast<char>(text[i] ^ (text[i] >= first && text[i] <= last ? kCaseBit : 0));
   };
   mCapacity == kInside ? flip(mInside, kRoom) : flip(Reserve(mLength), mLength);  // the zeros that pad a room stay
 }
@@ -134,6 +135,14 @@ char* ZORString::Reserve(std::size_t length) {
 void ZORString::CopyBlock(const ZORString& other) {
   std::memset(mInside, 0, kRoom);
   Extend(other.View());
+}
+
+void ZORString::Join(std::string_view head, std::string_view tail) {
+  if (!IsOwner()) *this = ZORString();
+  mLength = 0;
+  Reserve(head.size() + tail.size());
+  Extend(head);
+  Extend(tail);
 }
 
 // text must not be in storage that Reserve frees.

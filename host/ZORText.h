@@ -71,8 +71,9 @@ class ZOR_EXPORT ZORString {
   explicit operator std::string_view() const { return View(); }
 
   static ZORString Concatenation(const ZORString& head, const ZORString& tail);  // at most one allocation
-  bool IsConcatenation(const ZORString& head, const ZORString& tail) const;      // no allocation
-  ZORString& Append(const ZORString& tail);                                      // tail may be *this
+  void Concatenate(const ZORString& head, const ZORString& tail);  // makes *this, which is neither, the concatenation
+  bool IsConcatenation(const ZORString& head, const ZORString& tail) const;  // no allocation
+  ZORString& Append(const ZORString& tail);                                  // tail may be *this
   // Ends at the end of the string at the latest. Empty when start is outside the string or length is a converted
   // negative number.
   ZORString SubString(std::size_t start, std::size_t length) const;
@@ -97,6 +98,7 @@ class ZOR_EXPORT ZORString {
   bool IsOwner() const { return mCapacity != kInside && mCapacity != kShared; }
   void CopyBlock(const ZORString& other);
   void Extend(std::string_view text);
+  void Join(std::string_view head, std::string_view tail);
   void FlipCase(char first, char last);
   char* Reserve(std::size_t length);
   void SetLength(std::size_t length);
@@ -171,19 +173,18 @@ inline void ZORString::JoinRooms(const ZORString& head, const ZORString& tail, c
   std::memcpy(joined + head.mLength, tail.mInside, kRoom);
 }
 
-inline ZORString ZORString::Concatenation(const ZORString& head, const ZORString& tail) {
-  ZORString text;
+inline void ZORString::Concatenate(const ZORString& head, const ZORString& tail) {
   const std::size_t length = std::size_t{head.mLength} + tail.mLength;
-  if (length > kInline || !AreInside(head, tail)) {
-    text.Reserve(length);
-    text.Extend(head.View());
-    text.Extend(tail.View());
-    return text;
-  }
+  if (mCapacity != kInside || length > kInline || !AreInside(head, tail)) return Join(head.View(), tail.View());
   char joined[2 * kRoom];
   JoinRooms(head, tail, joined);
-  std::memcpy(text.mInside, joined, kRoom);
-  text.mLength = static_cast<std::uint32_t>(length);
+  std::memcpy(mInside, joined, kRoom);
+  mLength = static_cast<std::uint32_t>(length);
+}
+
+inline ZORString ZORString::Concatenation(const ZORString& head, const ZORString& tail) {
+  ZORString text;
+  text.Concatenate(head, tail);
   return text;
 }
 

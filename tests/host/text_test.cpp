@@ -157,11 +157,14 @@ TEST(String, OrdersByTheFirstCharacterThatDiffers) {
 }
 
 TEST(String, ConcatenationsAreTestedWithoutBeingBuilt) {
+  ZORString kept('z', 40);  // a shared run; then whatever the last concatenation left
   for (const std::size_t first : kLengths) {
     for (const std::size_t second : kLengths) {
       const ZORString head('a', first), tail('z', second);
       std::string model = std::string(first, 'a') + std::string(second, 'z');
       ExpectSame(ZORString::Concatenation(head, tail), model);
+      kept.Concatenate(head, tail);
+      ExpectSame(kept, model);
       EXPECT_TRUE(ZORString(model.data(), model.size()).IsConcatenation(head, tail));
       EXPECT_FALSE(ZORString(model.data(), model.size()).IsConcatenation(head, ZORString('z', second + 1)));
       for (std::size_t at = 0; at < model.size(); at += 15) {

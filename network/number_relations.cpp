@@ -48,9 +48,9 @@ void NumberRelations::Remove(int target, int other) {
     std::erase(numbers, mStore[other].LowestNumber());
     return mStore.MeetNumbers(target, std::move(numbers));
   }
-  Value& outcome = mStore.CopyOf(target);
-  outcome.Any().CalcUnequalValue(mStore[other].Any());
-  mStore.Meet(target, outcome);
+  const ZORLong number = mStore[other].LowestNumber();
+  if (mStore[target].Sort() == Sort::IntegerSet && mStore[target].Integer().FindAtLeast(number) != number) return;
+  mStore.Edit(target, [&](Value& value) { value.Any().CalcUnequalValue(mStore[other].Any()); });
 }
 
 // x + distance <= y. Candidates do not make it hold for good: a single that is left with them shows as unknown.

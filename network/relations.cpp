@@ -99,19 +99,26 @@ void Relations::Equate(int target, int other) {
   }
 }
 
+// Once the only text of one side is gone from the other, nothing is left to do.
 Status Relations::Unequal(int x, int y) {
   if (mStore[y].IsOne()) Remove(x, mStore[y].LowestText());
   if (mStore.HasFailed()) return Status::Subsumed;
   if (mStore[x].IsOne()) Remove(y, mStore[x].LowestText());
-  return mStore[x].IsOne() && mStore[y].IsOne() ? Status::Subsumed : Status::Fixpoint;
+  const bool isOne = mStore[x].IsOne() || mStore[y].IsOne();
+  return isOne && mStore[x].IsKnown() && mStore[y].IsKnown() ? Status::Subsumed : Status::Fixpoint;
 }
 
 void Relations::Remove(int target, const ZORString& text) {
   if (!mStore[target].IsKnown()) return;
-  Value& outcome = mStore.CopyOf(target);
   mStore.StartOperation(Operation::Unequal);
-  RemoveFrom(outcome, text);
-  mStore.Meet(target, outcome);
+  if (Lists(target, text)) mStore.Edit(target, [&](Value& value) { RemoveFrom(value, text); });
+}
+
+bool Relations::Lists(int variable, const ZORString& text) {
+  const Value& value = mStore[variable];
+  if (value.Sort() == Sort::Text) return value.LowestText() == text;
+  mSingle.Text().SetExactValue(text);
+  return value.Any().IsIntersected(mSingle.Any()) != 0;
 }
 
 // x <= y or x < y: x loses what is greater than all of y, and y what is less than all of x. A strict order is posted as
@@ -144,45 +151,42 @@ void Relations::NarrowBeyondEnds(int x, int y) {
 }
 
 void Relations::CutAbove(int target, const ZORString& bound, bool strict) {
-  const ZORString highest = mStore[target].HighestText();
+  const ZORString lowest = mStore[target].LowestText(), highest = mStore[target].HighestText();
   if (strict ? highest < bound : highest <= bound) return;
-  Value& outcome = mStore.CopyOf(target);
   mStore.StartOperation(Operation::LessOrEqual);
-  if (bound < highest) LowerTo(bound, highest, outcome);
-  if (strict) RemoveFrom(outcome, bound);
-  mStore.Meet(target, outcome);
-}
-
-void Relations::LowerTo(const ZORString& bound, const ZORString& highest, Value& outcome) {
-  const bool single = outcome.Sort() == Sort::Text;
-  if (single && (IsLeastSomewhere(bound) || IsLeastSomewhere(highest))) return outcome.Any().SetNilValue();
-  outcome.Text().CalcLessOrEqualValue(Bound(bound).Any());
+  mStore.Edit(target, [&](Value& value) {
+    if (bound < lowest) return value.Any().SetNilValue();
+    if (bound < highest) value.Text().CalcLessOrEqualValue(Bound(bound).Any());
+    if (strict) RemoveFrom(value, bound);
+  });
 }
 
 void Relations::CutBelow(int target, const ZORString& bound, bool strict) {
-  const ZORString lowest = mStore[target].LowestText();
+  const ZORString lowest = mStore[target].LowestText(), highest = mStore[target].HighestText();
   if (strict ? lowest > bound : lowest >= bound) return;
-  Value& outcome = mStore.CopyOf(target);
   mStore.StartOperation(Operation::NotLess);
-  if (lowest < bound) RaiseTo(bound, lowest, outcome);
-  if (strict) RemoveFrom(outcome, bound);
-  mStore.Meet(target, outcome);
+  mStore.Edit(target, [&](Value& value) {
+    if (highest < bound) return value.Any().SetNilValue();
+    if (lowest < bound) RaiseTo(LeastFrom(target, bound), value);
+    if (strict) RemoveFrom(value, bound);
+  });
 }
 
-// The module answers one space for the bounds of a set that lists "" alone.
-void Relations::RaiseTo(const ZORString& bound, const ZORString& lowest, Value& outcome) {
-  const bool single = outcome.Sort() == Sort::Text;
-  if (single ? IsLeastSomewhere(bound) || IsLeastSomewhere(lowest) : outcome.Text().IsEmpty() != 0) {
-    return outcome.Any().SetNilValue();
-  }
-  Value& operand = single ? mSingle : mSet;
-  operand.Text().SetExactValue(bound);
-  outcome.Text().CalcNotLessValue(operand.Text());
+// The least text of a set from bound on; there is one. A set does not answer its last text as the next one, but bound.
+ZORString Relations::LeastFrom(int variable, const ZORString& bound) {
+  const ZORString next = mStore[variable].Text().GetNextExactValue(bound);
+  return next == bound && !Lists(variable, bound) ? mStore[variable].HighestText() : next;
 }
 
-void Relations::RemoveFrom(Value& outcome, const ZORString& text) {
+// A listed one, since the module lists the bound.
+void Relations::RaiseTo(const ZORString& bound, Value& value) {
+  mSet.Text().SetExactValue(bound);
+  value.Text().CalcNotLessValue(mSet.Text());
+}
+
+void Relations::RemoveFrom(Value& value, const ZORString& text) {
   mSingle.Text().SetExactValue(text);
-  outcome.Text().CalcUnequalValue(mSingle.Any());
+  value.Text().CalcUnequalValue(mSingle.Any());
 }
 
 // An upper bound as an operand. One space goes into a set: as a single value it is the least of its class, which the

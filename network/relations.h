@@ -27,9 +27,10 @@ class Relations {
   void NarrowBeyondEnds(int x, int y);
   void CutAbove(int target, const ZORString& bound, bool strict);
   void CutBelow(int target, const ZORString& bound, bool strict);
-  void LowerTo(const ZORString& bound, const ZORString& highest, Value& outcome);
-  void RaiseTo(const ZORString& bound, const ZORString& lowest, Value& outcome);
-  void RemoveFrom(Value& outcome, const ZORString& text);
+  void RaiseTo(const ZORString& bound, Value& value);
+  ZORString LeastFrom(int variable, const ZORString& bound);
+  void RemoveFrom(Value& value, const ZORString& text);
+  bool Lists(int variable, const ZORString& text);
   bool Ask(Meaning meaning, int x, int y, Value& answer);
   bool AskTexts(Meaning meaning, int x, int y, Value& answer);
   void AskEqual(const Value& left, const Value& right, Value& answer);

@@ -86,22 +86,29 @@ void Store::Meet(int variable, const Value& outcome) {
   if (HasCandidates(variable) && !outcome.IsNil() && outcome.Sort() != held.Sort())
     return MeetNumbers(variable, CandidatesIn(variable, outcome));
   if (HasCandidates(variable) && !IsCandidate(variable, outcome)) return Fail(variable);
-  const Measure before = MeasureOf(held);
-  const std::string shown = mWatcher != nullptr ? Show(variable) : "";
-  if (mMarks.empty()) {
-    Narrow(variable, outcome);
-  } else {
-    Saved saved{variable, held, TakeCandidates(variable)};  // a value is less than candidates, so they always go
-    Narrow(variable, outcome);
-    if (MeasureOf(held) != before) mTrail.push_back(std::move(saved));
+  Former former = FormerOf(variable);
+  const bool wasUndefined = former.measure.undefined;
+  Narrow(variable, outcome);
+  if (Settle(std::move(former))) {
+    if (wasUndefined) FitToShape(variable);
+  } else if (wasUndefined && !outcome.IsNil()) {
+    ExceedSet(variable, outcome.Any().GetCardinality());
   }
-  if (MeasureOf(held) == before) {
-    if (before.undefined && !outcome.IsNil()) ExceedSet(variable, outcome.Any().GetCardinality());
-    return;
-  }
-  mListed[static_cast<std::size_t>(variable)] = 0;
-  Changed(variable, shown);
-  if (before.undefined) FitToShape(variable);
+}
+
+Store::Former Store::FormerOf(int variable) {
+  const Value& held = (*this)[variable];
+  Former former{variable, MeasureOf(held), mWatcher != nullptr ? Show(variable) : "", {}};
+  if (!mMarks.empty()) former.saved = Saved{variable, held, TakeCandidates(variable)};  // which a value is less than
+  return former;
+}
+
+bool Store::Settle(Former former) {
+  if (MeasureOf((*this)[former.variable]) == former.measure) return false;
+  if (former.saved) mTrail.push_back(std::move(*former.saved));
+  mListed[static_cast<std::size_t>(former.variable)] = 0;
+  Changed(former.variable, former.shown);
+  return true;
 }
 
 void Store::Changed(int variable, const std::string& before) {
@@ -121,7 +128,8 @@ void Store::Changed(int variable, const std::string& before) {
 // Intersecting a single value with the least or the greatest one would replace it, so disjoint values are found first.
 void Store::Narrow(int variable, const Value& outcome) {
   Value& held = mValues[static_cast<std::size_t>(variable)];
-  if (held.Any().IsIntersected(outcome.Any()) == 0) return held.Any().SetNilValue();
+  const bool areSets = held.Sort() == Sort::TextSet && outcome.Sort() == Sort::TextSet;
+  if (!areSets && held.Any().IsIntersected(outcome.Any()) == 0) return held.Any().SetNilValue();
   held.Any().Intersect(outcome.Any());
   if (held.Sort() == Sort::Text && held.IsKnown() && held.LowestText() == GreatestText()) held.Text().CalcMaxValue();
 }

@@ -104,7 +104,7 @@ TEST(Search, StopsInTimeAndLeavesNoTrace) {
   } const rows[] = {
       {"at the limit", 3, 9, 1000, 3, zornet::Outcome::Settled},
       {"when no other is wanted", 9, 2, 1000, 2, zornet::Outcome::Settled},
-      {"at the limit of steps", 9, 9, 6, 1, zornet::Outcome::StepLimit},
+      {"at the limit of steps", 9, 9, 4, 1, zornet::Outcome::StepLimit},
   };
   for (const auto& row : rows) {
     Solved solved("var {\"a\", \"b\"}: x; var {\"b\", \"c\"}: y; constraint str_ne(x, y);", {65536, row.steps});

@@ -43,6 +43,7 @@ class Propagation {
   // As in Store, for what is settled and what waits.
   void Mark() { mMarks.push_back(mFinished.size()); }
   void Undo();
+  std::span<const int> FinishedSinceMark() const { return std::span(mFinished).subspan(mMarks.back()); }
 
  private:
   void Connect();

@@ -9,27 +9,35 @@ Search::Search(Store& store, Propagation& propagation)
     : mStore(store),
       mPropagation(propagation),
       mSemantics(store.Types()),
+      mLeastWanted(store.Model().Variables().size()),
+      mLeast(store.Model().Variables().size()),
       mStamps(store.Model().Variables().size(), 0),
       mFailures(store.Model().Constraints().size(), 0) {
-  std::vector<char> taken(mStamps.size(), 0);
+  constexpr std::size_t kNowhere = -1;
+  mPlaces.resize(mStamps.size(), kNowhere);
   const auto take = [&](int variable) {
-    if (std::exchange(taken[static_cast<std::size_t>(variable)], 1) == 0) mOrder.push_back(variable);
+    std::size_t& place = mPlaces[static_cast<std::size_t>(variable)];
+    if (place != kNowhere) return;
+    place = mOrder.size();
+    mOrder.push_back(variable);
   };
   for (const int variable : store.Model().Wanted()) take(variable);
   mWanted = mOrder.size();
   for (const Constraint& constraint : store.Model().Constraints()) {
     for (const int variable : constraint.arguments) take(variable);
   }
+  std::replace(mPlaces.begin(), mPlaces.end(), kNowhere, mOrder.size());
   for (std::size_t place = 0; place < mOrder.size(); ++place) {
-    if (!mStore.List(mOrder[place]).known) mUnlisted.push_back(place);
+    if (mStore.Count(mOrder[place]) == 0) mUnlisted.push_back(place);
   }
+  Renew(mOrder);
 }
 
 Outcome Search::Run(std::uint64_t limit, const Solution& solution) {
   const Outcome outcome = Look(limit, solution);
   mExhausted = outcome == Outcome::Settled && mFrames.empty();
   for (; !mFrames.empty(); mFrames.pop_back()) {
-    if (mFrames.size() > 1) Retract();
+    if (mFrames.size() > 1) Undo();
   }
   return outcome;
 }
@@ -45,10 +53,16 @@ Outcome Search::Look(std::uint64_t limit, const Solution& solution) {
     Mark();
     Choose(mFrames.back());
     const Outcome outcome = mPropagation.Run();
-    if (outcome == Outcome::Settled && Visit(solution)) continue;
-    if (outcome == Outcome::Contradiction) CountFailure();
-    Retract();
-    if (outcome != Outcome::Settled && outcome != Outcome::Contradiction) return outcome;
+    if (outcome == Outcome::Settled) {
+      FindChanged();
+      Renew(mChanged);
+      if (!Visit(solution)) Retract();
+      continue;
+    }
+    const int failed = mStore.FailedConstraint();
+    Undo();
+    if (outcome != Outcome::Contradiction) return outcome;
+    CountFailure(failed);
   }
   return Outcome::Settled;
 }
@@ -66,28 +80,38 @@ bool Search::Visit(const Solution& solution) {
     Leaf(solution);
     return false;
   }
-  Push(first, Pick(first));
+  Push(first, Pick());
   return true;
 }
 
 // The place of the variable with the fewest values for the contradictions of its constraints, a wanted one if there is
-// one. Where nothing is stuck, one is listed.
-std::size_t Search::Pick(std::size_t first) {
-  std::size_t chosen = mOrder.size();
+// one, or of the first that has few enough. Where nothing is stuck, one is listed.
+std::size_t Search::Pick() const {
   const double enough = 2.0 / static_cast<double>(1 + mFailed);  // hardly any is below
-  double least = 0;
-  for (std::size_t place = first; place < mOrder.size(); ++place) {
-    const bool found = chosen != mOrder.size();
-    if (found && (least <= enough || place == mWanted)) break;
-    if (!Needs(place)) continue;
-    const Listing& listing = mStore.List(mOrder[place]);
-    if (!listing.known) continue;
-    const double size = static_cast<double>(listing.count) / static_cast<double>(WeightOf(mOrder[place]));
-    if (found && size >= least) continue;
-    chosen = place;
-    least = size;
+  const Tournament& keys = mLeastWanted.Least() != Tournament::kOut ? mLeastWanted : mLeast;
+  return keys.FirstUpTo(std::max(enough, keys.Least()));
+}
+
+double Search::KeyOf(std::size_t place) const {
+  const std::size_t count = Needs(place) ? mStore.Count(mOrder[place]) : 0;
+  return count == 0 ? Tournament::kOut : static_cast<double>(count) / static_cast<double>(WeightOf(mOrder[place]));
+}
+
+void Search::Renew(std::span<const int> variables) {
+  for (const int variable : variables) {
+    const std::size_t place = mPlaces[static_cast<std::size_t>(variable)];
+    if (place < mOrder.size()) (place < mWanted ? mLeastWanted : mLeast).Set(place, KeyOf(place));
   }
-  return chosen;
+}
+
+// Since the latest mark.
+void Search::FindChanged() {
+  mChanged.clear();
+  mStore.AddChanged(mChanged);
+  for (const int constraint : mPropagation.FinishedSinceMark()) {
+    const auto& arguments = mStore.Model().Constraints()[static_cast<std::size_t>(constraint)].arguments;
+    mChanged.insert(mChanged.end(), arguments.begin(), arguments.end());
+  }
 }
 
 std::uint64_t Search::WeightOf(int variable) const {
@@ -132,11 +156,11 @@ void Search::Choose(Frame& frame) {
 }
 
 // A choice itself fails nothing: its value is one of the domain.
-void Search::CountFailure() {
-  const int constraint = mStore.FailedConstraint();
+void Search::CountFailure(int constraint) {
   if (constraint == kNone) return;
   ++mFailures[static_cast<std::size_t>(constraint)];
   ++mFailed;
+  Renew(mStore.Model().Constraints()[static_cast<std::size_t>(constraint)].arguments);
 }
 
 void Search::Mark() {
@@ -144,9 +168,15 @@ void Search::Mark() {
   mPropagation.Mark();
 }
 
-void Search::Retract() {
+void Search::Undo() {
   mStore.Undo();
   mPropagation.Undo();
+}
+
+void Search::Retract() {
+  FindChanged();
+  Undo();
+  Renew(mChanged);
 }
 
 // Whether the variable still has to get one value. Beside the wanted ones, finished constraints need none.
@@ -155,17 +185,31 @@ bool Search::Needs(std::size_t place) const {
   return !mStore[variable].IsOne() && (place < mWanted || mPropagation.Waits(variable));
 }
 
-// Whether variables that are needed cannot become known any more. Those that unfinished constraints connect cannot
-// together, so that none is met twice.
+// Whether variables that are needed cannot become known any more: at first any of them, and then those that are
+// connected to what the latest choice has changed. Those that unfinished constraints connect cannot together, so that
+// none is met twice.
 bool Search::IsStuck() {
-  const std::uint64_t before = mStamp;
   mStuck.clear();
-  for (const std::size_t place : mUnlisted) {
-    const int variable = mOrder[place];
-    if (Needs(place) && !mStore.List(variable).known && !CanBecomeKnown(variable, before))
-      mStuck.insert(mStuck.end(), mReached.begin(), mReached.end());
+  if (mUnlisted.empty()) return false;
+  const std::uint64_t before = mStamp;
+  if (mFrames.empty()) {
+    for (const std::size_t place : mUnlisted) CheckForStuck(mOrder[place], before);
+  }
+  for (const int variable : mChanged) {
+    CheckForStuck(variable, before);
+    for (const int reader : mPropagation.ReadersOf(variable)) {
+      if (mPropagation.IsFinished(reader)) continue;
+      for (const int other : mStore.Model().Constraints()[static_cast<std::size_t>(reader)].arguments)
+        CheckForStuck(other, before);
+    }
   }
   return !mStuck.empty();
+}
+
+void Search::CheckForStuck(int variable, std::uint64_t before) {
+  const std::size_t place = mPlaces[static_cast<std::size_t>(variable)];
+  if (place < mOrder.size() && Needs(place) && mStore.Count(variable) == 0 && !CanBecomeKnown(variable, before))
+    mStuck.insert(mStuck.end(), mReached.begin(), mReached.end());
 }
 
 // Whether unfinished constraints connect it to a variable that there are choices for, or it has been asked about. What
@@ -180,7 +224,7 @@ bool Search::CanBecomeKnown(int variable, std::uint64_t before) {
       if (mPropagation.IsFinished(number)) continue;
       for (const int other : mStore.Model().Constraints()[static_cast<std::size_t>(number)].arguments) {
         if (mStore[other].IsOne() || stamp(other) == mStamp) continue;
-        if (mStore.List(other).known || stamp(other) > before) return true;
+        if (mStore.Count(other) > 0 || stamp(other) > before) return true;
         stamp(other) = mStamp;
         mReached.push_back(other);
       }

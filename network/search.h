@@ -8,12 +8,14 @@
 #include <cstdint>
 #include <functional>
 #include <set>
+#include <span>
 #include <string>
 #include <vector>
 
 #include "network/propagation.h"
 #include "network/semantics.h"
 #include "network/store.h"
+#include "network/tournament.h"
 
 namespace zornet {
 
@@ -47,16 +49,21 @@ class Search {
 
   Outcome Look(std::uint64_t limit, const Solution& solution);
   bool Visit(const Solution& solution);
-  std::size_t Pick(std::size_t first);
+  std::size_t Pick() const;
+  double KeyOf(std::size_t place) const;
   std::uint64_t WeightOf(int variable) const;
-  void CountFailure();
+  void CountFailure(int constraint);
+  void FindChanged();
+  void Renew(std::span<const int> variables);
   void Push(std::size_t first, std::size_t place);
   void Pop();
   void Choose(Frame& frame);
   void Mark();
+  void Undo();
   void Retract();
   bool Needs(std::size_t place) const;
   bool IsStuck();
+  void CheckForStuck(int variable, std::uint64_t before);
   bool CanBecomeKnown(int variable, std::uint64_t before);
   void LeaveOpen();
   void CountOpen(const std::vector<int>& variables);
@@ -71,6 +78,9 @@ class Search {
   Semantics mSemantics;
   std::vector<int> mOrder;             // variables that matter, the wanted ones first
   std::size_t mWanted = 0;             // so many of them are wanted
+  std::vector<std::size_t> mPlaces;    // of the variables in mOrder; mOrder.size() of others
+  Tournament mLeastWanted, mLeast;     // the keys of the places in mOrder
+  std::vector<int> mChanged;           // variables that the latest choice has narrowed, or finished constraints of
   std::vector<std::size_t> mUnlisted;  // places in mOrder whose values could not be listed at first
   std::vector<std::uint64_t> mStamps;  // when CanBecomeKnown reached each variable last
   std::uint64_t mStamp = 0;

@@ -57,6 +57,13 @@ const Listing& Store::List(int variable) {
   return listing;
 }
 
+std::size_t Store::Count(int variable) const {
+  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)].count;
+  const Value& value = (*this)[variable];
+  const bool isListed = value.IsKnown() || (value.Sort() == Sort::Boolean && value.IsUndefined());
+  return isListed ? value.Any().GetCardinality() : 0;
+}
+
 Value& Store::Fresh(Sort sort) {
   Value& value = mFresh[static_cast<std::size_t>(sort)];
   value.Reset();
@@ -335,6 +342,10 @@ void Store::Fail(int variable) {
   Value& nil = FreshLike(variable);
   nil.Any().SetNilValue();
   Meet(variable, nil);
+}
+
+void Store::AddChanged(std::vector<int>& variables) const {
+  for (std::size_t i = mMarks.back().values; i < mTrail.size(); ++i) variables.push_back(mTrail[i].variable);
 }
 
 void Store::Undo() {

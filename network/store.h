@@ -58,6 +58,7 @@ class Store {
   const Variable& Declared(int variable) const { return mModel.Variables()[static_cast<std::size_t>(variable)]; }
   std::int64_t LowestNumber(int variable) const;   // of integers and truth values; the least of all where nothing
   std::int64_t HighestNumber(int variable) const;  // is known, and the greatest
+  std::size_t Count(int variable) const;           // of the values that List answers; 0 where nothing is known
   const Listing& List(int variable);  // good until the variable changes; of an Undefined single its candidates
 
   // A value of the variable's type that is Undefined, good until the next call for the same type.
@@ -108,8 +109,9 @@ class Store {
   // The value itself, for the module's bare operations.
   Value& Bare(int variable) { return mValues[static_cast<std::size_t>(variable)]; }
 
-  // Undo takes back the changes since the latest Mark.
+  // Undo takes back the changes since the latest Mark. AddChanged adds the variables whose values these are of.
   void Mark() { mMarks.push_back({mTrail.size(), mShapeTrail.size()}); }
+  void AddChanged(std::vector<int>& variables) const;
   void Undo();
 
  private:

@@ -144,14 +144,31 @@ bool Resolver::SetNamedType(const Token& name, Variable& variable) {
 bool Resolver::Collect(std::span<const Word> words, Word::Type expected, Variable& variable) {
   variable.texts.clear();
   variable.numbers.clear();
+  if (expected == Word::Text) return CollectTexts(words, variable.texts);
   for (const Word& word : words) {
     if (!IsOf(word, expected)) return false;
-    if (expected == Word::Text) variable.texts.push_back(Unescaped(word.token));
     if (expected == Word::Number) variable.numbers.push_back(static_cast<std::int32_t>(word.token.number));
     if (expected == Word::Truth) variable.numbers.push_back(word.token.Is("true") ? 1 : 0);
   }
-  SortUnique(variable.texts);
   SortUnique(variable.numbers);
+  return true;
+}
+
+// As they are written they are sorted at less cost, if they have no escapes.
+bool Resolver::CollectTexts(std::span<const Word> words, std::vector<std::string>& texts) {
+  mViews.clear();
+  for (const Word& word : words) {
+    if (!IsOf(word, Word::Text)) return false;
+    mViews.push_back(word.token.text);
+  }
+  texts.reserve(words.size());
+  if (std::any_of(words.begin(), words.end(), [](const Word& word) { return IsEscaped(word.token); })) {
+    for (const Word& word : words) texts.push_back(Unescaped(word.token));
+    SortUnique(texts);
+  } else {
+    SortUnique(mViews);
+    texts.assign(mViews.begin(), mViews.end());
+  }
   return true;
 }
 

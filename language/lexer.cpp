@@ -31,8 +31,12 @@ std::size_t WrittenLength(std::string_view text) {
 
 }  // namespace
 
+bool IsEscaped(const Token& token) {
+  return token.type != Token::Line && token.text.find('\\') != std::string_view::npos;
+}
+
 std::string Unescaped(const Token& token) {
-  if (token.type == Token::Line || token.text.find('\\') == std::string_view::npos) return std::string(token.text);
+  if (!IsEscaped(token)) return std::string(token.text);
   std::string text;
   for (std::size_t i = 0, length; i < token.text.size(); i += length) {
     length = WrittenLength(token.text.substr(i));
@@ -103,7 +107,7 @@ bool Lexer::SkipsComment() {
 }
 
 Token Lexer::Make(Token::Type type, std::size_t length) {
-  const Token token{type, Here(length), mText.substr(mNext, length)};
+  const Token token{Here(length), mText.substr(mNext, length), 0, type};
   mNext += length;
   return token;
 }
@@ -122,7 +126,7 @@ Token Lexer::NextNumber() {
   Token token = Make(Token::Number, length);
   const auto [end, error] = std::from_chars(token.text.data(), token.text.data() + token.text.size(), token.number);
   using Limits = std::numeric_limits<ZORLong>;
-  if (error == std::errc() && token.number >= Limits::min() && token.number <= Limits::max()) return token;
+  if (error == std::errc()) return token;
   mDiagnostics.Error(token.extent, fmt::format("an integer lies between {} and {}", Limits::min(), Limits::max()));
   token.type = Token::Broken;
   return token;

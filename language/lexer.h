@@ -11,17 +11,18 @@
 namespace zornet {
 
 struct Token {
-  enum Type { Name, Number, Text, Line, DotDot, Mark, Broken, End };
+  enum Type : char { Name, Number, Text, Line, DotDot, Mark, Broken, End };
 
-  Type type = End;
   Extent extent;
   std::string_view text;    // as it stands; of a Text without the quotes
-  std::int64_t number = 0;  // of a Number
+  std::int32_t number = 0;  // of a Number
+  Type type = End;
 
   bool Is(std::string_view word) const { return (type == Name || type == Mark) && text == word; }
 };
 
 // What a Text in quotes or a Line of a file says. Where a character of it stands in the source.
+bool IsEscaped(const Token& token);
 std::string Unescaped(const Token& token);
 std::size_t PositionOf(const Token& token, std::size_t character);
 

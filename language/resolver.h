@@ -59,6 +59,7 @@ class Resolver {
   bool SetValue(const DeclarationSyntax& declaration, Variable& variable);
   bool IsAllowed(const Variable& variable, const Word& word) const;
   bool Collect(std::span<const Word> words, Word::Type expected, Variable& variable);
+  bool CollectTexts(std::span<const Word> words, std::vector<std::string>& texts);
   bool IsOf(const Word& word, Word::Type expected);
   bool Spend(std::size_t values, Extent place);
   int AddConstant(const Word& word);
@@ -92,9 +93,10 @@ class Resolver {
   Diagnostics& mDiagnostics;
   ReadModel mRead;
   Model& mModel = mRead.model;
-  std::vector<Variable> mSets;       // those with a name: of each a variable that ranges over it
-  std::vector<Argument> mArguments;  // of the constraint that is added
-  std::size_t mListed = 0;           // in its list
+  std::vector<Variable> mSets;           // those with a name: of each a variable that ranges over it
+  std::vector<std::string_view> mViews;  // of the texts that are collected
+  std::vector<Argument> mArguments;      // of the constraint that is added
+  std::size_t mListed = 0;               // in its list
   std::unordered_map<std::string_view, Named> mNames;
   std::unordered_set<std::string_view> mBroken;  // of these it was told already that something is wrong
   std::size_t mValues = 0;                       // of the limited ones

@@ -2,6 +2,7 @@
 
 #include <fmt/core.h>
 
+#include <initializer_list>
 #include <memory>
 #include <optional>
 #include <string>
@@ -67,7 +68,8 @@ class Parser {
   Range LinesOf(std::size_t file);
   Range Rows();
   Range Members(Word (Parser::*member)());
-  Range Keep(const std::vector<Word>& words);
+  Range Keep(std::span<const Word> words);
+  Range Keep(std::initializer_list<Word> words) { return Keep(std::span(words.begin(), words.size())); }
   Word Literal();
   Word Constant();
   Word Argument();
@@ -90,12 +92,14 @@ class Parser {
   Extent mLast;  // of the one before
   Token mDeclared;
   std::optional<std::size_t> mIncluded;
+  std::vector<Word> mPending;  // of lists that are not at their end
   Syntax& mSyntax;
 };
 
 std::optional<std::size_t> Parser::ReadItem() {
   mDeclared = Token();
   mIncluded.reset();
+  mPending.clear();
   try {
     Item();
   } catch (const Unreadable&) {
@@ -271,22 +275,25 @@ Range Parser::Lines(Extent word) {
 Range Parser::LinesOf(std::size_t file) {
   std::vector<Word> lines;
   for (const Extent line : mSource.LinesOf(file)) {
-    lines.push_back({Word::Text, {Token::Line, line, mSource.Text(line)}});
+    lines.push_back({Word::Text, {line, mSource.Text(line), 0, Token::Line}});
     CheckText(lines.back().token, mDiagnostics);
   }
   return Keep(lines);
 }
 
 Range Parser::Members(Word (Parser::*member)()) {
-  std::vector<Word> members{(this->*member)()};
+  const std::size_t first = mPending.size();
+  mPending.push_back((this->*member)());
   while (mToken.Is(",")) {
     Take();
-    members.push_back((this->*member)());
+    mPending.push_back((this->*member)());
   }
-  return Keep(members);
+  const Range range = Keep(std::span(mPending).subspan(first));
+  mPending.resize(first);
+  return range;
 }
 
-Range Parser::Keep(const std::vector<Word>& words) {
+Range Parser::Keep(std::span<const Word> words) {
   const Range range{mSyntax.members.size(), words.size()};
   mSyntax.members.insert(mSyntax.members.end(), words.begin(), words.end());
   return range;

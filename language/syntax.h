@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <span>
 #include <unordered_map>
 #include <vector>
@@ -18,14 +19,18 @@ inline constexpr std::string_view kTypes[] = {"string", "set", "int", "bool"};
 inline constexpr std::string_view kAnyType =
     "a type: string, set string, {\"a\", \"b\"}, int, 1..9, {1, 3}, bool or the name of a set";
 
-// Neighbours in Syntax::members.
+// Neighbours in Syntax::members, which are fewer than the bytes of any source. Small, since a model may have millions.
 struct Range {
-  std::size_t first = 0, count = 0;
+  Range() = default;
+  Range(std::size_t from, std::size_t howMany)
+      : first(static_cast<std::uint32_t>(from)), count(static_cast<std::uint32_t>(howMany)) {}
+
+  std::uint32_t first = 0, count = 0;
 };
 
 // What stands where a value stands: a constant, a name, w[3], or in brackets a list or the rows of a table.
 struct Word {
-  enum Type { Name, Text, Number, Truth, Element, List, Rows };
+  enum Type : char { Name, Text, Number, Truth, Element, List, Rows };
 
   Type type = Name;
   Token token;  // of an Element the name of its array and the extent of all; of a List or Rows no more than the extent

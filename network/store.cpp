@@ -28,6 +28,7 @@ Value Initial(const Types& types, const Variable& variable) {
 Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(types), mModel(model) {
   mValues.reserve(model.Variables().size());
   for (const Variable& variable : model.Variables()) mValues.push_back(Initial(types, variable));
+  mChanged.resize(mValues.size(), 0);
   for (int i = 0; i < kSorts; ++i) mFresh.emplace_back(types, static_cast<Sort>(i));
   mListings.resize(mValues.size());
   mListed.resize(mValues.size(), 0);
@@ -35,17 +36,18 @@ Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(ty
 }
 
 const Listing& Store::List(int variable) {
-  const auto at = static_cast<std::size_t>(variable);
-  Listing& listing = mListings[at];
-  if (mListed[at] != 0) return listing;
-  const Value& value = mValues[at];
-  listing = Listing();
+  if (mListed[static_cast<std::size_t>(variable)] == 0) KeepListing(variable, ListingOf(variable));
+  return mListings[static_cast<std::size_t>(variable)];
+}
+
+Listing Store::ListingOf(int variable) const {
+  const Value& value = (*this)[variable];
+  Listing listing;
   listing.sort = value.Sort();
   listing.known = value.IsKnown() || (value.Sort() == Sort::Boolean && value.IsUndefined());
-  mListed[at] = 1;
   if (!listing.known) return listing;
   if (IsText(value.Sort())) {
-    listing.texts = value.Texts();
+    listing.texts = TextsOf(variable);
     listing.count = listing.texts.size();
   } else if (value.Sort() == Sort::IntegerSet) {
     listing.numbers = value.Numbers();
@@ -55,6 +57,34 @@ const Listing& Store::List(int variable) {
     listing.count = static_cast<std::size_t>(std::int64_t{value.HighestNumber()} - listing.first + 1);
   }
   return listing;
+}
+
+void Store::KeepListing(int variable, Listing listing) {
+  mKept.push_back(variable);
+  mKeptValues += 1 + listing.texts.size() + listing.numbers.size();
+  mListings[static_cast<std::size_t>(variable)] = std::move(listing);
+  mListed[static_cast<std::size_t>(variable)] = 1;
+}
+
+// A large network would hold every value twice. Candidates are no copies.
+void Store::ForgetListings() {
+  for (const int variable : mKept) {
+    if (HasCandidates(variable)) continue;
+    mListings[static_cast<std::size_t>(variable)] = Listing();
+    mListed[static_cast<std::size_t>(variable)] = 0;
+  }
+  mKept.clear();
+  mKeptValues = 0;
+}
+
+// As long as it is as it was declared, the model lists them at less cost.
+std::vector<ZORString> Store::TextsOf(int variable) const {
+  const std::vector<std::string>& declared = Declared(variable).texts;
+  if (mChanged[static_cast<std::size_t>(variable)] != 0 || declared.empty()) return (*this)[variable].Texts();
+  std::vector<ZORString> texts;
+  texts.reserve(declared.size());
+  for (const std::string& text : declared) texts.push_back(ToZor(text));
+  return texts;
 }
 
 std::size_t Store::Count(int variable) const {
@@ -123,6 +153,7 @@ void Store::Changed(int variable, const std::string& before) {
   OperationCounts& counts = mCounts[static_cast<std::size_t>(mOperation)];
   ++counts.changes;
   mTouched.push_back(variable);
+  mChanged[static_cast<std::size_t>(variable)] = 1;
   if (held.IsNil()) {
     ++counts.contradictions;
     mFailed = variable;
@@ -225,7 +256,11 @@ void Store::MeetTexts(int variable, std::vector<ZORString> texts) {
     return MeetCandidates(variable, {true, std::move(texts), {}, 0, 0, Sort::Text});
   Value& outcome = FreshLike(variable);
   texts.size() == 1 ? outcome.SetText(texts.front()) : outcome.SetTexts(texts);
+  const bool wasUndefined = (*this)[variable].IsUndefined();
   Meet(variable, outcome);
+  if (!wasUndefined || mListed[static_cast<std::size_t>(variable)] != 0 || Count(variable) != texts.size()) return;
+  const std::size_t count = texts.size();
+  KeepListing(variable, {true, std::move(texts), {}, 0, count, (*this)[variable].Sort()});
 }
 
 void Store::MeetNumbers(int variable, std::vector<ZORLong> numbers) {

@@ -59,7 +59,8 @@ class Store {
   std::int64_t LowestNumber(int variable) const;   // of integers and truth values; the least of all where nothing
   std::int64_t HighestNumber(int variable) const;  // is known, and the greatest
   std::size_t Count(int variable) const;           // of the values that List answers; 0 where nothing is known
-  const Listing& List(int variable);  // good until the variable changes; of an Undefined single its candidates
+  // Good until the variable changes or the next constraint is started; of an Undefined single its candidates.
+  const Listing& List(int variable);
 
   // A value of the variable's type that is Undefined, good until the next call for the same type.
   Value& Fresh(Sort sort);
@@ -69,6 +70,7 @@ class Store {
   // Changes are recorded under the constraint and operation named last.
   void StartConstraint(int constraint) {
     mConstraint = constraint;
+    if (mKeptValues > kMostKept) ForgetListings();
     if (!mLimitsMet.empty()) ForgetLimits();
   }
   void StartOperation(Operation operation);
@@ -134,6 +136,10 @@ class Store {
     std::optional<Saved> saved;
   };
 
+  Listing ListingOf(int variable) const;
+  std::vector<ZORString> TextsOf(int variable) const;
+  void KeepListing(int variable, Listing listing);
+  void ForgetListings();
   static Measure MeasureOf(const Value& value);
   Former FormerOf(int variable);
   bool Settle(Former former);  // whether it was narrowed
@@ -155,7 +161,11 @@ class Store {
   std::vector<Value> mFresh;
   std::vector<Listing> mListings;
   std::vector<char> mListed;  // whether the listing is up to date
-  std::vector<int> mShapeOf;  // by variable: an index into mShapes, or kNone
+  static constexpr std::size_t kMostKept = 1 << 18;
+  std::vector<int> mKept;  // the variables that were listed since all listings were forgotten
+  std::size_t mKeptValues = 0;
+  std::vector<char> mChanged;  // whether the value is not as it was declared any more
+  std::vector<int> mShapeOf;   // by variable: an index into mShapes, or kNone
   std::vector<Shape> mShapes;
   std::vector<int> mTouched;
   std::vector<Saved> mTrail;

@@ -16,6 +16,10 @@ namespace {
 
 bool IsDigit(char c) { return c >= '0' && c <= '9'; }
 bool IsLetter(char c) { return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || c == '_'; }
+bool IsMark(char c) {
+  return c == ',' || c == '(' || c == ')' || c == ';' || c == ':' || c == '{' || c == '}' || c == '[' || c == ']' ||
+         c == '|' || c == '=';
+}
 bool IsBlank(char c) { return c == ' ' || (c >= '\t' && c <= '\r'); }
 
 std::string NameOf(std::string_view character) {
@@ -81,15 +85,16 @@ Token Lexer::Next() {
   if (StartsNumber()) return NextNumber();
   if (c == '"') return NextText();
   if (c == '.' && At(1) == '.') return Make(Token::DotDot, 2);
-  if (std::string_view("(){}[]|,:;=").find(c) != std::string_view::npos) return Make(Token::Mark, 1);
+  if (IsMark(c)) return Make(Token::Mark, 1);
   return NextBroken();
 }
 
 void Lexer::SkipBlanks() {
   while (mNext < mText.size()) {
-    if (IsBlank(At(0))) {
+    const char c = mText[mNext];
+    if (IsBlank(c)) {
       ++mNext;
-    } else if (!SkipsComment()) {
+    } else if ((c != '%' && c != '/' && c != '#') || !SkipsComment()) {
       return;
     }
   }
@@ -136,7 +141,7 @@ Token Lexer::NextNumber() {
 Token Lexer::NextText() {
   std::size_t close = mNext + 1;
   while (close < mText.size() && mText[close] != '"' && mText[close] != '\n')
-    close += WrittenLength(mText.substr(close));
+    close += mText[close] == '\\' ? WrittenLength(mText.substr(close)) : 1;
   if (close == mText.size() || mText[close] == '\n') {
     const std::size_t length = mText.substr(mNext, close - mNext).find_last_not_of("\r \t") + 1;
     mDiagnostics.Error(Here(length), "the text has no closing quote on its line");

@@ -128,12 +128,15 @@ Status Relations::Ordered(int x, int y, bool strict) {
     if (strict) NarrowBeyondEnds(x, y);
     return Status::Fixpoint;
   }
-  const ZORString lowest = mStore[x].LowestText(), highest = mStore[y].HighestText();
-  const ZORString from = mStore[x].HighestText(), to = mStore[y].LowestText();
-  if (strict ? from < to : from <= to) return Status::Subsumed;
-  CutAbove(x, highest, strict);
-  if (!mStore.HasFailed()) CutBelow(y, lowest, strict);
+  const Ends left = EndsOf(x), right = EndsOf(y);
+  if (strict ? left.highest < right.lowest : left.highest <= right.lowest) return Status::Subsumed;
+  CutAbove(x, left, right.highest, strict);
+  if (!mStore.HasFailed()) CutBelow(y, right, left.lowest, strict);
   return Status::Fixpoint;
+}
+
+Relations::Ends Relations::EndsOf(int variable) const {
+  return {mStore[variable].LowestText(), mStore[variable].HighestText()};
 }
 
 // No text is less than the least one, and none greater than the greatest.
@@ -150,24 +153,22 @@ void Relations::NarrowBeyondEnds(int x, int y) {
   }
 }
 
-void Relations::CutAbove(int target, const ZORString& bound, bool strict) {
-  const ZORString lowest = mStore[target].LowestText(), highest = mStore[target].HighestText();
-  if (strict ? highest < bound : highest <= bound) return;
+void Relations::CutAbove(int target, const Ends& ends, const ZORString& bound, bool strict) {
+  if (strict ? ends.highest < bound : ends.highest <= bound) return;
   mStore.StartOperation(Operation::LessOrEqual);
   mStore.Edit(target, [&](Value& value) {
-    if (bound < lowest) return value.Any().SetNilValue();
-    if (bound < highest) value.Text().CalcLessOrEqualValue(Bound(bound).Any());
+    if (bound < ends.lowest) return value.Any().SetNilValue();
+    if (bound < ends.highest) value.Text().CalcLessOrEqualValue(Bound(bound).Any());
     if (strict) RemoveFrom(value, bound);
   });
 }
 
-void Relations::CutBelow(int target, const ZORString& bound, bool strict) {
-  const ZORString lowest = mStore[target].LowestText(), highest = mStore[target].HighestText();
-  if (strict ? lowest > bound : lowest >= bound) return;
+void Relations::CutBelow(int target, const Ends& ends, const ZORString& bound, bool strict) {
+  if (strict ? ends.lowest > bound : ends.lowest >= bound) return;
   mStore.StartOperation(Operation::NotLess);
   mStore.Edit(target, [&](Value& value) {
-    if (highest < bound) return value.Any().SetNilValue();
-    if (lowest < bound) RaiseTo(LeastFrom(target, bound), value);
+    if (ends.highest < bound) return value.Any().SetNilValue();
+    if (ends.lowest < bound) RaiseTo(LeastFrom(target, bound), value);
     if (strict) RemoveFrom(value, bound);
   });
 }

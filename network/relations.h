@@ -15,6 +15,10 @@ class Relations {
   Status Narrow(const Constraint& constraint);
 
  private:
+  struct Ends {
+    ZORString lowest, highest;
+  };
+
   Status Post(Meaning meaning, int x, int y);
   Status Equal(int x, int y);
   Status Unequal(int x, int y);
@@ -25,8 +29,9 @@ class Relations {
   void Equate(int target, int other);
   void Remove(int target, const ZORString& text);
   void NarrowBeyondEnds(int x, int y);
-  void CutAbove(int target, const ZORString& bound, bool strict);
-  void CutBelow(int target, const ZORString& bound, bool strict);
+  Ends EndsOf(int variable) const;
+  void CutAbove(int target, const Ends& ends, const ZORString& bound, bool strict);
+  void CutBelow(int target, const Ends& ends, const ZORString& bound, bool strict);
   void RaiseTo(const ZORString& bound, Value& value);
   ZORString LeastFrom(int variable, const ZORString& bound);
   void RemoveFrom(Value& value, const ZORString& text);

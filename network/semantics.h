@@ -74,6 +74,7 @@ class Semantics {
   Answers Filter(const Constraint& constraint, std::size_t position, std::span<const Exact> values,
                  std::vector<Answer>& proposals);
   bool ComputeTextForm(const Exact& value, Answer& result);
+  static ZORString Joined(const ZORString& x, const ZORString& y);
   ZORString Fold(Meaning meaning, const ZORString& x, const ZORString& y);
   ZORString FoldOthers(Meaning meaning, std::span<const Exact> inputs, std::size_t except);
   Value& FormOf(Sort sort);

@@ -122,9 +122,10 @@ std::vector<ZORString> Value::Texts() const {
   std::vector<ZORString> texts{LowestText()};
   const std::size_t count = mSort == Sort::Text ? 1 : mValue->GetCardinality();
   texts.reserve(count);
+  static const ZORString kBelowAlphabet("\x01");
+  ZORString between;
   while (texts.size() + 1 < count) {
-    ZORString between(texts.back());
-    between.Append(ZORString("\x01"));
+    between.Concatenate(texts.back(), kBelowAlphabet);
     texts.push_back(Text().GetNextExactValue(between));
   }
   if (count > 1) texts.push_back(HighestText());

@@ -37,7 +37,7 @@ Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(ty
 
 const Listing& Store::List(int variable) {
   if (mListed[static_cast<std::size_t>(variable)] == 0) KeepListing(variable, ListingOf(variable));
-  return mListings[static_cast<std::size_t>(variable)];
+  return *mListings[static_cast<std::size_t>(variable)];
 }
 
 Listing Store::ListingOf(int variable) const {
@@ -62,7 +62,12 @@ Listing Store::ListingOf(int variable) const {
 void Store::KeepListing(int variable, Listing listing) {
   mKept.push_back(variable);
   mKeptValues += 1 + listing.texts.size() + listing.numbers.size();
-  mListings[static_cast<std::size_t>(variable)] = std::move(listing);
+  Hold(variable, std::move(listing));
+}
+
+void Store::Hold(int variable, Listing listing) {
+  std::unique_ptr<Listing>& held = mListings[static_cast<std::size_t>(variable)];
+  held != nullptr ? void(*held = std::move(listing)) : void(held = std::make_unique<Listing>(std::move(listing)));
   mListed[static_cast<std::size_t>(variable)] = 1;
 }
 
@@ -70,7 +75,7 @@ void Store::KeepListing(int variable, Listing listing) {
 void Store::ForgetListings() {
   for (const int variable : mKept) {
     if (HasCandidates(variable)) continue;
-    mListings[static_cast<std::size_t>(variable)] = Listing();
+    mListings[static_cast<std::size_t>(variable)].reset();
     mListed[static_cast<std::size_t>(variable)] = 0;
   }
   mKept.clear();
@@ -88,7 +93,7 @@ std::vector<ZORString> Store::TextsOf(int variable) const {
 }
 
 std::size_t Store::Count(int variable) const {
-  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)].count;
+  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)]->count;
   const Value& value = (*this)[variable];
   const bool isListed = value.IsKnown() || (value.Sort() == Sort::Boolean && value.IsUndefined());
   return isListed ? value.Any().GetCardinality() : 0;
@@ -219,25 +224,25 @@ std::vector<LimitMet> Store::LimitsMet() const {
 }
 
 std::int64_t Store::LowestNumber(int variable) const {
-  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)].numbers.front();
+  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)]->numbers.front();
   return (*this)[variable].LowestNumber();
 }
 
 std::int64_t Store::HighestNumber(int variable) const {
-  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)].numbers.back();
+  if (HasCandidates(variable)) return mListings[static_cast<std::size_t>(variable)]->numbers.back();
   return (*this)[variable].HighestNumber();
 }
 
 bool Store::HasCandidates(int variable) const {
   const auto at = static_cast<std::size_t>(variable);
   const Sort sort = mValues[at].Sort();
-  return (sort == Sort::Text || sort == Sort::Integer) && mListed[at] != 0 && mListings[at].known &&
+  return (sort == Sort::Text || sort == Sort::Integer) && mListed[at] != 0 && mListings[at]->known &&
          mValues[at].IsUndefined();
 }
 
 bool Store::IsCandidate(int variable, const Value& outcome) const {
   if (outcome.IsNil()) return true;
-  const Listing& candidates = mListings[static_cast<std::size_t>(variable)];
+  const Listing& candidates = *mListings[static_cast<std::size_t>(variable)];
   if (outcome.Sort() == Sort::Text)
     return std::binary_search(candidates.texts.begin(), candidates.texts.end(), outcome.LowestText());
   return std::binary_search(candidates.numbers.begin(), candidates.numbers.end(), outcome.LowestNumber());
@@ -245,7 +250,7 @@ bool Store::IsCandidate(int variable, const Value& outcome) const {
 
 // Of a single integer, by an outcome of another sort of integers.
 std::vector<ZORLong> Store::CandidatesIn(int variable, const Value& outcome) const {
-  std::vector<ZORLong> numbers = mListings[static_cast<std::size_t>(variable)].numbers;
+  std::vector<ZORLong> numbers = mListings[static_cast<std::size_t>(variable)]->numbers;
   std::erase_if(numbers, [&](ZORLong n) { return outcome.Integer().FindAtLeast(n) != n; });
   return numbers;
 }
@@ -296,7 +301,7 @@ void Store::MeetCandidates(int variable, Listing candidates) {
     Saved saved{variable, (*this)[variable], TakeCandidates(variable)};
     mTrail.push_back(std::move(saved));
   }
-  mListings[static_cast<std::size_t>(variable)] = std::move(candidates);
+  Hold(variable, std::move(candidates));
   Changed(variable, shown);
   if (hadNone) FitToShape(variable);
 }
@@ -351,16 +356,14 @@ void Store::FitToShape(int variable) {
 
 // Null when there are none. Until they come back the listing is not to be read.
 std::unique_ptr<Listing> Store::TakeCandidates(int variable) {
-  Listing& listing = mListings[static_cast<std::size_t>(variable)];
-  const bool single = listing.sort == Sort::Text || listing.sort == Sort::IntegerSet;
-  if (!single || !HasCandidates(variable)) return nullptr;
-  return std::make_unique<Listing>(std::move(listing));
+  if (!HasCandidates(variable)) return nullptr;
+  return std::make_unique<Listing>(std::move(*mListings[static_cast<std::size_t>(variable)]));
 }
 
 std::string Store::Show(int variable) const {
   if (const Shape* shape = HeldShape(variable)) return (*this)[variable].Show() + ": " + Describe(*shape);
   if (!HasCandidates(variable)) return (*this)[variable].Show();
-  const Listing& candidates = mListings[static_cast<std::size_t>(variable)];
+  const Listing& candidates = *mListings[static_cast<std::size_t>(variable)];
   Value all(mTypes, candidates.sort == Sort::Text ? Sort::TextSet : Sort::IntegerSet);
   candidates.sort == Sort::Text ? all.SetTexts(candidates.texts) : all.SetNumbers(candidates.numbers);
   return "one of " + all.Show();
@@ -393,8 +396,8 @@ void Store::Undo() {
   while (mTrail.size() > mark.values) {
     Saved& saved = mTrail.back();
     const auto at = static_cast<std::size_t>(saved.variable);
-    mListed[at] = saved.candidates != nullptr ? 1 : 0;
-    if (saved.candidates != nullptr) mListings[at] = std::move(*saved.candidates);
+    mListed[at] = 0;
+    if (saved.candidates != nullptr) Hold(saved.variable, std::move(*saved.candidates));
     mValues[at] = std::move(saved.value);
     mTrail.pop_back();
   }

@@ -139,6 +139,7 @@ class Store {
   Listing ListingOf(int variable) const;
   std::vector<ZORString> TextsOf(int variable) const;
   void KeepListing(int variable, Listing listing);
+  void Hold(int variable, Listing listing);
   void ForgetListings();
   static Measure MeasureOf(const Value& value);
   Former FormerOf(int variable);
@@ -159,9 +160,9 @@ class Store {
   const zornet::Model& mModel;
   std::vector<Value> mValues;
   std::vector<Value> mFresh;
-  std::vector<Listing> mListings;
-  std::vector<char> mListed;  // whether the listing is up to date
-  static constexpr std::size_t kMostKept = 1 << 18;
+  std::vector<std::unique_ptr<Listing>> mListings;  // of the variables that were listed
+  std::vector<char> mListed;                        // whether the listing is up to date
+  static constexpr std::size_t kMostKept = 1 << 16;
   std::vector<int> mKept;  // the variables that were listed since all listings were forgotten
   std::size_t mKeptValues = 0;
   std::vector<char> mChanged;  // whether the value is not as it was declared any more

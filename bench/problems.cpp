@@ -19,6 +19,10 @@ class Writer {
  public:
   Writer() { mProblem.smt = "(set-logic QF_S)\n"; }
 
+  // What is named from here on has names of its own.
+  void StartPart(const char* part) { mPart = part; }
+  std::string Name(const char* name, std::size_t number) const { return mPart + Numbered(name, number); }
+
   void Declare(const std::string& name, const std::string& type) {
     mProblem.network += fmt::format("var {}: {};\n", type, name);
     mProblem.smt += fmt::format("(declare-const {} String)\n", name);
@@ -44,6 +48,7 @@ class Writer {
 
  private:
   Problem mProblem;
+  std::string mPart;
 };
 
 Set Drawn(TextMaker& maker, std::size_t count, std::size_t length) {
@@ -54,16 +59,13 @@ Set Drawn(TextMaker& maker, std::size_t count, std::size_t length) {
 
 constexpr std::size_t kStep = 4;  // characters that go and come
 
-}  // namespace
-
-Problem Chain(std::size_t size) {
+void AddChain(Writer& writer, std::size_t size) {
   TextMaker maker(static_cast<unsigned int>(size));
-  Writer writer;
   std::string text = maker.Letters(16);
-  writer.Declare("v0", "string");
-  writer.Concatenation(Quoted(text), Quoted(""), "v0");
+  writer.Declare(writer.Name("v", 0), "string");
+  writer.Concatenation(Quoted(text), Quoted(""), writer.Name("v", 0));
   for (std::size_t i = 0; i < size / 2; ++i) {
-    const std::string v = Numbered("v", i), longer = Numbered("p", i), next = Numbered("v", i + 1);
+    const std::string v = writer.Name("v", i), longer = writer.Name("p", i), next = writer.Name("v", i + 1);
     writer.Declare(longer, "string");
     writer.Declare(next, "string");
     const std::string tail = maker.Letters(kStep);
@@ -71,14 +73,12 @@ Problem Chain(std::size_t size) {
     writer.Concatenation(Quoted(text.substr(0, kStep)), next, longer);
     text = (text + tail).substr(kStep);
   }
-  return writer.Finish();
 }
 
-Problem Sets(std::size_t size) {
+void AddSets(Writer& writer, std::size_t size) {
   TextMaker maker(static_cast<unsigned int>(size));
-  Writer writer;
   Set texts = Drawn(maker, 8, 2 * kStep);
-  writer.Declare("v0", texts);
+  writer.Declare(writer.Name("v", 0), texts);
   for (std::size_t i = 0; i < size / 2; ++i) {
     const Set tails = Drawn(maker, 4, kStep);
     Set heads, all;
@@ -92,25 +92,47 @@ Problem Sets(std::size_t size) {
     Set listed = Drawn(maker, 8, 2 * kStep);
     listed.insert(texts.begin(), texts.end());
 
-    writer.Declare(Numbered("p", i), "set string");
-    writer.Declare(Numbered("t", i), tails);
-    writer.Declare(Numbered("h", i), heads);
-    writer.Declare(Numbered("v", i + 1), listed);
-    writer.Concatenation(Numbered("v", i), Numbered("t", i), Numbered("p", i));
-    writer.Concatenation(Numbered("h", i), Numbered("v", i + 1), Numbered("p", i));
+    writer.Declare(writer.Name("p", i), "set string");
+    writer.Declare(writer.Name("t", i), tails);
+    writer.Declare(writer.Name("h", i), heads);
+    writer.Declare(writer.Name("v", i + 1), listed);
+    writer.Concatenation(writer.Name("v", i), writer.Name("t", i), writer.Name("p", i));
+    writer.Concatenation(writer.Name("h", i), writer.Name("v", i + 1), writer.Name("p", i));
   }
+}
+
+template <std::size_t kTexts>
+void AddOrder(Writer& writer, std::size_t size) {
+  TextMaker maker(static_cast<unsigned int>(size));
+  for (std::size_t i = 0; i <= size; ++i) {
+    Set texts = Drawn(maker, kTexts - 1, 8);
+    texts.insert(Numbered("m", 100000 + i));
+    writer.Declare(writer.Name("v", i), texts);
+    if (i > 0) writer.LessOrEqual(writer.Name("v", i - 1), writer.Name("v", i));
+  }
+}
+
+Problem Written(void (*add)(Writer&, std::size_t), std::size_t size) {
+  Writer writer;
+  add(writer, size);
   return writer.Finish();
 }
 
-Problem Order(std::size_t size) {
-  TextMaker maker(static_cast<unsigned int>(size));
+}  // namespace
+
+Problem Chain(std::size_t size) { return Written(AddChain, size); }
+Problem Sets(std::size_t size) { return Written(AddSets, size); }
+Problem Order(std::size_t size) { return Written(AddOrder<16>, size); }
+Problem SmallOrder(std::size_t size) { return Written(AddOrder<4>, size); }
+
+Problem Mix(std::size_t size) {
   Writer writer;
-  for (std::size_t i = 0; i <= size; ++i) {
-    Set texts = Drawn(maker, 15, 8);
-    texts.insert(Numbered("m", 100000 + i));
-    writer.Declare(Numbered("v", i), texts);
-    if (i > 0) writer.LessOrEqual(Numbered("v", i - 1), Numbered("v", i));
-  }
+  writer.StartPart("chain_");
+  AddChain(writer, size / 3);
+  writer.StartPart("sets_");
+  AddSets(writer, size / 3);
+  writer.StartPart("order_");
+  AddOrder<16>(writer, size / 3);
   return writer.Finish();
 }
 

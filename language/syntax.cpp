@@ -2,6 +2,8 @@
 
 #include <fmt/core.h>
 
+#include <algorithm>
+#include <initializer_list>
 #include <memory>
 #include <optional>
 #include <string>
@@ -32,6 +34,17 @@ bool IsReserved(std::string_view word) { return IsAmong(word, kTypes) || IsAmong
 
 Extent Join(Extent from, Extent to) { return {from.begin, to.End() - from.begin}; }
 
+bool AreTexts(std::span<const Word> words) {
+  return std::all_of(words.begin(), words.end(), [](const Word& word) { return word.type == Word::Text; });
+}
+
+std::vector<std::string> TextsOf(std::span<const Word> words) {
+  std::vector<std::string> texts;
+  texts.reserve(words.size());
+  for (const Word& word : words) texts.push_back(Unescaped(word.token));
+  return texts;
+}
+
 // Reads the items of one file.
 class Parser {
  public:
@@ -55,19 +68,23 @@ class Parser {
   void Include();
   void Constraint();
   void Output();
-  void Finish(const DeclarationSyntax& declaration);
+  void Finish(DeclarationSyntax& declaration);
   Range Value(DeclarationSyntax& declaration);
   Range Indices();
-  TypeSyntax Type();
+  TypeSyntax Type(bool ofTexts = true);
   TypeSyntax NamedType();
   TypeSyntax Basic();
   TypeSyntax Interval();
   Range Braces();
+  void ReadBraces();
   Range Lines(Extent word);
   Range LinesOf(std::size_t file);
   Range Rows();
   Range Members(Word (Parser::*member)());
-  Range Keep(const std::vector<Word>& words);
+  void ReadMembers(Word (Parser::*member)());
+  std::span<const Word> WordsFrom(std::size_t begin) const { return std::span(mWords).subspan(begin); }
+  Range KeepFrom(std::size_t begin);
+  Range Keep(std::initializer_list<Word> words) { return mSyntax.members.Keep({words.begin(), words.size()}); }
   Word Literal();
   Word Constant();
   Word Argument();
@@ -89,6 +106,7 @@ class Parser {
   Token mToken;  // the next
   Extent mLast;  // of the one before
   Token mDeclared;
+  std::vector<Word> mWords;  // of what is being read, members behind what they are members of
   std::optional<std::size_t> mIncluded;
   Syntax& mSyntax;
 };
@@ -96,6 +114,7 @@ class Parser {
 std::optional<std::size_t> Parser::ReadItem() {
   mDeclared = Token();
   mIncluded.reset();
+  mWords.clear();
   try {
     Item();
   } catch (const Unreadable&) {
@@ -137,9 +156,9 @@ Range Parser::Value(DeclarationSyntax& declaration) {
   return value;
 }
 
-void Parser::Finish(const DeclarationSyntax& declaration) {
+void Parser::Finish(DeclarationSyntax& declaration) {
   Expect(";", "at the end of the declaration");
-  mSyntax.declarations.push_back(declaration);
+  mSyntax.declarations.Add(std::move(declaration));
 }
 
 // set of string: NAME = SET;
@@ -157,7 +176,7 @@ void Parser::NamedSet() {
   const Token first = mToken;
   if (!first.Is("{") && !first.Is("lines") && first.type != Token::Number)
     Fail("a set: {\"a\", \"b\"}, lines(\"file\"), {1, 3} or 1..9");
-  declaration.type = Type();
+  declaration.type = Type(members.Is("string"));
   if (members.Is("string")) declaration.type.sort = Sort::TextSet;
   if (members.Is("int") && declaration.type.sort != Sort::Interval) declaration.type.sort = Sort::IntegerSet;
   Finish(declaration);
@@ -196,13 +215,22 @@ Range Parser::Indices() {
   return indices;
 }
 
-TypeSyntax Parser::Type() {
+// Texts that could be of that type need no words of their own: nothing can be wrong with them any more.
+TypeSyntax Parser::Type(bool ofTexts) {
   if (mToken.type == Token::Number) return Interval();
   const Token first = mToken;
   TypeSyntax type;
   if (first.Is("{")) {
-    type.members = Braces();
-    type.sort = mSyntax.Members(type.members).front().type == Word::Text ? Sort::TextSet : Sort::IntegerSet;
+    const std::size_t begin = mWords.size();
+    ReadBraces();
+    const auto words = WordsFrom(begin);
+    type.sort = words.front().type == Word::Text ? Sort::TextSet : Sort::IntegerSet;
+    if (ofTexts && AreTexts(words)) {
+      type.texts = TextsOf(words);
+      mWords.resize(begin);
+    } else {
+      type.members = KeepFrom(begin);
+    }
   } else {
     type = NamedType();
   }
@@ -244,11 +272,16 @@ TypeSyntax Parser::Basic() {
 }
 
 Range Parser::Braces() {
+  const std::size_t begin = mWords.size();
+  ReadBraces();
+  return KeepFrom(begin);
+}
+
+void Parser::ReadBraces() {
   Expect("{", "here");
   if (mToken.Is("}")) Fail("at least one text or integer between the braces");
-  const Range members = Members(&Parser::Constant);
+  ReadMembers(&Parser::Constant);
   Expect("}", "at the end of the set");
-  return members;
 }
 
 // Behind the word lines: a text on each line of a file.
@@ -269,26 +302,31 @@ Range Parser::Lines(Extent word) {
 }
 
 Range Parser::LinesOf(std::size_t file) {
-  std::vector<Word> lines;
+  const std::size_t begin = mWords.size();
   for (const Extent line : mSource.LinesOf(file)) {
-    lines.push_back({Word::Text, {Token::Line, line, mSource.Text(line)}});
-    CheckText(lines.back().token, mDiagnostics);
+    mWords.push_back({Word::Text, {Token::Line, line, mSource.Text(line)}});
+    CheckText(mWords.back().token, mDiagnostics);
   }
-  return Keep(lines);
+  return KeepFrom(begin);
 }
 
 Range Parser::Members(Word (Parser::*member)()) {
-  std::vector<Word> members{(this->*member)()};
-  while (mToken.Is(",")) {
-    Take();
-    members.push_back((this->*member)());
-  }
-  return Keep(members);
+  const std::size_t begin = mWords.size();
+  ReadMembers(member);
+  return KeepFrom(begin);
 }
 
-Range Parser::Keep(const std::vector<Word>& words) {
-  const Range range{mSyntax.members.size(), words.size()};
-  mSyntax.members.insert(mSyntax.members.end(), words.begin(), words.end());
+void Parser::ReadMembers(Word (Parser::*member)()) {
+  mWords.push_back((this->*member)());
+  while (mToken.Is(",")) {
+    Take();
+    mWords.push_back((this->*member)());
+  }
+}
+
+Range Parser::KeepFrom(std::size_t begin) {
+  const Range range = mSyntax.members.Keep(WordsFrom(begin));
+  mWords.resize(begin);
   return range;
 }
 
@@ -347,15 +385,16 @@ Word Parser::List() {
 }
 
 Range Parser::Rows() {
-  std::vector<Word> rows;
+  const std::size_t begin = mWords.size();
   Take();
   do {
-    Word& row = rows.emplace_back(Word{Word::List, mToken});
+    Word row{Word::List, mToken};
     row.members = Members(&Parser::Constant);
     row.token.extent = Join(row.token.extent, mLast);
+    mWords.push_back(row);
     Expect("|", "at the end of the row");
   } while (!mToken.Is("]"));
-  return Keep(rows);
+  return KeepFrom(begin);
 }
 
 Token Parser::NewName(std::string_view what) {
@@ -369,18 +408,18 @@ void Parser::Constraint() {
   Take();
   if (mToken.type != Token::Name) Fail("the name of a constraint");
   constraint.name = Take();
-  constraint.firstArgument = mSyntax.arguments.size();
+  constraint.firstArgument = mSyntax.arguments.Size();
   Expect("(", "behind the name of the constraint");
-  if (!mToken.Is(")")) mSyntax.arguments.push_back(Argument());
+  if (!mToken.Is(")")) mSyntax.arguments.Add(Argument());
   while (mToken.Is(",")) {
     Take();
-    mSyntax.arguments.push_back(Argument());
+    mSyntax.arguments.Add(Argument());
   }
-  constraint.arguments = mSyntax.arguments.size() - constraint.firstArgument;
+  constraint.arguments = mSyntax.arguments.Size() - constraint.firstArgument;
   const Token close = Expect(")", "behind the arguments");
   constraint.extent = Join(constraint.name.extent, close.extent);
   Expect(";", "at the end of the constraint");
-  mSyntax.constraints.push_back(constraint);
+  mSyntax.constraints.Add(constraint);
 }
 
 void Parser::Output() {
@@ -447,6 +486,15 @@ bool Parser::StartsLine(const Token& token) const {
 }
 
 }  // namespace
+
+Range WordStore::Keep(std::span<const Word> words) {
+  constexpr std::size_t kBlock = 256;
+  if (mBlocks.empty() || mBlocks.back().capacity() - mBlocks.back().size() < words.size())
+    mBlocks.emplace_back().reserve(std::max(kBlock, words.size()));
+  std::vector<Word>& block = mBlocks.back();
+  block.insert(block.end(), words.begin(), words.end());
+  return {block.data() + block.size() - words.size(), words.size()};
+}
 
 // The items of a file stand where it is included.
 Syntax Parse(Source& source, const Files& files, Diagnostics& diagnostics) {

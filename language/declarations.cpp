@@ -33,6 +33,7 @@ void SortUnique(std::vector<T>& values) {
 Named* Resolver::Introduce(const DeclarationSyntax& declaration) {
   const Token& name = declaration.name;
   const auto [known, isNew] = mNames.try_emplace(name.text, Named{declaration.what, name.extent});
+  mHasArrays = mHasArrays || known->second.IsArray();
   if (isNew) return &known->second;
   mDiagnostics.Error(name.extent, fmt::format("'{}' is declared already", name.text));
   mDiagnostics.Note(known->second.place, "here");

@@ -97,6 +97,7 @@ const Named* Resolver::Find(const Token& name) {
 }
 
 const Named* Resolver::FindArray(const Word& word) const {
+  if (!mHasArrays) return nullptr;
   const auto found = word.type == Word::Name ? mNames.find(word.token.text) : mNames.end();
   return found != mNames.end() && found->second.IsArray() ? &found->second : nullptr;
 }

@@ -99,6 +99,7 @@ class Resolver {
   std::vector<Argument> mArguments;  // of the constraint that is added
   std::size_t mListed = 0;           // in its list
   std::unordered_map<std::string_view, Named> mNames;
+  bool mHasArrays = false;
   std::unordered_set<std::string_view> mBroken;  // of these it was told already that something is wrong
   std::size_t mValues = 0;                       // of the limited ones
 };

@@ -38,12 +38,12 @@ std::string_view Describe(Takes takes) {
 }  // namespace
 
 void Resolver::Add(const ConstraintSyntax& syntax) {
-  const Kind* kind = FindKindFor(syntax);
+  const std::span<const Word> arguments = TakeArguments(syntax);
+  const Kind* kind = FindKindFor(syntax, arguments);
   if (kind == nullptr) return;
   mArguments.clear();
   mListed = 0;
   bool good = true;
-  const std::span<const Word> arguments = mSyntax.ArgumentsOf(syntax);
   for (std::size_t i = 0; i < arguments.size(); ++i) good = AddArgument(*kind, i, arguments[i]) && good;
   if (!good) return;
   try {
@@ -52,6 +52,16 @@ void Resolver::Add(const ConstraintSyntax& syntax) {
     RefuseExpression(*kind, arguments, error);
   }
   mRead.places.constraints.push_back(syntax.extent);
+}
+
+// They are good until the next call.
+std::span<const Word> Resolver::TakeArguments(const ConstraintSyntax& syntax) {
+  mWritten.clear();
+  for (std::size_t i = syntax.firstArgument; i < syntax.firstArgument + syntax.arguments; ++i) {
+    mWritten.push_back(mSyntax.arguments[i]);
+    mSyntax.arguments.Release(i);
+  }
+  return mWritten;
 }
 
 bool Resolver::AddArgument(const Kind& kind, std::size_t place, const Word& word) {
@@ -72,7 +82,7 @@ bool Resolver::AddList(const Kind& kind, std::size_t place, const Word& word) {
   Members members;
   bool good = true;
   if (word.type == Word::List) {
-    for (const Word& member : mSyntax.Members(word.members)) good = AddMember(kind, place, member, members) && good;
+    for (const Word& member : word.members.Words()) good = AddMember(kind, place, member, members) && good;
   } else if (const Named* const array = FindArray(word)) {
     good = AddArray(kind, place, word, *array, members);
   } else {
@@ -96,7 +106,7 @@ bool Resolver::AddArray(const Kind& kind, std::size_t place, const Word& word, c
   const std::int64_t size = array.last - array.first + 1;
   for (std::int64_t i = 0; i < size; ++i) {
     const bool constant = array.what == DeclarationSyntax::Constants;
-    const int variable = constant ? AddConstant(mSyntax.Members(array.constants)[static_cast<std::size_t>(i)])
+    const int variable = constant ? AddConstant(array.constants.Words()[static_cast<std::size_t>(i)])
                                   : array.index + static_cast<int>(i);
     if (!Fits(SortOf(variable), MemberOf(kind.takes[place])))
       return Refuse(kind, place, word, "an array of other values");
@@ -109,9 +119,9 @@ bool Resolver::AddRows(const Kind& kind, std::size_t place, const Word& word) {
   if (word.type != Word::Rows) return Refuse(kind, place, word, "none");
   Rows rows;
   bool good = true;
-  for (const Word& row : mSyntax.Members(word.members)) {
+  for (const Word& row : word.members.Words()) {
     std::vector<std::string>& texts = rows.rows.emplace_back();
-    for (const Word& member : mSyntax.Members(row.members)) {
+    for (const Word& member : row.members.Words()) {
       good = IsOf(member, Word::Text) && good;
       texts.push_back(Unescaped(member.token));
     }
@@ -147,8 +157,7 @@ bool Resolver::Refuse(const Kind& kind, std::size_t place, const Word& word, std
 }
 
 // Null when there is no constraint of that name, or when it takes another number of arguments.
-const Kind* Resolver::FindKindFor(const ConstraintSyntax& constraint) {
-  const std::span<const Word> arguments = mSyntax.ArgumentsOf(constraint);
+const Kind* Resolver::FindKindFor(const ConstraintSyntax& constraint, std::span<const Word> arguments) {
   const bool list = std::any_of(arguments.begin(), arguments.end(), [this](const Word& word) {
     return word.type == Word::List || FindArray(word) != nullptr;
   });

@@ -2,6 +2,7 @@
 #include <fmt/core.h>
 
 #include <algorithm>
+#include <functional>
 #include <iterator>
 #include <utility>
 
@@ -22,6 +23,7 @@ Word::Type MemberType(Sort sort) {
 
 template <class T>
 void SortUnique(std::vector<T>& values) {
+  if (std::adjacent_find(values.begin(), values.end(), std::greater_equal<>()) == values.end()) return;
   std::sort(values.begin(), values.end());
   values.erase(std::unique(values.begin(), values.end()), values.end());
 }
@@ -31,6 +33,7 @@ void SortUnique(std::vector<T>& values) {
 Named* Resolver::Introduce(const DeclarationSyntax& declaration) {
   const Token& name = declaration.name;
   const auto [known, isNew] = mNames.try_emplace(name.text, Named{declaration.what, name.extent});
+  mHasArrays = mHasArrays || known->second.IsArray();
   if (isNew) return &known->second;
   mDiagnostics.Error(name.extent, fmt::format("'{}' is declared already", name.text));
   mDiagnostics.Note(known->second.place, "here");
@@ -38,7 +41,7 @@ Named* Resolver::Introduce(const DeclarationSyntax& declaration) {
 }
 
 // No: the name is of no use.
-bool Resolver::Declare(const DeclarationSyntax& declaration, Named& named) {
+bool Resolver::Declare(DeclarationSyntax& declaration, Named& named) {
   switch (declaration.what) {
     case DeclarationSyntax::Variable:
       DeclareVariable(declaration, named);
@@ -53,20 +56,20 @@ bool Resolver::Declare(const DeclarationSyntax& declaration, Named& named) {
   return false;
 }
 
-void Resolver::DeclareSet(const DeclarationSyntax& declaration, Named& named) {
+void Resolver::DeclareSet(DeclarationSyntax& declaration, Named& named) {
   named.index = static_cast<int>(mSets.size());
   Variable variable{"", declaration.type.sort, {}, {}};
   SetType(declaration.type, variable);
   mSets.push_back(std::move(variable));
 }
 
-void Resolver::DeclareVariable(const DeclarationSyntax& declaration, Named& named) {
+void Resolver::DeclareVariable(DeclarationSyntax& declaration, Named& named) {
   Variable variable{std::string(declaration.name.text), declaration.type.sort, {}, {}};
   if (SetType(declaration.type, variable)) SetValue(declaration, variable);
   named.index = AddVariable(std::move(variable), declaration.name.extent);
 }
 
-bool Resolver::DeclareArray(const DeclarationSyntax& declaration, Named& named) {
+bool Resolver::DeclareArray(DeclarationSyntax& declaration, Named& named) {
   Variable variable{"", declaration.type.sort, {}, {}};
   if (!SetIndices(declaration, named) || !SetType(declaration.type, variable)) return false;
   const auto size = static_cast<std::size_t>(named.last - named.first + 1);
@@ -83,7 +86,7 @@ bool Resolver::DeclareConstants(const DeclarationSyntax& declaration, Named& nam
   if (!SetIndices(declaration, named)) return false;
   Variable all;
   named.constants = declaration.value;
-  if (!Collect(mSyntax.Members(declaration.value), MemberType(declaration.type.sort), all)) return false;
+  if (!Collect(declaration.value.Words(), MemberType(declaration.type.sort), all)) return false;
   const std::int64_t size = named.last - named.first + 1;
   if (static_cast<std::uint64_t>(size) == declaration.value.count) return true;
   mDiagnostics.Error(declaration.valueExtent,
@@ -92,7 +95,7 @@ bool Resolver::DeclareConstants(const DeclarationSyntax& declaration, Named& nam
 }
 
 bool Resolver::SetIndices(const DeclarationSyntax& declaration, Named& named) {
-  const std::span<const Word> ends = mSyntax.Members(declaration.indices);
+  const std::span<const Word> ends = declaration.indices.Words();
   named.first = ends[0].token.number;
   named.last = ends[1].token.number;
   if (named.first <= named.last) return true;
@@ -101,10 +104,12 @@ bool Resolver::SetIndices(const DeclarationSyntax& declaration, Named& named) {
   return false;
 }
 
-bool Resolver::SetType(const TypeSyntax& type, Variable& variable) {
+bool Resolver::SetType(TypeSyntax& type, Variable& variable) {
   if (type.name.type == Token::Name) return SetNamedType(type.name, variable);
+  variable.texts = std::move(type.texts);
+  SortUnique(variable.texts);
   if (type.members.count == 0) return true;
-  const std::span<const Word> members = mSyntax.Members(type.members);
+  const std::span<const Word> members = type.members.Words();
   if (members.front().token.type == Token::Line && !Spend(members.size(), type.extent)) return false;
   if (!Collect(members, MemberType(type.sort), variable)) return false;
   if (type.sort == Sort::Interval && members[0].token.number > members[1].token.number) {
@@ -144,31 +149,15 @@ bool Resolver::SetNamedType(const Token& name, Variable& variable) {
 bool Resolver::Collect(std::span<const Word> words, Word::Type expected, Variable& variable) {
   variable.texts.clear();
   variable.numbers.clear();
-  if (expected == Word::Text) return CollectTexts(words, variable.texts);
+  expected == Word::Text ? variable.texts.reserve(words.size()) : variable.numbers.reserve(words.size());
   for (const Word& word : words) {
     if (!IsOf(word, expected)) return false;
+    if (expected == Word::Text) variable.texts.push_back(Unescaped(word.token));
     if (expected == Word::Number) variable.numbers.push_back(static_cast<std::int32_t>(word.token.number));
     if (expected == Word::Truth) variable.numbers.push_back(word.token.Is("true") ? 1 : 0);
   }
+  SortUnique(variable.texts);
   SortUnique(variable.numbers);
-  return true;
-}
-
-// As they are written they are sorted at less cost, if they have no escapes.
-bool Resolver::CollectTexts(std::span<const Word> words, std::vector<std::string>& texts) {
-  mViews.clear();
-  for (const Word& word : words) {
-    if (!IsOf(word, Word::Text)) return false;
-    mViews.push_back(word.token.text);
-  }
-  texts.reserve(words.size());
-  if (std::any_of(words.begin(), words.end(), [](const Word& word) { return IsEscaped(word.token); })) {
-    for (const Word& word : words) texts.push_back(Unescaped(word.token));
-    SortUnique(texts);
-  } else {
-    SortUnique(mViews);
-    texts.assign(mViews.begin(), mViews.end());
-  }
   return true;
 }
 
@@ -197,7 +186,7 @@ bool Resolver::SetValue(const DeclarationSyntax& declaration, Variable& variable
     mDiagnostics.Note(declaration.type.extent, "the type is declared here");
     return false;
   }
-  const std::span<const Word> value = mSyntax.Members(declaration.value);
+  const std::span<const Word> value = declaration.value.Words();
   Variable given = variable;
   if (!Collect(value, MemberType(sort), given)) return false;
   for (const Word& word : value) {

@@ -2,6 +2,7 @@
 
 #include <fmt/core.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <filesystem>
@@ -27,15 +28,17 @@ std::string DiskFiles::Read(const std::string& path) const {
   if (fs::is_directory(path, error)) throw std::runtime_error("is a folder");
   std::ifstream in(path, std::ios::binary);
   if (!in) throw std::runtime_error(std::strerror(errno));
-  std::string text = ReadText(in);
+  const std::uintmax_t size = fs::file_size(path, error);
+  std::string text = ReadText(in, error ? 0 : size);
   if (in.bad()) throw std::runtime_error(std::strerror(errno));
   return text;
 }
 
 // In pieces, since some files have no end.
-std::string ReadText(std::istream& in) {
+std::string ReadText(std::istream& in, std::uintmax_t expected) {
   constexpr std::size_t kMegabyte = 1 << 20, kMostMegabytes = 256;
   std::string text;
+  text.reserve(static_cast<std::size_t>(std::min<std::uintmax_t>(expected, kMostMegabytes * kMegabyte)) + kMegabyte);
   for (std::size_t size = 0; in; text.resize(size)) {
     if (size > kMostMegabytes * kMegabyte)
       throw std::runtime_error(fmt::format("is larger than {} MB", kMostMegabytes));

@@ -1,6 +1,7 @@
 // The files that a model names.
 #pragma once
 
+#include <cstdint>
 #include <istream>
 #include <string>
 
@@ -25,7 +26,7 @@ class DiskFiles : public Files {
   std::string Read(const std::string& path) const override;
 };
 
-// All that is left, which is text of at most 256 MB.
-std::string ReadText(std::istream& in);
+// All that is left, which is text of at most 256 MB. Makes room for what is expected.
+std::string ReadText(std::istream& in, std::uintmax_t expected = 0);
 
 }  // namespace zornet

@@ -30,33 +30,40 @@ std::string_view Describe(Word::Type type) {
 }
 
 ReadModel Resolver::Resolve() {
-  const std::vector<DeclarationSyntax>& declarations = mSyntax.declarations;
-  mNames.reserve(declarations.size());
-  const std::size_t variables = declarations.size() + CountConstants();
-  mModel.Reserve(variables, mSyntax.constraints.size());
+  Blocks<DeclarationSyntax>& declarations = mSyntax.declarations;
+  mNames.reserve(declarations.Size());
+  const std::size_t variables = declarations.Size() + CountConstants();
+  mModel.Reserve(variables, mSyntax.constraints.Size());
   mRead.places.variables.reserve(variables);
-  mRead.places.constraints.reserve(mSyntax.constraints.size());
+  mRead.places.constraints.reserve(mSyntax.constraints.Size());
   std::vector<Named*> named;
-  named.reserve(declarations.size());
-  for (const DeclarationSyntax& declaration : declarations) named.push_back(Introduce(declaration));
-  for (std::size_t i = 0; i < declarations.size(); ++i) {
+  named.reserve(declarations.Size());
+  for (std::size_t i = 0; i < declarations.Size(); ++i) named.push_back(Introduce(declarations[i]));
+  for (std::size_t i = 0; i < declarations.Size(); ++i) {
     if (named[i] != nullptr && declarations[i].what == DeclarationSyntax::Set) DeclareSet(declarations[i], *named[i]);
   }
-  for (std::size_t i = 0; i < declarations.size(); ++i) {
-    if (named[i] == nullptr || Declare(declarations[i], *named[i])) continue;
-    mBroken.insert(declarations[i].name.text);
-    mNames.erase(declarations[i].name.text);
+  for (std::size_t i = 0; i < declarations.Size(); ++i) {
+    if (named[i] != nullptr && !Declare(declarations[i], *named[i])) {
+      mBroken.insert(declarations[i].name.text);
+      mNames.erase(declarations[i].name.text);
+    }
+    declarations.Release(i);
   }
-  for (const ConstraintSyntax& constraint : mSyntax.constraints) Add(constraint);
+  for (std::size_t i = 0; i < mSyntax.constraints.Size(); ++i) {
+    Add(mSyntax.constraints[i]);
+    mSyntax.constraints.Release(i);
+  }
   for (const Word& word : mSyntax.outputs) AddOutput(word);
-  mRead.places.embedded = mSyntax.embedded;
+  mRead.places.embedded = std::move(mSyntax.embedded);
   return std::move(mRead);
 }
 
 std::size_t Resolver::CountConstants() const {
-  const auto& words = mSyntax.arguments;
-  return static_cast<std::size_t>(
-      std::count_if(words.begin(), words.end(), [](const Word& word) { return word.type != Word::Name; }));
+  std::size_t constants = 0;
+  for (std::size_t i = 0; i < mSyntax.arguments.Size(); ++i) {
+    if (mSyntax.arguments[i].type != Word::Name) ++constants;
+  }
+  return constants;
 }
 
 void Resolver::AddOutput(const Word& word) {
@@ -90,6 +97,7 @@ const Named* Resolver::Find(const Token& name) {
 }
 
 const Named* Resolver::FindArray(const Word& word) const {
+  if (!mHasArrays) return nullptr;
   const auto found = word.type == Word::Name ? mNames.find(word.token.text) : mNames.end();
   return found != mNames.end() && found->second.IsArray() ? &found->second : nullptr;
 }
@@ -98,8 +106,8 @@ const Named* Resolver::FindArray(const Word& word) const {
 Word Resolver::Literal(const Word& word) const {
   const auto found = word.type == Word::Element ? mNames.find(word.token.text) : mNames.end();
   if (found == mNames.end() || found->second.what != DeclarationSyntax::Constants) return word;
-  const std::int64_t index = mSyntax.Members(word.members).front().token.number - found->second.first;
-  const std::span<const Word> constants = mSyntax.Members(found->second.constants);
+  const std::int64_t index = word.members.Words().front().token.number - found->second.first;
+  const std::span<const Word> constants = found->second.constants.Words();
   const bool within = index >= 0 && static_cast<std::uint64_t>(index) < constants.size();
   return within ? constants[static_cast<std::size_t>(index)] : word;
 }
@@ -108,7 +116,7 @@ Word Resolver::Literal(const Word& word) const {
 int Resolver::ElementOf(const Word& word) {
   const Named* const array = Find(word.token);
   if (array == nullptr) return kUnknown;
-  const Token& index = mSyntax.Members(word.members).front().token;
+  const Token& index = word.members.Words().front().token;
   const bool within = array->first <= index.number && index.number <= array->last;
   if (array->what == DeclarationSyntax::Variables && within)
     return array->index + static_cast<int>(index.number - array->first);
@@ -130,12 +138,11 @@ void Resolver::TellPlace(const Token& name, const Named& named) {
 
 std::string Resolver::Written(const Word& name) const {
   if (name.type == Word::Name) return fmt::format("'{}'", name.token.text);
-  return fmt::format("'{}[{}]'", name.token.text, mSyntax.Members(name.members).front().token.number);
+  return fmt::format("'{}[{}]'", name.token.text, name.members.Words().front().token.number);
 }
 
 ReadModel Read(Source& source, Diagnostics& diagnostics, const Files& files) {
-  const Syntax syntax = Parse(source, files, diagnostics);
-  ReadModel read = Resolver(syntax, diagnostics).Resolve();
+  ReadModel read = Resolver(Parse(source, files, diagnostics), diagnostics).Resolve();
   diagnostics.Sort();
   return read;
 }

@@ -8,6 +8,7 @@
 #include <string_view>
 #include <unordered_map>
 #include <unordered_set>
+#include <utility>
 #include <vector>
 
 #include "language/diagnostics.h"
@@ -35,8 +36,8 @@ struct Named {
 // Makes the model of what is written: first its names, then its constraints and outputs.
 class Resolver {
  public:
-  Resolver(const Syntax& syntax, Diagnostics& diagnostics) : mSyntax(syntax), mDiagnostics(diagnostics) {
-    for (const Token& token : syntax.broken) mBroken.insert(token.text);
+  Resolver(Syntax syntax, Diagnostics& diagnostics) : mSyntax(std::move(syntax)), mDiagnostics(diagnostics) {
+    for (const Token& token : mSyntax.broken) mBroken.insert(token.text);
   }
 
   ReadModel Resolve();
@@ -48,18 +49,17 @@ class Resolver {
 
   // Declarations.
   Named* Introduce(const DeclarationSyntax& declaration);
-  bool Declare(const DeclarationSyntax& declaration, Named& named);
-  void DeclareSet(const DeclarationSyntax& declaration, Named& named);
-  void DeclareVariable(const DeclarationSyntax& declaration, Named& named);
-  bool DeclareArray(const DeclarationSyntax& declaration, Named& named);
+  bool Declare(DeclarationSyntax& declaration, Named& named);
+  void DeclareSet(DeclarationSyntax& declaration, Named& named);
+  void DeclareVariable(DeclarationSyntax& declaration, Named& named);
+  bool DeclareArray(DeclarationSyntax& declaration, Named& named);
   bool DeclareConstants(const DeclarationSyntax& declaration, Named& named);
   bool SetIndices(const DeclarationSyntax& declaration, Named& named);
-  bool SetType(const TypeSyntax& type, Variable& variable);
+  bool SetType(TypeSyntax& type, Variable& variable);
   bool SetNamedType(const Token& name, Variable& variable);
   bool SetValue(const DeclarationSyntax& declaration, Variable& variable);
   bool IsAllowed(const Variable& variable, const Word& word) const;
   bool Collect(std::span<const Word> words, Word::Type expected, Variable& variable);
-  bool CollectTexts(std::span<const Word> words, std::vector<std::string>& texts);
   bool IsOf(const Word& word, Word::Type expected);
   bool Spend(std::size_t values, Extent place);
   int AddConstant(const Word& word);
@@ -67,6 +67,7 @@ class Resolver {
 
   // Constraints. What answers false or kUnknown has told an error.
   void Add(const ConstraintSyntax& syntax);
+  std::span<const Word> TakeArguments(const ConstraintSyntax& syntax);
   bool AddArgument(const Kind& kind, std::size_t place, const Word& word);
   bool AddList(const Kind& kind, std::size_t place, const Word& word);
   bool AddMember(const Kind& kind, std::size_t place, const Word& word, Members& members);
@@ -74,7 +75,7 @@ class Resolver {
   bool AddRows(const Kind& kind, std::size_t place, const Word& word);
   void RefuseExpression(const Kind& kind, std::span<const Word> arguments, const ExpressionError& error);
   bool Refuse(const Kind& kind, std::size_t place, const Word& word, std::string_view is);
-  const Kind* FindKindFor(const ConstraintSyntax& constraint);
+  const Kind* FindKindFor(const ConstraintSyntax& constraint, std::span<const Word> arguments);
   int VariableFor(const Kind& kind, std::size_t place, const Word& word);
   int VariableOf(const Kind& kind, std::size_t place, const Word& word);
 
@@ -89,15 +90,16 @@ class Resolver {
   std::string Written(const Word& name) const;
   Sort SortOf(int variable) const { return mModel.Variables()[static_cast<std::size_t>(variable)].sort; }
 
-  const Syntax& mSyntax;
+  Syntax mSyntax;  // given back while the model grows
   Diagnostics& mDiagnostics;
   ReadModel mRead;
   Model& mModel = mRead.model;
-  std::vector<Variable> mSets;           // those with a name: of each a variable that ranges over it
-  std::vector<std::string_view> mViews;  // of the texts that are collected
-  std::vector<Argument> mArguments;      // of the constraint that is added
-  std::size_t mListed = 0;               // in its list
+  std::vector<Variable> mSets;       // those with a name: of each a variable that ranges over it
+  std::vector<Word> mWritten;        // arguments of the constraint that is added
+  std::vector<Argument> mArguments;  // of the constraint that is added
+  std::size_t mListed = 0;           // in its list
   std::unordered_map<std::string_view, Named> mNames;
+  bool mHasArrays = false;
   std::unordered_set<std::string_view> mBroken;  // of these it was told already that something is wrong
   std::size_t mValues = 0;                       // of the limited ones
 };

@@ -2,6 +2,7 @@
 
 #include <fmt/core.h>
 
+#include <algorithm>
 #include <initializer_list>
 #include <memory>
 #include <optional>
@@ -33,6 +34,10 @@ bool IsReserved(std::string_view word) { return IsAmong(word, kTypes) || IsAmong
 
 Extent Join(Extent from, Extent to) { return {from.begin, to.End() - from.begin}; }
 
+bool AreTexts(std::span<const Word> words) {
+  return std::all_of(words.begin(), words.end(), [](const Word& word) { return word.type == Word::Text; });
+}
+
 // Reads the items of one file.
 class Parser {
  public:
@@ -56,20 +61,24 @@ class Parser {
   void Include();
   void Constraint();
   void Output();
-  void Finish(const DeclarationSyntax& declaration);
+  void Finish(DeclarationSyntax& declaration);
   Range Value(DeclarationSyntax& declaration);
   Range Indices();
-  TypeSyntax Type();
+  TypeSyntax Type(bool ofTexts = true);
   TypeSyntax NamedType();
   TypeSyntax Basic();
   TypeSyntax Interval();
   Range Braces();
+  void ReadBraces();
   Range Lines(Extent word);
   Range LinesOf(std::size_t file);
   Range Rows();
   Range Members(Word (Parser::*member)());
-  Range Keep(std::span<const Word> words);
-  Range Keep(std::initializer_list<Word> words) { return Keep(std::span(words.begin(), words.size())); }
+  void ReadMembers(Word (Parser::*member)());
+  std::vector<std::string> TextsOf(std::span<const Word> words);
+  std::span<const Word> WordsFrom(std::size_t begin) const { return std::span(mWords).subspan(begin); }
+  Range KeepFrom(std::size_t begin);
+  Range Keep(std::initializer_list<Word> words) { return mSyntax.members.Keep({words.begin(), words.size()}); }
   Word Literal();
   Word Constant();
   Word Argument();
@@ -91,15 +100,16 @@ class Parser {
   Token mToken;  // the next
   Extent mLast;  // of the one before
   Token mDeclared;
+  std::vector<Word> mWords;              // of what is being read, members behind what they are members of
+  std::vector<std::string_view> mViews;  // of texts that are put in order
   std::optional<std::size_t> mIncluded;
-  std::vector<Word> mPending;  // of lists that are not at their end
   Syntax& mSyntax;
 };
 
 std::optional<std::size_t> Parser::ReadItem() {
   mDeclared = Token();
   mIncluded.reset();
-  mPending.clear();
+  mWords.clear();
   try {
     Item();
   } catch (const Unreadable&) {
@@ -141,9 +151,9 @@ Range Parser::Value(DeclarationSyntax& declaration) {
   return value;
 }
 
-void Parser::Finish(const DeclarationSyntax& declaration) {
+void Parser::Finish(DeclarationSyntax& declaration) {
   Expect(";", "at the end of the declaration");
-  mSyntax.declarations.push_back(declaration);
+  mSyntax.declarations.Add(std::move(declaration));
 }
 
 // set of string: NAME = SET;
@@ -161,7 +171,7 @@ void Parser::NamedSet() {
   const Token first = mToken;
   if (!first.Is("{") && !first.Is("lines") && first.type != Token::Number)
     Fail("a set: {\"a\", \"b\"}, lines(\"file\"), {1, 3} or 1..9");
-  declaration.type = Type();
+  declaration.type = Type(members.Is("string"));
   if (members.Is("string")) declaration.type.sort = Sort::TextSet;
   if (members.Is("int") && declaration.type.sort != Sort::Interval) declaration.type.sort = Sort::IntegerSet;
   Finish(declaration);
@@ -200,13 +210,22 @@ Range Parser::Indices() {
   return indices;
 }
 
-TypeSyntax Parser::Type() {
+// Texts that could be of that type need no words of their own: nothing can be wrong with them any more.
+TypeSyntax Parser::Type(bool ofTexts) {
   if (mToken.type == Token::Number) return Interval();
   const Token first = mToken;
   TypeSyntax type;
   if (first.Is("{")) {
-    type.members = Braces();
-    type.sort = mSyntax.Members(type.members).front().type == Word::Text ? Sort::TextSet : Sort::IntegerSet;
+    const std::size_t begin = mWords.size();
+    ReadBraces();
+    const auto words = WordsFrom(begin);
+    type.sort = words.front().type == Word::Text ? Sort::TextSet : Sort::IntegerSet;
+    if (ofTexts && AreTexts(words)) {
+      type.texts = TextsOf(words);
+      mWords.resize(begin);
+    } else {
+      type.members = KeepFrom(begin);
+    }
   } else {
     type = NamedType();
   }
@@ -221,6 +240,24 @@ TypeSyntax Parser::Interval() {
   if (mToken.type != Token::Number) Fail("the upper end of the interval");
   const Word last = Constant();
   return {Sort::Interval, Keep({first, last}), {}, Join(first.token.extent, last.token.extent)};
+}
+
+// Texts without escapes are put in order as they are written, which costs less than later.
+std::vector<std::string> Parser::TextsOf(std::span<const Word> words) {
+  std::vector<std::string> texts;
+  texts.reserve(words.size());
+  mViews.clear();
+  for (const Word& word : words) {
+    if (IsEscaped(word.token)) break;
+    mViews.push_back(word.token.text);
+  }
+  if (mViews.size() == words.size()) {
+    std::sort(mViews.begin(), mViews.end());
+    texts.assign(mViews.begin(), mViews.end());
+  } else {
+    for (const Word& word : words) texts.push_back(Unescaped(word.token));
+  }
+  return texts;
 }
 
 TypeSyntax Parser::NamedType() {
@@ -248,11 +285,16 @@ TypeSyntax Parser::Basic() {
 }
 
 Range Parser::Braces() {
+  const std::size_t begin = mWords.size();
+  ReadBraces();
+  return KeepFrom(begin);
+}
+
+void Parser::ReadBraces() {
   Expect("{", "here");
   if (mToken.Is("}")) Fail("at least one text or integer between the braces");
-  const Range members = Members(&Parser::Constant);
+  ReadMembers(&Parser::Constant);
   Expect("}", "at the end of the set");
-  return members;
 }
 
 // Behind the word lines: a text on each line of a file.
@@ -273,29 +315,31 @@ Range Parser::Lines(Extent word) {
 }
 
 Range Parser::LinesOf(std::size_t file) {
-  std::vector<Word> lines;
+  const std::size_t begin = mWords.size();
   for (const Extent line : mSource.LinesOf(file)) {
-    lines.push_back({Word::Text, {line, mSource.Text(line), 0, Token::Line}});
-    CheckText(lines.back().token, mDiagnostics);
+    mWords.push_back({Word::Text, {line, mSource.Text(line), 0, Token::Line}});
+    CheckText(mWords.back().token, mDiagnostics);
   }
-  return Keep(lines);
+  return KeepFrom(begin);
 }
 
 Range Parser::Members(Word (Parser::*member)()) {
-  const std::size_t first = mPending.size();
-  mPending.push_back((this->*member)());
-  while (mToken.Is(",")) {
-    Take();
-    mPending.push_back((this->*member)());
-  }
-  const Range range = Keep(std::span(mPending).subspan(first));
-  mPending.resize(first);
-  return range;
+  const std::size_t begin = mWords.size();
+  ReadMembers(member);
+  return KeepFrom(begin);
 }
 
-Range Parser::Keep(std::span<const Word> words) {
-  const Range range{mSyntax.members.size(), words.size()};
-  mSyntax.members.insert(mSyntax.members.end(), words.begin(), words.end());
+void Parser::ReadMembers(Word (Parser::*member)()) {
+  mWords.push_back((this->*member)());
+  while (mToken.Is(",")) {
+    Take();
+    mWords.push_back((this->*member)());
+  }
+}
+
+Range Parser::KeepFrom(std::size_t begin) {
+  const Range range = mSyntax.members.Keep(WordsFrom(begin));
+  mWords.resize(begin);
   return range;
 }
 
@@ -354,15 +398,16 @@ Word Parser::List() {
 }
 
 Range Parser::Rows() {
-  std::vector<Word> rows;
+  const std::size_t begin = mWords.size();
   Take();
   do {
-    Word& row = rows.emplace_back(Word{Word::List, mToken});
+    Word row{Word::List, mToken};
     row.members = Members(&Parser::Constant);
     row.token.extent = Join(row.token.extent, mLast);
+    mWords.push_back(row);
     Expect("|", "at the end of the row");
   } while (!mToken.Is("]"));
-  return Keep(rows);
+  return KeepFrom(begin);
 }
 
 Token Parser::NewName(std::string_view what) {
@@ -376,18 +421,18 @@ void Parser::Constraint() {
   Take();
   if (mToken.type != Token::Name) Fail("the name of a constraint");
   constraint.name = Take();
-  constraint.firstArgument = mSyntax.arguments.size();
+  constraint.firstArgument = mSyntax.arguments.Size();
   Expect("(", "behind the name of the constraint");
-  if (!mToken.Is(")")) mSyntax.arguments.push_back(Argument());
+  if (!mToken.Is(")")) mSyntax.arguments.Add(Argument());
   while (mToken.Is(",")) {
     Take();
-    mSyntax.arguments.push_back(Argument());
+    mSyntax.arguments.Add(Argument());
   }
-  constraint.arguments = mSyntax.arguments.size() - constraint.firstArgument;
+  constraint.arguments = mSyntax.arguments.Size() - constraint.firstArgument;
   const Token close = Expect(")", "behind the arguments");
   constraint.extent = Join(constraint.name.extent, close.extent);
   Expect(";", "at the end of the constraint");
-  mSyntax.constraints.push_back(constraint);
+  mSyntax.constraints.Add(constraint);
 }
 
 void Parser::Output() {
@@ -454,6 +499,15 @@ bool Parser::StartsLine(const Token& token) const {
 }
 
 }  // namespace
+
+Range WordStore::Keep(std::span<const Word> words) {
+  constexpr std::size_t kBlock = 256;
+  if (mBlocks.empty() || mBlocks.back().capacity() - mBlocks.back().size() < words.size())
+    mBlocks.emplace_back().reserve(std::max(kBlock, words.size()));
+  std::vector<Word>& block = mBlocks.back();
+  block.insert(block.end(), words.begin(), words.end());
+  return {block.data() + block.size() - words.size(), words.size()};
+}
 
 // The items of a file stand where it is included.
 Syntax Parse(Source& source, const Files& files, Diagnostics& diagnostics) {

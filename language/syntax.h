@@ -2,9 +2,10 @@
 #pragma once
 
 #include <cstddef>
-#include <cstdint>
 #include <span>
+#include <string>
 #include <unordered_map>
+#include <utility>
 #include <vector>
 
 #include "language/diagnostics.h"
@@ -19,13 +20,37 @@ inline constexpr std::string_view kTypes[] = {"string", "set", "int", "bool"};
 inline constexpr std::string_view kAnyType =
     "a type: string, set string, {\"a\", \"b\"}, int, 1..9, {1, 3}, bool or the name of a set";
 
-// Neighbours in Syntax::members, which are fewer than the bytes of any source. Small, since a model may have millions.
-struct Range {
-  Range() = default;
-  Range(std::size_t from, std::size_t howMany)
-      : first(static_cast<std::uint32_t>(from)), count(static_cast<std::uint32_t>(howMany)) {}
+struct Word;
 
-  std::uint32_t first = 0, count = 0;
+// Neighbours that Syntax::members keeps.
+struct Range {
+  const Word* first = nullptr;
+  std::size_t count = 0;
+
+  std::span<const Word> Words() const;
+};
+
+// Grows without moving what it holds, and gives its memory back from the front.
+template <class T>
+class Blocks {
+ public:
+  void Add(T value) {
+    if (mSize++ % kBlock == 0) mBlocks.emplace_back().reserve(kBlock);
+    mBlocks.back().push_back(std::move(value));
+  }
+  std::size_t Size() const { return mSize; }
+  T& operator[](std::size_t i) { return mBlocks[i / kBlock][i % kBlock]; }
+  const T& operator[](std::size_t i) const { return mBlocks[i / kBlock][i % kBlock]; }
+  // The one at i and all before it are not needed any more.
+  void Release(std::size_t i) {
+    if ((i + 1) % kBlock == 0) mBlocks[i / kBlock] = {};
+  }
+
+ private:
+  static constexpr std::size_t kBlock = 128;
+
+  std::vector<std::vector<T>> mBlocks;
+  std::size_t mSize = 0;
 };
 
 // What stands where a value stands: a constant, a name, w[3], or in brackets a list or the rows of a table.
@@ -42,6 +67,7 @@ struct TypeSyntax {
   Range members = {};  // of a set; of an interval its two ends
   Token name = {};     // of a named set, else none
   Extent extent = {};
+  std::vector<std::string> texts = {};  // instead of the members, of a set in braces that holds nothing else
 };
 
 struct DeclarationSyntax {
@@ -62,20 +88,26 @@ struct ConstraintSyntax {
   Extent extent;
 };
 
+inline std::span<const Word> Range::Words() const { return {first, count}; }
+
+// Words that stay where they are.
+class WordStore {
+ public:
+  Range Keep(std::span<const Word> words);
+
+ private:
+  std::vector<std::vector<Word>> mBlocks;  // none grows beyond its room
+};
+
 struct Syntax {
-  std::vector<DeclarationSyntax> declarations;
-  std::vector<ConstraintSyntax> constraints;
-  std::vector<Word> arguments;  // of all constraints, one after another
-  std::vector<Word> members;
+  Blocks<DeclarationSyntax> declarations;
+  Blocks<ConstraintSyntax> constraints;
+  Blocks<Word> arguments;  // of all constraints, one after another
+  WordStore members;
   std::vector<Word> outputs;
   std::vector<Token> broken;                     // names whose declaration could not be read
   std::unordered_map<std::size_t, Range> lines;  // by file
   std::vector<Embedded> embedded;
-
-  std::span<const Word> ArgumentsOf(const ConstraintSyntax& constraint) const {
-    return std::span(arguments).subspan(constraint.firstArgument, constraint.arguments);
-  }
-  std::span<const Word> Members(Range range) const { return std::span(members).subspan(range.first, range.count); }
 };
 
 // Adds the files that it names to the source.

@@ -164,7 +164,8 @@ std::string Value::Show() const {
   std::string shown = greatest ? ShowWithMax() : Print();
   const std::size_t quoted = (mSort == Sort::Text ? 1 : mValue->GetCardinality()) - (greatest ? 1 : 0);
   const auto quotes = static_cast<std::size_t>(std::count(shown.begin(), shown.end(), '"'));
-  return quotes > 2 * quoted || shown.find('\\') != std::string::npos ? ShowEscaped() : shown;
+  if (quotes > 2 * quoted || shown.find('\\') != std::string::npos) return ShowEscaped();
+  return shown;
 }
 
 // Prints the greatest text of a set as Max: the union of the greatest value and the rest.

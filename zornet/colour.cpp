@@ -34,10 +34,10 @@ std::string_view Code(Style style) {
 
 }  // namespace
 
-std::string Paint::operator()(Style style, std::string_view text) const {
+std::string Paint::operator()(Style style, std::string text) const {
   const std::string_view code = Code(style);
-  if (!mOn || code.empty()) return std::string(text);
-  return "\x1b[" + std::string(code) + "m" + std::string(text) + "\x1b[0m";
+  if (!mOn || code.empty()) return text;
+  return "\x1b[" + std::string(code) + "m" + text + "\x1b[0m";
 }
 
 bool WantsColour(std::string_view when, int fileDescriptor) {

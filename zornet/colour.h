@@ -12,7 +12,7 @@ enum class Style { Plain, Bold, Faint, Error, Note, Caret, Name, Known, Open };
 class Paint {
  public:
   explicit Paint(bool on) : mOn(on) {}
-  std::string operator()(Style style, std::string_view text) const;
+  std::string operator()(Style style, std::string text) const;
 
  private:
   bool mOn;

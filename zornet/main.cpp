@@ -1,3 +1,5 @@
+#include <unistd.h>
+
 #include <cstdio>
 #include <cstdlib>
 #include <iostream>
@@ -25,6 +27,8 @@ bool sTellsJson = false;
 
 int main(int argc, char** argv) {
   std::set_new_handler(EndWithoutMemory);
+  // Written in large pieces where nobody waits for single lines. A solution is flushed when it is found.
+  if (isatty(STDOUT_FILENO) == 0) std::ios::sync_with_stdio(false);
   int exitCode = 0;
   try {
     const auto options = zornet::ReadOptions(argc, argv, exitCode);

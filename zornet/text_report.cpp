@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <span>
+#include <utility>
 
 #include "zornet/colour.h"
 #include "zornet/limits.h"
@@ -79,7 +80,9 @@ std::string TextReport::Shown(const Domain& domain) const {
                       : domain.IsOne()   ? Style::Known
                       : domain.IsKnown() ? Style::Open
                                          : Style::Faint;
-  return mPaint(style, domain.HasShape() ? domain.Print() + ": " + domain.PrintShape() : domain.Print());
+  std::string shown = domain.Print();
+  if (domain.HasShape()) shown += ": " + domain.PrintShape();
+  return mPaint(style, std::move(shown));
 }
 
 void TextReport::Show(const Network& network, const LimitsByVariable& limits) {

@@ -7,7 +7,8 @@ namespace zornet {
 
 namespace {
 
-Value Initial(const Types& types, const Variable& variable) {
+// texts: room for those of the variable.
+Value Initial(const Types& types, const Variable& variable, std::vector<ZORString>& texts) {
   Value value(types, variable.sort);
   if (variable.texts.empty() && variable.numbers.empty()) return value;
   if (!IsText(variable.sort)) {
@@ -15,8 +16,7 @@ Value Initial(const Types& types, const Variable& variable) {
   } else if (variable.sort == Sort::Text) {
     value.SetText(ToZor(variable.texts.front()));
   } else {
-    std::vector<ZORString> texts;
-    texts.reserve(variable.texts.size());
+    texts.clear();
     for (const std::string& text : variable.texts) texts.push_back(ToZor(text));
     value.SetTexts(texts);
   }
@@ -27,7 +27,8 @@ Value Initial(const Types& types, const Variable& variable) {
 
 Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(types), mModel(model) {
   mValues.reserve(model.Variables().size());
-  for (const Variable& variable : model.Variables()) mValues.push_back(Initial(types, variable));
+  std::vector<ZORString> texts;
+  for (const Variable& variable : model.Variables()) mValues.push_back(Initial(types, variable, texts));
   mChanged.resize(mValues.size(), 0);
   for (int i = 0; i < kSorts; ++i) mFresh.emplace_back(types, static_cast<Sort>(i));
   mListings.resize(mValues.size());

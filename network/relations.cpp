@@ -163,11 +163,11 @@ void Relations::CutAbove(int target, const Ends& ends, const ZORString& bound, b
   });
 }
 
+// After CutAbove has left something to x, y has a text from bound on.
 void Relations::CutBelow(int target, const Ends& ends, const ZORString& bound, bool strict) {
   if (strict ? ends.lowest > bound : ends.lowest >= bound) return;
   mStore.StartOperation(Operation::NotLess);
   mStore.Edit(target, [&](Value& value) {
-    if (ends.highest < bound) return value.Any().SetNilValue();
     if (ends.lowest < bound) RaiseTo(LeastFrom(target, bound), value);
     if (strict) RemoveFrom(value, bound);
   });

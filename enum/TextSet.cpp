@@ -32,9 +32,7 @@ void TextSet::Reserve(unsigned int places) {
   mVector.Swap(first);
 }
 
-void TextSet::DeleteAll() {
-  for (const ZORString* const text : All()) delete text;
-}
+void TextSet::DeleteAll() { ZORString::DeleteAll(PlacesOf(mVector), Count()); }
 
 unsigned int TextSet::CountLessOrEqual(const ZORString& bound) const {
   const std::span<const ZORString* const> texts = All();

@@ -30,12 +30,3 @@ ZORVaDoObject* CreateAt(void* place, From... from) {
 #define ZOR_DEFINE_DERIVATION(Class, Base)                                                                    \
   int Class::IsDerivedFrom(const char* ident) const { return ident == sIdent || Base::IsDerivedFrom(ident); } \
   static_assert(true)
-
-#define ZOR_DEFINE_CASTS(Class, Base)                                              \
-  Class* Class::DynamicCast(ZORVaDoBase* object) {                                 \
-    return IsKindOf(object, sIdent) ? static_cast<Class*>(object) : nullptr;       \
-  }                                                                                \
-  const Class* Class::DynamicCast(const ZORVaDoBase* object) {                     \
-    return IsKindOf(object, sIdent) ? static_cast<const Class*>(object) : nullptr; \
-  }                                                                                \
-  ZOR_DEFINE_DERIVATION(Class, Base)

@@ -5,7 +5,7 @@
 
 #define ZOR_DEFINE_TYPE_TEST(Class, Base)   \
   const char* const Class::sIdent = #Class; \
-  ZOR_DEFINE_CASTS(Class, Base)
+  ZOR_DEFINE_DERIVATION(Class, Base)
 
 #define ZOR_DEFINE_NUMBER_CLASS(Class, Base, displayName, parent)                                                      \
   ZOR_DEFINE_TYPE_TEST(Class, Base);                                                                                   \

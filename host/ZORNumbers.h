@@ -18,14 +18,12 @@
 
 class ZORIntegerSet;
 
-// DynamicCast returns null for null and for an object of another class.
-#define ZOR_DECLARE_TYPE_TEST(Class)                          \
- public:                                                      \
-  static const char* const sIdent;                            \
-  static Class* DynamicCast(ZORVaDoBase* object);             \
-  static const Class* DynamicCast(const ZORVaDoBase* object); \
-                                                              \
- protected:                                                   \
+#define ZOR_DECLARE_TYPE_TEST(Class) \
+ public:                             \
+  static const char* const sIdent;   \
+  ZOR_DECLARE_CASTS(Class);          \
+                                     \
+ protected:                          \
   int IsDerivedFrom(const char* ident) const override
 
 // A concrete class. sDescriptor is never null.

@@ -45,6 +45,16 @@ class ZOR_EXPORT ZORVaDoBase : public ZORStreamable {
   virtual int IsDerivedFrom(const char* ident) const;
 };
 
+// Casts of a class with an sIdent; null for null and for an object of another class.
+#define ZOR_DECLARE_CASTS(Class)                                                   \
+  static Class* DynamicCast(ZORVaDoBase* object) {                                 \
+    return IsKindOf(object, sIdent) ? static_cast<Class*>(object) : nullptr;       \
+  }                                                                                \
+  static const Class* DynamicCast(const ZORVaDoBase* object) {                     \
+    return IsKindOf(object, sIdent) ? static_cast<const Class*>(object) : nullptr; \
+  }                                                                                \
+  static_assert(true)
+
 // An object of the solver's network. Activate, ActivateByArgument and Filter do nothing unless a class overrides them.
 class ZOR_EXPORT ZORVaDoObject : public ZORVaDoBase {
  public:

@@ -52,12 +52,14 @@ class ZOR_EXPORT ZORString {
   ZORString& operator=(const ZORString& other);
   ZORString& operator=(ZORString&& other) noexcept;
 
-  // Never null. A thread keeps the memory of the strings it deletes for its next ones, 3 MB at most, until it ends.
+  // Never null. What a thread deletes serves its next strings, and those of other threads when there is much of it.
   static void* operator new(std::size_t size);
   static void* operator new(std::size_t, void* place) noexcept { return place; }
   static void operator delete(void* memory, std::size_t size) noexcept;
-  // For programs that count or refuse allocations: keeps no memory for the calling thread any more, nor for threads
-  // that have not yet deleted a string; or keeps it again. Answers whether it is kept; with sanitizers it never is.
+  static void DeleteAll(ZORString* const* strings, std::size_t count) noexcept;  // some may be null
+  // For programs that count or refuse allocations: new strings of the calling thread, and of threads that have had none
+  // yet, are blocks of the global operator new; or they are not any more. Answers whether memory is kept; with
+  // sanitizers it never is.
   static bool KeepFreed(bool keep);
 
   bool operator==(const ZORString& other) const;
@@ -190,11 +192,9 @@ inline ZORString ZORString::Concatenation(const ZORString& head, const ZORString
 
 inline bool ZORString::IsConcatenation(const ZORString& head, const ZORString& tail) const {
   if (std::uint64_t{head.mLength} + tail.mLength != mLength) return false;
-  if (mCapacity != kInside || !AreInside(head, tail))
-    return View().substr(0, head.mLength) == head.View() && View().substr(head.mLength) == tail.View();
-  char joined[2 * kRoom];
-  JoinRooms(head, tail, joined);
-  return std::memcmp(joined, mInside, kRoom) == 0;
+  const char* const text = CastToCharPtr();
+  return std::memcmp(text, head.CastToCharPtr(), head.mLength) == 0 &&
+         std::memcmp(text + head.mLength, tail.CastToCharPtr(), tail.mLength) == 0;
 }
 
 class ZORipstream;

@@ -24,8 +24,7 @@
   static const char* const CastableIdent;                                                                 \
   static const Descriptor* sDescriptor;                                                                   \
   static const Descriptor* MakeDescriptor();                                                              \
-  static Class* DynamicCast(ZORVaDoBase* object);                                                         \
-  static const Class* DynamicCast(const ZORVaDoBase* object);                                             \
+  ZOR_DECLARE_CASTS(Class);                                                                               \
   static Class* StaticCast(ZORVaDoBase* object) { return static_cast<Class*>(object); }                   \
   static const Class* StaticCast(const ZORVaDoBase* object) { return static_cast<const Class*>(object); } \
   static ZORipstream& readPtr(ZORipstream& in, Class*& object);                                           \

@@ -30,7 +30,7 @@ ZORStreamable* BuildRecorded(ZORStreamable* object) {
   const Class::Descriptor* Class::MakeDescriptor() {                                                                   \
     return sDescriptor = new Descriptor(ZORString(displayName), parent, flag);                                         \
   }                                                                                                                    \
-  ZOR_DEFINE_CASTS(Class, Base);                                                                                       \
+  ZOR_DEFINE_DERIVATION(Class, Base);                                                                                  \
   ZORipstream& Class::readPtr(ZORipstream& in, Class*& object) {                                                       \
     ZORStreamable* const read = in.ReadObjectPointer();                                                                \
     object = DynamicCast(ZORVaDoBase::FromStream(read));                                                               \

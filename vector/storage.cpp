@@ -139,8 +139,10 @@ int ZORISVectorImp_String::Detach(const ZORString* s, int del) { return DetachAt
 int ZORISVectorImp_String::DetachAt(unsigned int pos, unsigned int count, int del) {
   if (mItems == nullptr || pos >= mLimit) return 0;
   const unsigned int end = pos + std::min(count, mLimit - pos);
-  if (del != 0)
-    for (unsigned int i = pos; i < end; ++i) delete std::exchange(mItems[i], nullptr);
+  if (del != 0) {
+    ZORString::DeleteAll(mItems + pos, end - pos);
+    std::fill(mItems + pos, mItems + end, nullptr);
+  }
   if (pos >= mTop) {
     Zero(pos, end);
     return 1;

@@ -2,6 +2,7 @@
 // one source file of a program.
 #pragma once
 
+#include <atomic>
 #include <cstddef>
 #include <cstdlib>
 #include <new>
@@ -16,7 +17,7 @@ constexpr std::size_t kTooMuch = std::size_t{1} << 30;        // no test may ask
 inline const bool sKeepsFreed = ZORString::KeepFreed(false);  // or texts would not be seen
 inline int sRefused = kNone;                                  // how many can be had before one is refused
 inline bool sWasRefused = false;
-inline std::ptrdiff_t sLive = 0;
+inline std::atomic<std::ptrdiff_t> sLive = 0;
 inline std::vector<void*>* sDeletions = nullptr;  // of single objects, while set and as many as it has places for
 
 template <class Run>

@@ -1,10 +1,12 @@
 // Memory that cannot be had, one allocation after the other: where null or 0 is promised it comes, nothing leaks and
 // nothing is half changed; a text or a set that cannot be had ends the process with a message.
 #include <gtest/gtest.h>
+#include <unistd.h>
 
 #include <climits>
 #include <csignal>
 #include <cstdio>
+#include <fstream>
 #include <functional>
 #include <memory>
 #include <string>
@@ -34,6 +36,12 @@ bool DeleteDescriptor() {
   return former != nullptr;
 }
 
+std::size_t ResidentBytes() {
+  std::size_t all = 0, resident = 0;
+  std::ifstream("/proc/self/statm") >> all >> resident;
+  return resident * static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
+}
+
 // A class makes its descriptor, or answers null and has none, not even the one that it had.
 template <class Class>
 void RemakeDescriptor() {
@@ -56,23 +64,46 @@ void Init() {
   EXPECT_EQ(made < 3, sWasRefused);
 }
 
-// What a thread deletes is kept for its next texts, up to a limit, and given back when it ends, whoever made it.
+// Texts that threads make, delete and make again for each other share no memory, which does not grow.
 TEST(Refused, KeptTexts) {
   if (!ZORString::KeepFreed(true)) GTEST_SKIP() << "freed texts are not kept under a sanitizer";
-  constexpr int kKept = 65536;
-  std::vector<ZORString*> texts(kKept + 100);
+  constexpr std::size_t kThreads = 3, kTexts = 300000, kRounds = 4;
+  std::vector<ZORString*> texts(kTexts);
+  const auto each = [&](std::size_t thread, auto change) {
+    for (std::size_t i = thread; i < kTexts; i += kThreads) change(i);
+  };
+  const auto remake = [&](std::size_t thread, std::size_t round) {
+    each((thread + round) % kThreads, [&](std::size_t i) { delete texts[i]; });
+    each((thread + round) % kThreads, [&](std::size_t i) { texts[i] = new ZORString(std::to_string(i * round)); });
+  };
   const std::ptrdiff_t atFirst = sLive;
-  for (ZORString*& text : texts) text = new ZORString("text");
-  std::thread([&] {
-    const std::ptrdiff_t before = sLive - std::ssize(texts);
-    for (const ZORString* const text : texts) delete text;
-    EXPECT_EQ(sLive - before, kKept);
-    for (ZORString*& text : texts) text = new ZORString("text");
-    EXPECT_EQ(sLive - before, std::ssize(texts));
-    for (const ZORString* const text : texts) delete text;
-  }).join();
+  const std::size_t before = ResidentBytes();
+  for (std::size_t round = 1; round <= kRounds; ++round) {
+    std::vector<std::thread> threads;
+    for (std::size_t thread = 1; thread < kThreads; ++thread) threads.emplace_back(remake, thread, round);
+    remake(0, round);
+    for (std::thread& thread : threads) thread.join();
+    for (std::size_t i = 0; i < kTexts; ++i) ASSERT_EQ(*texts[i], std::to_string(i * round).c_str());
+  }
   EXPECT_EQ(sLive, atFirst);
+  EXPECT_LT(ResidentBytes(), before + 2 * kTexts * sizeof(ZORString));
+  ZORString::DeleteAll(texts.data(), texts.size());
   EXPECT_FALSE(ZORString::KeepFreed(false));
+  EXPECT_EQ(sLive, atFirst);
+  const std::unique_ptr<ZORString> counted(new ZORString("text"));
+  EXPECT_EQ(sLive, atFirst + 1);
+}
+
+// A thread that deletes many texts gives most of their memory back.
+TEST(Refused, DeletedTexts) {
+  if (!ZORString::KeepFreed(true)) GTEST_SKIP() << "freed texts are not kept under a sanitizer";
+  constexpr std::size_t kKept = std::size_t{128} * 65536;
+  std::vector<ZORString*> texts(5 * kKept / sizeof(ZORString));
+  for (ZORString*& text : texts) text = new ZORString("text");
+  const std::size_t after = ResidentBytes();
+  ZORString::DeleteAll(texts.data(), texts.size());
+  EXPECT_LE(ResidentBytes(), after - 2 * kKept);
+  ZORString::KeepFreed(false);
 }
 
 // Each allocation of a run is refused in turn, the last time none; the run leaves nothing allocated.

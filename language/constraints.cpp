@@ -57,9 +57,9 @@ void Resolver::Add(const ConstraintSyntax& syntax) {
 // They are good until the next call.
 std::span<const Word> Resolver::TakeArguments(const ConstraintSyntax& syntax) {
   mWritten.clear();
-  for (std::size_t i = syntax.firstArgument; i < syntax.firstArgument + syntax.arguments; ++i) {
-    mWritten.push_back(mSyntax.arguments[i]);
-    mSyntax.arguments.Release(i);
+  for (const std::size_t end = mTaken + syntax.arguments; mTaken < end; ++mTaken) {
+    mWritten.push_back(mSyntax.arguments[mTaken]);
+    mSyntax.arguments.Release(mTaken);
   }
   return mWritten;
 }
@@ -103,8 +103,7 @@ bool Resolver::AddMember(const Kind& kind, std::size_t place, const Word& word, 
 
 // All its elements are of one type, so that the first tells whether they fit.
 bool Resolver::AddArray(const Kind& kind, std::size_t place, const Word& word, const Named& array, Members& members) {
-  const std::int64_t size = array.last - array.first + 1;
-  for (std::int64_t i = 0; i < size; ++i) {
+  for (std::int64_t i = 0; i < array.Size(); ++i) {
     const bool constant = array.what == DeclarationSyntax::Constants;
     const int variable = constant ? AddConstant(array.constants.Words()[static_cast<std::size_t>(i)])
                                   : array.index + static_cast<int>(i);

@@ -72,7 +72,7 @@ void Resolver::DeclareVariable(DeclarationSyntax& declaration, Named& named) {
 bool Resolver::DeclareArray(DeclarationSyntax& declaration, Named& named) {
   Variable variable{"", declaration.type.sort, {}, {}};
   if (!SetIndices(declaration, named) || !SetType(declaration.type, variable)) return false;
-  const auto size = static_cast<std::size_t>(named.last - named.first + 1);
+  const auto size = static_cast<std::size_t>(named.Size());
   if (!Spend(size * (1 + variable.texts.size() + variable.numbers.size()), declaration.name.extent)) return false;
   named.index = static_cast<int>(mModel.Variables().size());
   for (std::int64_t index = named.first; index <= named.last; ++index) {
@@ -85,17 +85,17 @@ bool Resolver::DeclareArray(DeclarationSyntax& declaration, Named& named) {
 bool Resolver::DeclareConstants(const DeclarationSyntax& declaration, Named& named) {
   if (!SetIndices(declaration, named)) return false;
   Variable all;
-  named.constants = declaration.value;
-  if (!Collect(declaration.value.Words(), MemberType(declaration.type.sort), all)) return false;
-  const std::int64_t size = named.last - named.first + 1;
-  if (static_cast<std::uint64_t>(size) == declaration.value.count) return true;
-  mDiagnostics.Error(declaration.valueExtent,
-                     fmt::format("the array has {} elements, not {}", size, declaration.value.count));
+  const DetailSyntax& details = *declaration.details;
+  named.constants = details.value;
+  if (!Collect(details.value.Words(), MemberType(declaration.type.sort), all)) return false;
+  if (static_cast<std::uint64_t>(named.Size()) == details.value.count) return true;
+  mDiagnostics.Error(details.valueExtent,
+                     fmt::format("the array has {} elements, not {}", named.Size(), details.value.count));
   return false;
 }
 
 bool Resolver::SetIndices(const DeclarationSyntax& declaration, Named& named) {
-  const std::span<const Word> ends = declaration.indices.Words();
+  const std::span<const Word> ends = declaration.details->indices.Words();
   named.first = ends[0].token.number;
   named.last = ends[1].token.number;
   if (named.first <= named.last) return true;
@@ -105,7 +105,7 @@ bool Resolver::SetIndices(const DeclarationSyntax& declaration, Named& named) {
 }
 
 bool Resolver::SetType(TypeSyntax& type, Variable& variable) {
-  if (type.name.type == Token::Name) return SetNamedType(type.name, variable);
+  if (type.HasName()) return SetNamedType(type.members.Words().front().token, variable);
   variable.texts = std::move(type.texts);
   SortUnique(variable.texts);
   if (type.members.count == 0) return true;
@@ -179,14 +179,15 @@ bool Resolver::Spend(std::size_t values, Extent place) {
 }
 
 bool Resolver::SetValue(const DeclarationSyntax& declaration, Variable& variable) {
-  if (declaration.value.count == 0) return true;
+  if (declaration.details == nullptr) return true;
+  const DetailSyntax& details = *declaration.details;
   const Sort sort = variable.sort;
-  if (declaration.setValue && sort != Sort::TextSet && sort != Sort::IntegerSet) {
-    mDiagnostics.Error(declaration.valueExtent, fmt::format("a set is no value for {}", NamesOf(sort).described));
+  if (details.setValue && sort != Sort::TextSet && sort != Sort::IntegerSet) {
+    mDiagnostics.Error(details.valueExtent, fmt::format("a set is no value for {}", NamesOf(sort).described));
     mDiagnostics.Note(declaration.type.extent, "the type is declared here");
     return false;
   }
-  const std::span<const Word> value = declaration.value.Words();
+  const std::span<const Word> value = details.value.Words();
   Variable given = variable;
   if (!Collect(value, MemberType(sort), given)) return false;
   for (const Word& word : value) {

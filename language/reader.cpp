@@ -75,7 +75,7 @@ void Resolver::AddOutput(const Word& word) {
   const Named* const named = Find(word.token);
   if (named == nullptr) return;
   if (named->index != kUnknown && named->what != DeclarationSyntax::Set) {
-    for (std::int64_t i = 0; i <= named->last - named->first; ++i) mModel.Want({named->index + static_cast<int>(i)});
+    for (std::int64_t i = 0; i < named->Size(); ++i) mModel.Want({named->index + static_cast<int>(i)});
     return;
   }
   const std::string_view is = named->IsArray() ? "an array of constants" : "a set";
@@ -106,7 +106,7 @@ const Named* Resolver::FindArray(const Word& word) const {
 Word Resolver::Literal(const Word& word) const {
   const auto found = word.type == Word::Element ? mNames.find(word.token.text) : mNames.end();
   if (found == mNames.end() || found->second.what != DeclarationSyntax::Constants) return word;
-  const std::int64_t index = word.members.Words().front().token.number - found->second.first;
+  const std::int64_t index = std::int64_t{word.members.Words().front().token.number} - found->second.first;
   const std::span<const Word> constants = found->second.constants.Words();
   const bool within = index >= 0 && static_cast<std::uint64_t>(index) < constants.size();
   return within ? constants[static_cast<std::size_t>(index)] : word;

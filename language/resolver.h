@@ -3,6 +3,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <memory_resource>
 #include <span>
 #include <string>
 #include <string_view>
@@ -27,9 +28,10 @@ struct Named {
   DeclarationSyntax::What what;
   Extent place;
   int index = kUnknown;              // of a variable, of the first one of an array, of a set
-  std::int64_t first = 0, last = 0;  // of an array
+  std::int32_t first = 0, last = 0;  // of an array
   Range constants = {};              // of an array of them
 
+  std::int64_t Size() const { return std::int64_t{last} - first + 1; }  // of an array, else 1
   bool IsArray() const { return what == DeclarationSyntax::Variables || what == DeclarationSyntax::Constants; }
 };
 
@@ -95,10 +97,12 @@ class Resolver {
   ReadModel mRead;
   Model& mModel = mRead.model;
   std::vector<Variable> mSets;       // those with a name: of each a variable that ranges over it
+  std::size_t mTaken = 0;            // arguments of the constraints before
   std::vector<Word> mWritten;        // arguments of the constraint that is added
   std::vector<Argument> mArguments;  // of the constraint that is added
   std::size_t mListed = 0;           // in its list
-  std::unordered_map<std::string_view, Named> mNames;
+  std::pmr::monotonic_buffer_resource mNamesMemory;
+  std::pmr::unordered_map<std::string_view, Named> mNames{&mNamesMemory};
   bool mHasArrays = false;
   std::unordered_set<std::string_view> mBroken;  // of these it was told already that something is wrong
   std::size_t mValues = 0;                       // of the limited ones

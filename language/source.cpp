@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <stdexcept>
 #include <utility>
 
 namespace zornet {
@@ -34,10 +35,11 @@ std::size_t Source::Add(std::string name, std::string text) {
   constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
   if (text.starts_with(kByteOrderMark)) text.erase(0, kByteOrderMark.size());
   const std::size_t begin = mFiles.empty() ? 0 : mFiles.back().begin + mFiles.back().text.size() + 1;
-  File& file = mFiles.emplace_back(File{std::move(name), std::move(text), begin, {begin}});
+  if (text.size() >= UINT32_MAX - begin) throw std::runtime_error("the files of a model have more than 4 GB together");
+  File& file = mFiles.emplace_back(File{std::move(name), std::move(text), begin, {static_cast<std::uint32_t>(begin)}});
   file.lines.reserve(1 + static_cast<std::size_t>(std::count(file.text.begin(), file.text.end(), '\n')));
   for (std::size_t end = file.text.find('\n'); end != std::string::npos; end = file.text.find('\n', end + 1))
-    file.lines.push_back(begin + end + 1);
+    file.lines.push_back(static_cast<std::uint32_t>(begin + end + 1));
   return mFiles.size() - 1;
 }
 
@@ -53,7 +55,7 @@ std::string_view Source::Text(Extent extent) const {
 }
 
 std::size_t Source::LineOf(std::size_t position) const {
-  const std::vector<std::size_t>& lines = FileAt(position).lines;
+  const std::vector<std::uint32_t>& lines = FileAt(position).lines;
   return static_cast<std::size_t>(std::upper_bound(lines.begin(), lines.end(), position) - lines.begin());
 }
 
@@ -75,8 +77,8 @@ std::vector<Extent> Source::LinesOf(std::size_t file) const {
 }
 
 std::string_view Source::InLine(Extent extent) const {
-  const std::size_t end = LineAt(extent.begin).End(), begin = std::min(extent.begin, end);
-  return Text({begin, std::min(extent.length, end - begin)});
+  const std::size_t end = LineAt(extent.begin).End(), begin = std::min<std::size_t>(extent.begin, end);
+  return Text({begin, std::min<std::size_t>(extent.length, end - begin)});
 }
 
 Location Locator::operator()(std::size_t position) {

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <deque>
 #include <string>
 #include <string_view>
@@ -12,10 +13,14 @@ namespace zornet {
 
 // A range of the source, in bytes.
 struct Extent {
-  std::size_t begin = 0;
-  std::size_t length = 0;
+  constexpr Extent() = default;
+  constexpr Extent(std::size_t from, std::size_t bytes)
+      : begin(static_cast<std::uint32_t>(from)), length(static_cast<std::uint32_t>(bytes)) {}
 
-  std::size_t End() const { return begin + length; }
+  std::size_t End() const { return std::size_t{begin} + length; }
+
+  std::uint32_t begin = 0;
+  std::uint32_t length = 0;
 };
 
 // Line and column as people count them: from 1, in cells of a terminal rather than bytes.
@@ -29,7 +34,8 @@ struct Location {
 class Source {
  public:
   Source(std::string name, std::string text) { Add(std::move(name), std::move(text)); }
-  std::size_t Add(std::string name, std::string text);  // answers the number of the file, from 0
+  // Answers the number of the file, from 0. Throws std::runtime_error when the texts have more than 4 GB together.
+  std::size_t Add(std::string name, std::string text);
 
   const std::string& Name() const { return mFiles.front().name; }
   const std::string& NameAt(std::size_t position) const { return FileAt(position).name; }
@@ -45,8 +51,8 @@ class Source {
  private:
   struct File {
     std::string name, text;
-    std::size_t begin;               // its end is a position of its own
-    std::vector<std::size_t> lines;  // where each begins
+    std::size_t begin;                 // its end is a position of its own
+    std::vector<std::uint32_t> lines;  // where each begins
   };
 
   const File& FileAt(std::size_t position) const;

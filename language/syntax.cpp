@@ -62,7 +62,7 @@ class Parser {
   void Constraint();
   void Output();
   void Finish(DeclarationSyntax& declaration);
-  Range Value(DeclarationSyntax& declaration);
+  DetailSyntax Value();
   Range Indices();
   TypeSyntax Type(bool ofTexts = true);
   TypeSyntax NamedType();
@@ -138,17 +138,15 @@ void Parser::Declaration() {
   declaration.name = mDeclared = NewName("the name of the variable");
   if (mToken.Is("=")) {
     Take();
-    declaration.value = Value(declaration);
+    declaration.details = std::make_unique<DetailSyntax>(Value());
   }
   Finish(declaration);
 }
 
-Range Parser::Value(DeclarationSyntax& declaration) {
+DetailSyntax Parser::Value() {
   const Token first = mToken;
-  declaration.setValue = first.Is("{") || first.Is("lines");
   const Range value = first.Is("lines") ? (Take(), Lines(first.extent)) : first.Is("{") ? Braces() : Keep({Constant()});
-  declaration.valueExtent = Join(first.extent, mLast);
-  return value;
+  return {value, first.Is("{") || first.Is("lines"), Join(first.extent, mLast), {}};
 }
 
 void Parser::Finish(DeclarationSyntax& declaration) {
@@ -181,7 +179,8 @@ void Parser::NamedSet() {
 void Parser::Array() {
   DeclarationSyntax declaration;
   Take();
-  declaration.indices = Indices();
+  declaration.details = std::make_unique<DetailSyntax>();
+  declaration.details->indices = Indices();
   Expect("of", "behind the indices of the array");
   const bool variables = mToken.Is("var");
   declaration.what = variables ? DeclarationSyntax::Variables : DeclarationSyntax::Constants;
@@ -195,9 +194,9 @@ void Parser::Array() {
     Expect("=", "behind the name of an array without 'var'");
     const Token first = mToken;
     Expect("[", "ahead of the constants");
-    declaration.value = Members(&Parser::Constant);
+    declaration.details->value = Members(&Parser::Constant);
     Expect("]", "behind the constants");
-    declaration.valueExtent = Join(first.extent, mLast);
+    declaration.details->valueExtent = Join(first.extent, mLast);
   }
   Finish(declaration);
 }
@@ -239,7 +238,7 @@ TypeSyntax Parser::Interval() {
   Take();
   if (mToken.type != Token::Number) Fail("the upper end of the interval");
   const Word last = Constant();
-  return {Sort::Interval, Keep({first, last}), {}, Join(first.token.extent, last.token.extent)};
+  return {Sort::Interval, Join(first.token.extent, last.token.extent), Keep({first, last})};
 }
 
 // Texts without escapes are put in order as they are written, which costs less than later.
@@ -265,8 +264,8 @@ TypeSyntax Parser::NamedType() {
   if (IsAmong(word.text, kTypes)) return Basic();
   if (word.type != Token::Name || IsReserved(word.text)) Fail(std::string(kAnyType));
   Take();
-  if (word.Is("lines") && mToken.Is("(")) return {Sort::TextSet, Lines(word.extent), {}, {}};
-  if (mToken.Is(":") || mToken.type == Token::Name) return {Sort::TextSet, {}, word, {}};
+  if (word.Is("lines") && mToken.Is("(")) return {Sort::TextSet, {}, Lines(word.extent)};
+  if (mToken.Is(":") || mToken.type == Token::Name) return {Sort::TextSet, {}, Keep({{Word::Name, word}})};
   mDiagnostics.Error(word.extent, fmt::format("expected {}{}", kAnyType, Suggestion(word.text, kTypes)));
   throw Unreadable();
 }
@@ -275,13 +274,13 @@ TypeSyntax Parser::Basic() {
   const Token word = mToken;
   if (word.Is("string") || word.Is("int") || word.Is("bool")) {
     Take();
-    return {word.Is("string") ? Sort::Text : word.Is("int") ? Sort::Integer : Sort::Boolean, {}, {}, {}};
+    return {word.Is("string") ? Sort::Text : word.Is("int") ? Sort::Integer : Sort::Boolean};
   }
   Take();
   if (mToken.Is("of")) Take();
   if (!mToken.Is("string")) Fail("'string' behind 'set'");
   Take();
-  return {Sort::TextSet, {}, {}, {}};
+  return {Sort::TextSet};
 }
 
 Range Parser::Braces() {
@@ -421,14 +420,14 @@ void Parser::Constraint() {
   Take();
   if (mToken.type != Token::Name) Fail("the name of a constraint");
   constraint.name = Take();
-  constraint.firstArgument = mSyntax.arguments.Size();
+  const std::size_t first = mSyntax.arguments.Size();
   Expect("(", "behind the name of the constraint");
   if (!mToken.Is(")")) mSyntax.arguments.Add(Argument());
   while (mToken.Is(",")) {
     Take();
     mSyntax.arguments.Add(Argument());
   }
-  constraint.arguments = mSyntax.arguments.Size() - constraint.firstArgument;
+  constraint.arguments = static_cast<std::uint32_t>(mSyntax.arguments.Size() - first);
   const Token close = Expect(")", "behind the arguments");
   constraint.extent = Join(constraint.name.extent, close.extent);
   Expect(";", "at the end of the constraint");

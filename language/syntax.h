@@ -2,6 +2,8 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
+#include <memory>
 #include <span>
 #include <string>
 #include <unordered_map>
@@ -43,7 +45,7 @@ class Blocks {
   const T& operator[](std::size_t i) const { return mBlocks[i / kBlock][i % kBlock]; }
   // The one at i and all before it are not needed any more.
   void Release(std::size_t i) {
-    if ((i + 1) % kBlock == 0) mBlocks[i / kBlock] = {};
+    if ((i + 1) % kBlock == 0) mBlocks[i / kBlock] = std::vector<T>();
   }
 
  private:
@@ -64,28 +66,34 @@ struct Word {
 
 struct TypeSyntax {
   Sort sort = Sort::Text;
-  Range members = {};  // of a set; of an interval its two ends
-  Token name = {};     // of a named set, else none
   Extent extent = {};
+  Range members = {};                   // of a set; of an interval its two ends; of a named set its name
   std::vector<std::string> texts = {};  // instead of the members, of a set in braces that holds nothing else
+
+  bool HasName() const { return members.count == 1 && members.Words().front().type == Word::Name; }
+};
+
+// What few declarations have.
+struct DetailSyntax {
+  Range value = {};
+  bool setValue = false;  // written in braces or from a file
+  Extent valueExtent = {};
+  Range indices = {};  // of an array the first and the last
 };
 
 struct DeclarationSyntax {
-  enum What { Variable, Variables, Constants, Set };  // in the plural an array
+  enum What : char { Variable, Variables, Constants, Set };  // in the plural an array
 
   What what = Variable;
-  TypeSyntax type;
-  Token name;
-  Range value;
-  bool setValue = false;  // written in braces or from a file
-  Extent valueExtent;
-  Range indices;  // of an array the first and the last
+  TypeSyntax type = {};
+  Token name = {};
+  std::unique_ptr<DetailSyntax> details = nullptr;  // of an array or with a value
 };
 
 struct ConstraintSyntax {
   Token name;
-  std::size_t firstArgument = 0, arguments = 0;
   Extent extent;
+  std::uint32_t arguments = 0;
 };
 
 inline std::span<const Word> Range::Words() const { return {first, count}; }

@@ -79,7 +79,7 @@ std::string MarkedLine(std::string_view line, std::size_t mark, std::size_t mark
 
 std::string Told(const Source& source, const Diagnostic& diagnostic, const Location& at, bool colour) {
   const bool error = diagnostic.severity == Diagnostic::Error;
-  const Extent marked{diagnostic.extent.begin, std::min(diagnostic.extent.length, kReach)};
+  const Extent marked{diagnostic.extent.begin, std::min<std::size_t>(diagnostic.extent.length, kReach)};
   const Extent line = source.LineAt(marked.begin);
   const Paint paint(colour);
   return fmt::format("{} {} {}\n{}\n",

@@ -2,6 +2,8 @@
 // goes back to its chunk, so that texts that are made together lie together. Cells of other threads' chunks serve the
 // thread that freed them, too. What a thread has too many of, or leaves when it ends, serves others. Where no cells are
 // to be had, texts are blocks of operator new.
+#include <pthread.h>
+
 #include <atomic>
 #include <new>
 #include <span>
@@ -136,12 +138,12 @@ void Cells::Unlist(Chunk& chunk) {
   if (chunk.used == 0) --mEmpty;
 }
 
+// A thread whose end would not be told gets no cells. A thread_local object would end the process instead, where there
+// is no memory to register its destructor.
 void Cells::Open() {
-  struct Closing {
-    ~Closing() { tCells.Close(); }
-  };
-  if (std::exchange(mWasOpened, true)) return;
-  static thread_local const Closing kClosing;
+  static pthread_key_t key;
+  static const bool kHasKey = pthread_key_create(&key, [](void* cells) { static_cast<Cells*>(cells)->Close(); }) == 0;
+  if (std::exchange(mWasOpened, true) || !kHasKey || pthread_setspecific(key, this) != 0) return;
   mNumber = ++sThreads;
   mRoom = kMostForeign;
   mKeeps = sKeeps;

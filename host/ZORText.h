@@ -11,6 +11,7 @@
 #include <string>
 #include <string_view>
 #include <unordered_map>
+#include <utility>
 #include <vector>
 
 #include "host/ZORExport.h"
@@ -290,6 +291,8 @@ class ZOR_EXPORT ZORpstream {
   char* Str(int);      // the buffer, owned by the stream; zero-terminated only if a zero was written last
   void Freeze(int) {}  // does nothing: the stream keeps its buffer
   std::string_view View() const { return mBuffer; }
+  void Reserve(std::size_t size) { mBuffer.reserve(size); }
+  std::string Take() { return std::move(mBuffer); }  // the stream is empty afterwards
 
  protected:
   std::string mBuffer;

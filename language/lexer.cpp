@@ -3,6 +3,7 @@
 #include <fmt/core.h>
 
 #include <algorithm>
+#include <array>
 #include <charconv>
 #include <limits>
 #include <utility>
@@ -14,13 +15,22 @@ namespace zornet {
 
 namespace {
 
-bool IsDigit(char c) { return c >= '0' && c <= '9'; }
-bool IsLetter(char c) { return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || c == '_'; }
-bool IsMark(char c) {
-  return c == ',' || c == '(' || c == ')' || c == ';' || c == ':' || c == '{' || c == '}' || c == '[' || c == ']' ||
-         c == '|' || c == '=';
-}
-bool IsBlank(char c) { return c == ' ' || (c >= '\t' && c <= '\r'); }
+enum Classes : unsigned char { Letter = 1, Digit = 2, Mark = 4, Blank = 8, EndsRun = 16 };  // of characters
+
+constexpr std::array<unsigned char, 256> kClasses = [] {
+  std::array<unsigned char, 256> classes{};
+  const auto put = [&](std::string_view characters, Classes in) {
+    for (const char c : characters) classes[static_cast<unsigned char>(c)] |= in;
+  };
+  put("abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ_", Letter);
+  put("0123456789", Digit);
+  put(",();:{}[]|=", Mark);
+  put(" \t\n\v\f\r", Blank);
+  put("\"\n\\", EndsRun);  // of characters in a text
+  return classes;
+}();
+
+bool Is(char c, int classes) { return (kClasses[static_cast<unsigned char>(c)] & classes) != 0; }
 
 std::string NameOf(std::string_view character) {
   const auto code = static_cast<unsigned char>(character.front());
@@ -35,12 +45,8 @@ std::size_t WrittenLength(std::string_view text) {
 
 }  // namespace
 
-bool IsEscaped(const Token& token) {
-  return token.type != Token::Line && token.text.find('\\') != std::string_view::npos;
-}
-
 std::string Unescaped(const Token& token) {
-  if (!IsEscaped(token)) return std::string(token.text);
+  if (!token.escaped) return std::string(token.text);
   std::string text;
   for (std::size_t i = 0, length; i < token.text.size(); i += length) {
     length = WrittenLength(token.text.substr(i));
@@ -81,18 +87,18 @@ Token Lexer::Next() {
   SkipBlanks();
   if (mNext >= mText.size()) return Make(Token::End, 0);
   const char c = At(0);
-  if (IsLetter(c)) return NextName();
+  if (Is(c, Letter)) return NextName();
   if (StartsNumber()) return NextNumber();
   if (c == '"') return NextText();
   if (c == '.' && At(1) == '.') return Make(Token::DotDot, 2);
-  if (IsMark(c)) return Make(Token::Mark, 1);
+  if (Is(c, Mark)) return Make(Token::Mark, 1);
   return NextBroken();
 }
 
 void Lexer::SkipBlanks() {
   while (mNext < mText.size()) {
     const char c = mText[mNext];
-    if (IsBlank(c)) {
+    if (Is(c, Blank)) {
       ++mNext;
     } else if ((c != '%' && c != '/' && c != '#') || !SkipsComment()) {
       return;
@@ -119,15 +125,15 @@ Token Lexer::Make(Token::Type type, std::size_t length) {
 
 Token Lexer::NextName() {
   std::size_t length = 1;
-  while (IsLetter(At(length)) || IsDigit(At(length))) ++length;
+  while (Is(At(length), Letter | Digit)) ++length;
   return Make(Token::Name, length);
 }
 
-bool Lexer::StartsNumber() const { return IsDigit(At(0)) || (At(0) == '-' && IsDigit(At(1))); }
+bool Lexer::StartsNumber() const { return Is(At(0), Digit) || (At(0) == '-' && Is(At(1), Digit)); }
 
 Token Lexer::NextNumber() {
   std::size_t length = 1;
-  while (IsDigit(At(length))) ++length;
+  while (Is(At(length), Digit)) ++length;
   Token token = Make(Token::Number, length);
   const auto [end, error] = std::from_chars(token.text.data(), token.text.data() + token.text.size(), token.number);
   using Limits = std::numeric_limits<ZORLong>;
@@ -137,20 +143,28 @@ Token Lexer::NextNumber() {
   return token;
 }
 
+// From a position in a text to the next quote or backslash, or to the end of the line.
+std::size_t Lexer::EndOfRun(std::size_t from) const {
+  while (from < mText.size() && !Is(mText[from], EndsRun)) ++from;
+  return from;
+}
+
 // A text ends at its closing quote; one that lacks it ends with its line, so that the next line is read in peace.
 Token Lexer::NextText() {
-  std::size_t close = mNext + 1;
-  while (close < mText.size() && mText[close] != '"' && mText[close] != '\n')
-    close += mText[close] == '\\' ? WrittenLength(mText.substr(close)) : 1;
+  std::size_t close = EndOfRun(mNext + 1);
+  bool escaped = false;
+  for (; close < mText.size() && mText[close] == '\\'; close = EndOfRun(close + WrittenLength(mText.substr(close))))
+    escaped = true;
   if (close == mText.size() || mText[close] == '\n') {
     const std::size_t length = mText.substr(mNext, close - mNext).find_last_not_of("\r \t") + 1;
     mDiagnostics.Error(Here(length), "the text has no closing quote on its line");
     return Make(Token::Broken, length);
   }
   const std::string_view inside = mText.substr(mNext + 1, close - mNext - 1);
-  CheckEscapes(inside);
+  if (escaped) CheckEscapes(inside);
   Token token = Make(Token::Text, inside.size() + 2);
   token.text = inside;
+  token.escaped = escaped;
   return token;
 }
 

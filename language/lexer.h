@@ -17,12 +17,12 @@ struct Token {
   std::string_view text;    // as it stands; of a Text without the quotes
   std::int32_t number = 0;  // of a Number
   Type type = End;
+  bool escaped = false;  // a Text that has backslashes
 
   bool Is(std::string_view word) const { return (type == Name || type == Mark) && text == word; }
 };
 
 // What a Text in quotes or a Line of a file says. Where a character of it stands in the source.
-bool IsEscaped(const Token& token);
 std::string Unescaped(const Token& token);
 std::size_t PositionOf(const Token& token, std::size_t character);
 
@@ -44,6 +44,7 @@ class Lexer {
   Token NextNumber();
   Token NextText();
   Token NextBroken();
+  std::size_t EndOfRun(std::size_t from) const;
   void CheckEscapes(std::string_view inside);
   Extent Here(std::size_t length) const { return {mBegin + mNext, length}; }
   bool StartsNumber() const;

@@ -36,11 +36,17 @@ std::size_t Source::Add(std::string name, std::string text) {
   if (text.starts_with(kByteOrderMark)) text.erase(0, kByteOrderMark.size());
   const std::size_t begin = mFiles.empty() ? 0 : mFiles.back().begin + mFiles.back().text.size() + 1;
   if (text.size() >= UINT32_MAX - begin) throw std::runtime_error("the files of a model have more than 4 GB together");
-  File& file = mFiles.emplace_back(File{std::move(name), std::move(text), begin, {static_cast<std::uint32_t>(begin)}});
-  file.lines.reserve(1 + static_cast<std::size_t>(std::count(file.text.begin(), file.text.end(), '\n')));
-  for (std::size_t end = file.text.find('\n'); end != std::string::npos; end = file.text.find('\n', end + 1))
-    file.lines.push_back(static_cast<std::uint32_t>(begin + end + 1));
+  mFiles.push_back({std::move(name), std::move(text), begin, {}});
   return mFiles.size() - 1;
+}
+
+const std::vector<std::uint32_t>& Source::File::Lines() const {
+  if (!lines.empty()) return lines;
+  lines.reserve(1 + static_cast<std::size_t>(std::count(text.begin(), text.end(), '\n')));
+  lines.push_back(static_cast<std::uint32_t>(begin));
+  for (std::size_t end = text.find('\n'); end != std::string::npos; end = text.find('\n', end + 1))
+    lines.push_back(static_cast<std::uint32_t>(begin + end + 1));
+  return lines;
 }
 
 const Source::File& Source::FileAt(std::size_t position) const {
@@ -55,14 +61,15 @@ std::string_view Source::Text(Extent extent) const {
 }
 
 std::size_t Source::LineOf(std::size_t position) const {
-  const std::vector<std::uint32_t>& lines = FileAt(position).lines;
+  const std::vector<std::uint32_t>& lines = FileAt(position).Lines();
   return static_cast<std::size_t>(std::upper_bound(lines.begin(), lines.end(), position) - lines.begin());
 }
 
 Extent Source::LineAt(std::size_t position) const {
   const File& file = FileAt(position);
-  const std::size_t line = LineOf(position), begin = file.lines[line - 1];
-  std::size_t end = line < file.lines.size() ? file.lines[line] - 1 : file.begin + file.text.size();
+  const std::vector<std::uint32_t>& lines = file.Lines();
+  const std::size_t line = LineOf(position), begin = lines[line - 1];
+  std::size_t end = line < lines.size() ? lines[line] - 1 : file.begin + file.text.size();
   if (end > begin && file.text[end - file.begin - 1] == '\r') --end;
   return {begin, end - begin};
 }
@@ -70,7 +77,7 @@ Extent Source::LineAt(std::size_t position) const {
 std::vector<Extent> Source::LinesOf(std::size_t file) const {
   std::vector<Extent> lines;
   const std::size_t end = All(file).End();
-  for (const std::size_t begin : mFiles[file].lines) {
+  for (const std::size_t begin : mFiles[file].Lines()) {
     if (begin < end) lines.push_back(LineAt(begin));
   }
   return lines;

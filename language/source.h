@@ -51,8 +51,10 @@ class Source {
  private:
   struct File {
     std::string name, text;
-    std::size_t begin;                 // its end is a position of its own
-    std::vector<std::uint32_t> lines;  // where each begins
+    std::size_t begin;                         // its end is a position of its own
+    mutable std::vector<std::uint32_t> lines;  // where each begins; empty until one is asked for
+
+    const std::vector<std::uint32_t>& Lines() const;
   };
 
   const File& FileAt(std::size_t position) const;

@@ -247,7 +247,7 @@ std::vector<std::string> Parser::TextsOf(std::span<const Word> words) {
   texts.reserve(words.size());
   mViews.clear();
   for (const Word& word : words) {
-    if (IsEscaped(word.token)) break;
+    if (word.token.escaped) break;
     mViews.push_back(word.token.text);
   }
   if (mViews.size() == words.size()) {

@@ -1,6 +1,7 @@
 #include "network/ZORModel.h"
 
 #include <algorithm>
+#include <array>
 
 namespace zornet {
 
@@ -99,14 +100,26 @@ constexpr SortNames kSortNames[kSorts] = {
     {"bool", "a truth value", "single boolean"},
 };
 
+constexpr std::string_view NameAt(std::size_t at) { return kKinds[at].name; }
+
+constexpr auto kByName = [] {
+  std::array<std::size_t, std::size(kKinds)> order{};
+  for (std::size_t i = 0; i < order.size(); ++i) order[i] = i;
+  std::sort(order.begin(), order.end(),
+            [](std::size_t a, std::size_t b) { return NameAt(a) != NameAt(b) ? NameAt(a) < NameAt(b) : a < b; });
+  return order;
+}();
+
 }  // namespace
 
 std::span<const Kind> Kinds() { return kKinds; }
 
 const Kind* FindKind(std::string_view name, bool list) {
   const Kind* found = nullptr;
-  for (const Kind& kind : kKinds) {
-    if (kind.name == name && (found == nullptr || kind.HasList() == list)) found = &kind;
+  const auto* at = std::lower_bound(kByName.begin(), kByName.end(), name,
+                                    [](std::size_t kind, std::string_view sought) { return NameAt(kind) < sought; });
+  for (; at != kByName.end() && NameAt(*at) == name; ++at) {
+    if (found == nullptr || kKinds[*at].HasList() == list) found = &kKinds[*at];
   }
   return found;
 }

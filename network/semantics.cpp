@@ -260,7 +260,7 @@ Semantics::Answers Semantics::InvertTrue(const Constraint& constraint, std::size
     case Meaning::Position:
       if (result.number == -1) return std::nullopt;
       proposals = Starts(ToView(*values[0].text), result.number);
-      return Filter(constraint, position, values, proposals);
+      return Filter(constraint, position, values, std::move(proposals));
     case Meaning::ReplaceFirst:
     case Meaning::ReplaceAll:
       return InvertReplacement(constraint, position, values);
@@ -289,19 +289,19 @@ Semantics::Answers Semantics::InvertTrue(const Constraint& constraint, std::size
       break;
   }
   Propose(kind, position, values, proposals);
-  return Filter(constraint, position, values, proposals);
+  return Filter(constraint, position, values, std::move(proposals));
 }
 
 // Those of the proposals that give the result, each once.
 Semantics::Answers Semantics::Filter(const Constraint& constraint, std::size_t position, std::span<const Exact> values,
-                                     std::vector<Answer>& proposals) {
-  std::vector<Answer> found;
-  found.reserve(proposals.size());
+                                     std::vector<Answer> proposals) {
+  auto found = proposals.begin();
   for (Answer& proposal : proposals) {
-    const bool again = std::find(found.begin(), found.end(), proposal) != found.end();
-    if (!again && Gives(constraint, position, proposal, values)) found.push_back(std::move(proposal));
+    const bool again = std::find(proposals.begin(), found, proposal) != found;
+    if (!again && Gives(constraint, position, proposal, values)) std::swap(*found++, proposal);
   }
-  return found;
+  proposals.erase(found, proposals.end());
+  return proposals;
 }
 
 // What is replaced stood where the replacement stands now, or nowhere.
@@ -318,7 +318,7 @@ Semantics::Answers Semantics::InvertReplacement(const Constraint& constraint, st
       if (z.size() - to.size() + from.size() <= kTextLimit)
         proposals.push_back({ToZor(std::string(z.substr(0, at)).append(from).append(z.substr(at + to.size()))), 0});
     }
-    return Filter(constraint, position, values, proposals);
+    return Filter(constraint, position, values, std::move(proposals));
   }
   const std::string_view x = ToView(*values[0].text);
   if (position == 1) {
@@ -334,7 +334,7 @@ Semantics::Answers Semantics::InvertReplacement(const Constraint& constraint, st
     if (z.size() < rest) return proposals;
     proposals.push_back({ToZor(z.substr(x.find(from), (z.size() - rest) / count)), 0});
   }
-  return Filter(constraint, position, values, proposals);
+  return Filter(constraint, position, values, std::move(proposals));
 }
 
 // The texts from one to another, both included.

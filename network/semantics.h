@@ -72,7 +72,7 @@ class Semantics {
   Answers InvertReplacement(const Constraint& constraint, std::size_t position, std::span<const Exact> values);
   static Answers InvertNumber(const Kind& kind, std::size_t position, std::span<const Exact> values);
   Answers Filter(const Constraint& constraint, std::size_t position, std::span<const Exact> values,
-                 std::vector<Answer>& proposals);
+                 std::vector<Answer> proposals);
   bool ComputeTextForm(const Exact& value, Answer& result);
   static ZORString Joined(const ZORString& x, const ZORString& y);
   ZORString Fold(Meaning meaning, const ZORString& x, const ZORString& y);

@@ -37,18 +37,24 @@ Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(ty
 }
 
 const Listing& Store::List(int variable) {
-  if (mListed[static_cast<std::size_t>(variable)] == 0) KeepListing(variable, ListingOf(variable));
+  if (mListed[static_cast<std::size_t>(variable)] == 0) {
+    Fill(variable, ListingOf(variable));
+    Keep(variable);
+  }
   return *mListings[static_cast<std::size_t>(variable)];
 }
 
-Listing Store::ListingOf(int variable) const {
+void Store::Fill(int variable, Listing& listing) const {
   const Value& value = (*this)[variable];
-  Listing listing;
+  listing.texts.clear();
+  listing.numbers.clear();
+  listing.first = 0;
+  listing.count = 0;
   listing.sort = value.Sort();
   listing.known = value.IsKnown() || (value.Sort() == Sort::Boolean && value.IsUndefined());
-  if (!listing.known) return listing;
+  if (!listing.known) return;
   if (IsText(value.Sort())) {
-    listing.texts = TextsOf(variable);
+    AddTexts(variable, listing.texts);
     listing.count = listing.texts.size();
   } else if (value.Sort() == Sort::IntegerSet) {
     listing.numbers = value.Numbers();
@@ -57,26 +63,37 @@ Listing Store::ListingOf(int variable) const {
     listing.first = value.LowestNumber();
     listing.count = static_cast<std::size_t>(std::int64_t{value.HighestNumber()} - listing.first + 1);
   }
-  return listing;
 }
 
-void Store::KeepListing(int variable, Listing listing) {
+// Where its listing is or will be.
+Listing& Store::ListingOf(int variable) {
+  std::unique_ptr<Listing>& held = mListings[static_cast<std::size_t>(variable)];
+  if (held == nullptr && !mForgotten.empty()) {
+    held = std::move(mForgotten.back());
+    mForgotten.pop_back();
+  }
+  if (held == nullptr) held = std::make_unique<Listing>();
+  return *held;
+}
+
+void Store::Keep(int variable) {
+  const Listing& listing = *mListings[static_cast<std::size_t>(variable)];
+  mListed[static_cast<std::size_t>(variable)] = 1;
   mKept.push_back(variable);
   mKeptValues += 1 + listing.texts.size() + listing.numbers.size();
-  Hold(variable, std::move(listing));
 }
 
 void Store::Hold(int variable, Listing listing) {
-  std::unique_ptr<Listing>& held = mListings[static_cast<std::size_t>(variable)];
-  held != nullptr ? void(*held = std::move(listing)) : void(held = std::make_unique<Listing>(std::move(listing)));
+  ListingOf(variable) = std::move(listing);
   mListed[static_cast<std::size_t>(variable)] = 1;
 }
 
-// A large network would hold every value twice. Candidates are no copies.
+// A large network would hold every value twice. Candidates are no copies. The memory serves other listings.
 void Store::ForgetListings() {
   for (const int variable : mKept) {
-    if (HasCandidates(variable)) continue;
-    mListings[static_cast<std::size_t>(variable)].reset();
+    std::unique_ptr<Listing>& held = mListings[static_cast<std::size_t>(variable)];
+    if (held == nullptr || HasCandidates(variable)) continue;
+    mForgotten.push_back(std::move(held));
     mListed[static_cast<std::size_t>(variable)] = 0;
   }
   mKept.clear();
@@ -84,13 +101,11 @@ void Store::ForgetListings() {
 }
 
 // As long as it is as it was declared, the model lists them at less cost.
-std::vector<ZORString> Store::TextsOf(int variable) const {
+void Store::AddTexts(int variable, std::vector<ZORString>& texts) const {
   const std::vector<std::string>& declared = Declared(variable).texts;
-  if (mChanged[static_cast<std::size_t>(variable)] != 0 || declared.empty()) return (*this)[variable].Texts();
-  std::vector<ZORString> texts;
+  if (mChanged[static_cast<std::size_t>(variable)] != 0 || declared.empty()) return (*this)[variable].AddTexts(texts);
   texts.reserve(declared.size());
   for (const std::string& text : declared) texts.push_back(ToZor(text));
-  return texts;
 }
 
 std::size_t Store::Count(int variable) const {
@@ -266,7 +281,8 @@ void Store::MeetTexts(int variable, std::vector<ZORString> texts) {
   Meet(variable, outcome);
   if (!wasUndefined || mListed[static_cast<std::size_t>(variable)] != 0 || Count(variable) != texts.size()) return;
   const std::size_t count = texts.size();
-  KeepListing(variable, {true, std::move(texts), {}, 0, count, (*this)[variable].Sort()});
+  Hold(variable, {true, std::move(texts), {}, 0, count, (*this)[variable].Sort()});
+  Keep(variable);
 }
 
 void Store::MeetNumbers(int variable, std::vector<ZORLong> numbers) {

@@ -136,9 +136,10 @@ class Store {
     std::optional<Saved> saved;
   };
 
-  Listing ListingOf(int variable) const;
-  std::vector<ZORString> TextsOf(int variable) const;
-  void KeepListing(int variable, Listing listing);
+  Listing& ListingOf(int variable);
+  void Fill(int variable, Listing& listing) const;
+  void AddTexts(int variable, std::vector<ZORString>& texts) const;
+  void Keep(int variable);
   void Hold(int variable, Listing listing);
   void ForgetListings();
   static Measure MeasureOf(const Value& value);
@@ -165,6 +166,7 @@ class Store {
   static constexpr std::size_t kMostKept = 1 << 16;
   std::vector<int> mKept;  // the variables that were listed since all listings were forgotten
   std::size_t mKeptValues = 0;
+  std::vector<std::unique_ptr<Listing>> mForgotten;
   std::vector<char> mChanged;  // whether the value is not as it was declared any more
   std::vector<int> mShapeOf;   // by variable: an index into mShapes, or kNone
   std::vector<Shape> mShapes;

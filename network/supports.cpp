@@ -291,6 +291,7 @@ void Supports::Meet(Column& column) {
 
 void Supports::MeetTexts(Column& column) {
   std::vector<ZORString> texts;
+  texts.reserve(column.kept.size() - column.dropped);
   for (std::size_t i = 0; i < column.kept.size(); ++i) {
     if (column.kept[i] != 0) texts.push_back(column.listing->texts[i]);
   }

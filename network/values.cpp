@@ -118,17 +118,23 @@ ZORString Value::HighestText() const {
 
 // A text followed by a character less than the alphabet lies between that text and the next listed one, so asking from
 // there gives the next. The last text comes from the upper bound: a set never answers it as the next one.
-std::vector<ZORString> Value::Texts() const {
-  std::vector<ZORString> texts{LowestText()};
+void Value::AddTexts(std::vector<ZORString>& texts) const {
   const std::size_t count = mSort == Sort::Text ? 1 : mValue->GetCardinality();
-  texts.reserve(count);
+  const std::size_t end = texts.size() + count;
+  texts.reserve(end);
+  texts.push_back(LowestText());
   static const ZORString kBelowAlphabet("\x01");
   ZORString between;
-  while (texts.size() + 1 < count) {
+  while (texts.size() + 1 < end) {
     between.Concatenate(texts.back(), kBelowAlphabet);
     texts.push_back(Text().GetNextExactValue(between));
   }
   if (count > 1) texts.push_back(HighestText());
+}
+
+std::vector<ZORString> Value::Texts() const {
+  std::vector<ZORString> texts;
+  AddTexts(texts);
   return texts;
 }
 
@@ -152,9 +158,12 @@ std::vector<ZORLong> Value::Numbers() const {
 }
 
 std::string Value::Print() const {
+  constexpr std::size_t kMarks = 4, kMost = 1 << 16;  // the quotes of a text, comma and space
   ZORostrstream out;
+  if (IsText(mSort) && IsKnown())
+    out.Reserve(std::min(kMost, kMarks + (LowestText().View().size() + kMarks) * Any().GetCardinality()));
   mValue->PrintOn(out);
-  return std::string(out.View());
+  return out.Take();
 }
 
 std::string Value::Show() const {

@@ -64,8 +64,9 @@ class Value {
   // What a known value holds; of numbers also what an Undefined one does.
   ZORString LowestText() const;
   ZORString HighestText() const;
-  std::vector<ZORString> Texts() const;  // in ascending order
-  ZORLong LowestNumber() const;          // of a Boolean 0 or 1
+  std::vector<ZORString> Texts() const;                // in ascending order
+  void AddTexts(std::vector<ZORString>& texts) const;  // behind those that are there
+  ZORLong LowestNumber() const;                        // of a Boolean 0 or 1
   ZORLong HighestNumber() const;
   std::vector<ZORLong> Numbers() const;
 

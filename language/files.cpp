@@ -34,16 +34,19 @@ std::string DiskFiles::Read(const std::string& path) const {
   return text;
 }
 
-// In pieces, since some files have no end.
+// In pieces, since some files have no end. One that is as long as expected comes in pieces as they remain, and a byte
+// more tells that it ends.
 std::string ReadText(std::istream& in, std::uintmax_t expected) {
-  constexpr std::size_t kMegabyte = 1 << 20, kMostMegabytes = 256;
+  constexpr std::size_t kMegabyte = 1 << 20, kMostMegabytes = 256, kPiece = 1 << 16;
   std::string text;
-  text.reserve(static_cast<std::size_t>(std::min<std::uintmax_t>(expected, kMostMegabytes * kMegabyte)) + kMegabyte);
+  const auto whole = static_cast<std::size_t>(std::min<std::uintmax_t>(expected, kMostMegabytes * kMegabyte));
+  text.reserve(whole + kPiece);
   for (std::size_t size = 0; in; text.resize(size)) {
     if (size > kMostMegabytes * kMegabyte)
       throw std::runtime_error(fmt::format("is larger than {} MB", kMostMegabytes));
-    text.resize(size + kMegabyte);
-    size += static_cast<std::size_t>(in.read(text.data() + size, kMegabyte).gcount());
+    const std::size_t piece = size < whole ? std::min(whole - size + 1, kMegabyte) : kPiece;
+    text.resize(size + piece);
+    size += static_cast<std::size_t>(in.read(text.data() + size, static_cast<std::streamsize>(piece)).gcount());
   }
   if (text.find('\0') != std::string::npos)
     throw std::runtime_error("is no text: it is binary, or in UTF-16 and not UTF-8");

@@ -1,6 +1,7 @@
 #include "network/propagation.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "network/offsets.h"
 #include "network/order_cycles.h"
@@ -10,6 +11,7 @@ namespace zornet {
 namespace {
 
 constexpr std::uint64_t kProgressSteps = 256;
+constexpr std::size_t kManyTexts = 64;
 
 }  // namespace
 
@@ -101,10 +103,28 @@ Status Propagation::Narrow(int constraint) {
 }
 
 Status Propagation::Narrow(const Constraint& constraint) {
+  if (Relations::AreUnequal(constraint)) {
+    RemoveTogether(constraint.arguments[0], constraint.arguments[1]);
+    RemoveTogether(constraint.arguments[1], constraint.arguments[0]);
+  }
   if (constraint.kind->IsComparison()) return mRelations.Narrow(constraint);
   if (constraint.kind->meaning == Meaning::AllDifferent) return mAllDifferent.Narrow(constraint);
   if (constraint.kind->meaning == Meaning::Row) return mTables.Narrow(constraint);
   return mFunctions.Narrow(constraint);
+}
+
+// Texts that waiting constraints take from a large set go in one pass: one by one, each would move all greater ones. A
+// watcher is told of each by itself.
+void Propagation::RemoveTogether(int from, int unequal) {
+  if (mStore.IsWatched() || mStore.Count(from) < kManyTexts || !mRelations.CanRemove(from, unequal)) return;
+  std::vector<ZORString> texts{mStore[unequal].LowestText()};
+  for (const int reader : ReadersOf(from)) {
+    const Constraint& other = mModel.Constraints()[static_cast<std::size_t>(reader)];
+    if (mStates[static_cast<std::size_t>(reader)] != Waiting || !Relations::AreUnequal(other)) continue;
+    const int known = other.arguments[other.arguments[0] == from ? 1 : 0];
+    if (mRelations.CanRemove(from, known)) texts.push_back(mStore[known].LowestText());
+  }
+  if (texts.size() > 1) mRelations.RemoveAll(from, std::move(texts));
 }
 
 // A constraint that finds in one pass all that it can find is not woken by its own changes.

@@ -54,6 +54,7 @@ class Propagation {
   Outcome LeaveOff(int constraint);
   Status Narrow(int constraint);
   Status Narrow(const Constraint& constraint);
+  void RemoveTogether(int from, int unequal);
   int Next();
 
   Store& mStore;

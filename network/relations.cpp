@@ -1,5 +1,9 @@
 #include "network/relations.h"
 
+#include <algorithm>
+#include <iterator>
+#include <utility>
+
 namespace zornet {
 
 namespace {
@@ -112,6 +116,27 @@ void Relations::Remove(int target, const ZORString& text) {
   if (!mStore[target].IsKnown()) return;
   mStore.StartOperation(Operation::Unequal);
   if (Lists(target, text)) mStore.Edit(target, [&](Value& value) { RemoveFrom(value, text); });
+}
+
+bool Relations::AreUnequal(const Constraint& constraint) {
+  return constraint.kind->meaning == Meaning::Unequal && !constraint.kind->reified && !constraint.kind->IsOfNumbers();
+}
+
+bool Relations::CanRemove(int target, int unequal) {
+  const Value& value = mStore[target];
+  return value.Sort() == Sort::TextSet && value.IsKnown() && mStore[unequal].IsOne() &&
+         Lists(target, mStore[unequal].LowestText());
+}
+
+void Relations::RemoveAll(int target, std::vector<ZORString> texts) {
+  const ZORString last = texts.back();
+  std::sort(texts.begin(), texts.end());
+  std::vector<ZORString> kept;
+  const std::vector<ZORString>& listed = mStore.List(target).texts;
+  std::set_difference(listed.begin(), listed.end(), texts.begin(), texts.end(), std::back_inserter(kept));
+  if (kept.empty()) kept.push_back(last);
+  mStore.StartOperation(Operation::Unequal);
+  mStore.MeetTexts(target, std::move(kept));
 }
 
 bool Relations::Lists(int variable, const ZORString& text) {

@@ -1,6 +1,8 @@
 // Equality and order, posted or reified: what is common to texts and numbers, and how texts are narrowed.
 #pragma once
 
+#include <vector>
+
 #include "network/number_relations.h"
 #include "network/semantics.h"
 #include "network/status.h"
@@ -13,6 +15,12 @@ class Relations {
   explicit Relations(Store& store);
 
   Status Narrow(const Constraint& constraint);
+
+  // Of texts that must be unequal. CanRemove: target is a set that lists the one text of unequal. RemoveAll takes such
+  // texts from target at once, but leaves the last of them where nothing else would be left.
+  static bool AreUnequal(const Constraint& constraint);
+  bool CanRemove(int target, int unequal);
+  void RemoveAll(int target, std::vector<ZORString> texts);
 
  private:
   struct Ends {

@@ -107,6 +107,7 @@ class Store {
 
   const std::array<OperationCounts, kOperations>& Counts() const { return mCounts; }
   void Watch(Watcher* watcher) { mWatcher = watcher; }
+  bool IsWatched() const { return mWatcher != nullptr; }
 
   // The value itself, for the module's bare operations.
   Value& Bare(int variable) { return mValues[static_cast<std::size_t>(variable)]; }

@@ -87,10 +87,10 @@ std::string TextReport::Shown(const Domain& domain) const {
 
 void TextReport::Show(const Network& network, const LimitsByVariable& limits) {
   for (const int variable : mModel.Wanted()) {
-    mResults << mPaint(Style::Name, mNames.OfVariable(variable)) << " = " << Shown(network[variable]);
-    if (const std::string met = LimitsAt(variable, limits); !met.empty())
-      mResults << mPaint(Style::Faint, "  % " + met);
-    mResults << '\n';
+    std::string line = mPaint(Style::Name, mNames.OfVariable(variable));
+    line.append(" = ").append(Shown(network[variable]));
+    if (const std::string met = LimitsAt(variable, limits); !met.empty()) line += mPaint(Style::Faint, "  % " + met);
+    mResults << (line += '\n');
   }
 }
 

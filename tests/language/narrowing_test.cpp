@@ -25,6 +25,23 @@ TEST(Propagation, MorePairsThanASetLists) {
   EXPECT_EQ(solved["z"].Texts().size(), 33u);
 }
 
+// What many constraints take from one set, in any order, stated either way round and more than once.
+TEST(Propagation, ManyUnequalTexts) {
+  std::string set, unequal;
+  for (int i = 0; i < 100; ++i) {
+    set += fmt::format("{}\"{}\"", i == 0 ? "" : ", ", i * 37 % 100);
+    const std::string text = fmt::format("\"{}\"", i);
+    if (i != 42) unequal += "constraint str_ne(" + (i % 2 == 0 ? "x, " + text : text + ", x") + ");";
+  }
+  const std::string model = "var {" + set + "}: x; var {\"42\", \"a\"}: y;" + unequal + unequal;
+  Solved left(model), none(model + "constraint str_ne(x, \"42\");"), searched(model + "constraint str_le(x, y);");
+  EXPECT_EQ(left.Narrow(), zornet::Outcome::Settled);
+  EXPECT_EQ(left.Print("x"), "\"42\"");
+  EXPECT_EQ(none.Narrow(), zornet::Outcome::Contradiction);
+  EXPECT_EQ(searched.Search(9, [] { return true; }).solutions, 2u);
+  EXPECT_EQ(left.Explain(left.Find("x")).narrowings.size(), 99u);
+}
+
 // Beyond the budget the module's operations on whole sets are left.
 TEST(Propagation, Budget) {
   const std::string model =

@@ -44,6 +44,7 @@ void AllDifferent::List(std::span<const int> variables) {
     mFirst.push_back(mListed.size());
   }
   mTextOf.assign(mVariables.size(), kNone);
+  mPassed.assign(mVariables.size(), 0);
 }
 
 std::size_t AllDifferent::NumberOf(std::string_view text) {
@@ -65,19 +66,29 @@ bool AllDifferent::Match(std::size_t variable) {
   ++mSearch;
   mQueue.assign(1, variable);
   for (std::size_t i = 0; i < mQueue.size(); ++i) {
-    for (const std::size_t text : TextsOf(mQueue[i])) {
+    const std::size_t finder = mQueue[i];
+    if (const std::size_t text = FindFree(finder); text != kNone) {
+      mTexts[text].finder = finder;
+      GiveAlong(text);
+      return true;
+    }
+    for (const std::size_t text : TextsOf(finder)) {
       Text& state = mTexts[text];
       if (state.search == mSearch) continue;
       state.search = mSearch;
-      state.finder = mQueue[i];
-      if (state.owner == kNone) {
-        GiveAlong(text);
-        return true;
-      }
+      state.finder = finder;
       mQueue.push_back(state.owner);
     }
   }
   return false;
+}
+
+// A text that has an owner once has one ever after, so those that were passed are not looked at again.
+std::size_t AllDifferent::FindFree(std::size_t variable) {
+  const auto texts = TextsOf(variable);
+  std::size_t& passed = mPassed[variable];
+  while (passed < texts.size() && mTexts[texts[passed]].owner != kNone) ++passed;
+  return passed < texts.size() ? texts[passed] : kNone;
 }
 
 // Each finder gets the text that it found and leaves its own to the one before it.

@@ -41,6 +41,7 @@ class AllDifferent {
   void List(std::span<const int> variables);
   std::size_t NumberOf(std::string_view text);
   bool Match(std::size_t variable);
+  std::size_t FindFree(std::size_t variable);
   void GiveAlong(std::size_t text);
   void FindComponents();
   bool CanTake(std::size_t variable, std::size_t text) const;
@@ -60,6 +61,7 @@ class AllDifferent {
   std::vector<std::size_t> mFirst;   // their texts stand from here on
   std::vector<std::size_t> mListed;  // in this row
   std::vector<std::size_t> mTextOf;  // the matching
+  std::vector<std::size_t> mPassed;  // by variable, how many of its first texts have an owner
   std::vector<std::size_t> mQueue;
 
   // From a variable that takes a text an edge leads to the one that has to give it up.

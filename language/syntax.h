@@ -49,7 +49,7 @@ class Blocks {
   }
 
  private:
-  static constexpr std::size_t kBlock = 128;
+  static constexpr std::size_t kBlock = 4096;
 
   std::vector<std::vector<T>> mBlocks;
   std::size_t mSize = 0;

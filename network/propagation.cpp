@@ -43,7 +43,7 @@ void Propagation::Connect() {
   each([this](int, std::size_t variable) { ++mFirstReader[variable + 1]; });
   for (std::size_t v = 1; v < mFirstReader.size(); ++v) mFirstReader[v] += mFirstReader[v - 1];
   mReaders.resize(mFirstReader.back());
-  std::vector<std::size_t> next(mFirstReader.begin(), mFirstReader.end() - 1);
+  std::vector<std::uint32_t> next(mFirstReader.begin(), mFirstReader.end() - 1);
   each([&](int constraint, std::size_t variable) { mReaders[next[variable]++] = constraint; });
 }
 

@@ -70,7 +70,7 @@ class Propagation {
 
   // Constraints that read a variable: mReaders[mFirstReader[v]] and those up to mFirstReader[v + 1].
   std::vector<int> mReaders;
-  std::vector<std::size_t> mFirstReader;
+  std::vector<std::uint32_t> mFirstReader;
 
   static constexpr unsigned kMostShavings = 4096;
   std::vector<unsigned> mShavings;  // by variable: changes of an interval in this run

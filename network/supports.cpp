@@ -112,9 +112,10 @@ void Supports::Prepare(const Constraint& constraint) {
   mExact.resize(arity);
   for (std::size_t position = 0; position < arity; ++position) {
     const int variable = constraint.arguments[position];
-    std::size_t& column = mColumnOfVariable[static_cast<std::size_t>(variable)];
+    std::size_t column = mColumnOfVariable[static_cast<std::size_t>(variable)];
     if (column >= mCount || mColumns[column].variable != variable) {
       column = mCount++;
+      mColumnOfVariable[static_cast<std::size_t>(variable)] = static_cast<std::uint32_t>(column);
       mColumns[column].variable = variable;
       mColumns[column].listing = &mStore.List(variable);
       mColumns[column].openBelow = mColumns[column].openAbove = false;

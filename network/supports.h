@@ -99,7 +99,7 @@ class Supports {
   std::size_t mCount = 0;        // of the columns in use
   std::vector<Column> mColumns;  // one for each different variable
   std::vector<std::size_t> mColumnOf;                    // by position
-  std::vector<std::size_t> mColumnOfVariable;            // good where that column has the variable
+  std::vector<std::uint32_t> mColumnOfVariable;          // good where that column has the variable
   std::vector<Exact> mExact;                             // what is tried, by position
   std::size_t mTries = 0;                                // left of the budget of a driven pass
   std::vector<Column*> mTried;                           // the columns whose combinations are tried

@@ -25,27 +25,24 @@ Types::Types(const ZORVaDoModule& strings, const ZORVaDoModule& numbers) {
 Value::Value(const Types& types, zornet::Sort sort) : Value(&types[sort], sort) {}
 
 Value::Value(const ZORVaDoObjectDescriptor* descriptor, zornet::Sort sort)
-    : mDescriptor(descriptor), mMemory(::operator new(descriptor->GetObjectSize())), mSort(sort) {
-  mValue = static_cast<ZORVaDoAny*>(mDescriptor->CreateObject(mMemory));
-}
+    : mDescriptor(descriptor),
+      mValue(static_cast<ZORVaDoAny*>(descriptor->CreateObject(::operator new(descriptor->GetObjectSize())))),
+      mSort(sort) {}
 
 Value::Value(const Value& other) : Value(other.mDescriptor, other.mSort) { mValue->Assign(*other.mValue); }
 
 Value::~Value() {
-  if (mMemory == nullptr) return;
+  if (mValue == nullptr) return;
+  void* const memory = dynamic_cast<void*>(mValue);  // where the whole object begins
   mDescriptor->DestroyObject(mValue);
-  ::operator delete(mMemory);
+  ::operator delete(memory);
 }
 
 Value::Value(Value&& other) noexcept
-    : mDescriptor(other.mDescriptor),
-      mMemory(std::exchange(other.mMemory, nullptr)),
-      mValue(other.mValue),
-      mSort(other.mSort) {}
+    : mDescriptor(other.mDescriptor), mValue(std::exchange(other.mValue, nullptr)), mSort(other.mSort) {}
 
 Value& Value::operator=(Value other) noexcept {
   std::swap(mDescriptor, other.mDescriptor);
-  std::swap(mMemory, other.mMemory);
   std::swap(mValue, other.mValue);
   std::swap(mSort, other.mSort);
   return *this;

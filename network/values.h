@@ -79,7 +79,6 @@ class Value {
   std::string ShowEscaped() const;
 
   const ZORVaDoObjectDescriptor* mDescriptor;
-  void* mMemory;
   ZORVaDoAny* mValue;
   zornet::Sort mSort;
 };

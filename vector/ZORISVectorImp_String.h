@@ -108,8 +108,8 @@ class ZOR_EXPORT ZORISVectorImp_String {
   unsigned int mLimit;
   unsigned int mTop;
   unsigned int mDelta;
-  double mRatio;
   int mGood;
+  double mRatio;
 };
 
 inline ZORString*& ZORISVectorImp_String::operator[](unsigned int pos) { return mItems[pos]; }

@@ -31,10 +31,10 @@ ZORString** ZORISVectorImp_String::NewPlaces(unsigned int limit) {
 void ZORISVectorImp_String::DelObj(ZORString& s, void*) { delete &s; }
 
 ZORISVectorImp_String::ZORISVectorImp_String()
-    : mItems(nullptr), mLimit(0), mTop(0), mDelta(0), mRatio(0.0), mGood(1) {}
+    : mItems(nullptr), mLimit(0), mTop(0), mDelta(0), mGood(1), mRatio(0.0) {}
 
 ZORISVectorImp_String::ZORISVectorImp_String(unsigned int size, unsigned int delta)
-    : mItems(NewPlaces(size + 1)), mLimit(size + 1), mTop(0), mDelta(delta), mRatio(0.0), mGood(mItems != nullptr) {}
+    : mItems(NewPlaces(size + 1)), mLimit(size + 1), mTop(0), mDelta(delta), mGood(mItems != nullptr), mRatio(0.0) {}
 
 ZORISVectorImp_String::ZORISVectorImp_String(unsigned int size, double ratio) : ZORISVectorImp_String(size, 0u) {
   mRatio = ratio > 0.0 ? ratio : 1.0;
@@ -45,8 +45,8 @@ ZORISVectorImp_String::ZORISVectorImp_String(const ZORISVectorImp_String& other)
       mLimit(other.mLimit),
       mTop(other.mTop),
       mDelta(other.mDelta),
-      mRatio(other.mRatio),
-      mGood(mItems != nullptr ? other.Good() : 0) {
+      mGood(mItems != nullptr ? other.Good() : 0),
+      mRatio(other.mRatio) {
   if (mGood != 0) std::copy_n(other.mItems, mLimit, mItems);
 }
 

@@ -97,7 +97,7 @@ Status Functions::Narrow(const Constraint& constraint) {
     MeetResult(constraint, {GreatestText(), 0});  // the greatest text is its own successor
     return Status::Subsumed;
   }
-  if (!mStore.List(constraint.Result()).known && ComputeSets(constraint)) return Status::Fixpoint;
+  if (mStore.Count(constraint.Result()) == 0 && ComputeSets(constraint)) return Status::Fixpoint;
   if (mSupports.Narrow(constraint)) return Status::Fixpoint;
   if (constraint.kind->meaning == Meaning::Slice && BoundSlice(constraint)) return Status::Subsumed;
   if (mStore.HasFailed()) return Status::Fixpoint;

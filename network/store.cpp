@@ -23,6 +23,14 @@ Value Initial(const Types& types, const Variable& variable, std::vector<ZORStrin
   return value;
 }
 
+void KeepMarked(std::vector<ZORString>& texts, const std::vector<char>& marks) {
+  std::size_t count = 0;
+  for (std::size_t i = 0; i < texts.size(); ++i) {
+    if (marks[i] != 0 && count++ != i) texts[count - 1] = std::move(texts[i]);
+  }
+  texts.resize(count);
+}
+
 }  // namespace
 
 Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(types), mModel(model) {
@@ -88,12 +96,14 @@ void Store::Hold(int variable, Listing listing) {
   mListed[static_cast<std::size_t>(variable)] = 1;
 }
 
-// A large network would hold every value twice. Candidates are no copies. The memory serves other listings.
+// A large network would hold every value twice. Candidates are no copies. Small listings leave their memory to others.
 void Store::ForgetListings() {
+  constexpr std::size_t kMostRoom = 32;
   for (const int variable : mKept) {
     std::unique_ptr<Listing>& held = mListings[static_cast<std::size_t>(variable)];
     if (held == nullptr || HasCandidates(variable)) continue;
-    mForgotten.push_back(std::move(held));
+    if (held->texts.capacity() + held->numbers.capacity() <= kMostRoom) mForgotten.push_back(std::move(held));
+    held.reset();
     mListed[static_cast<std::size_t>(variable)] = 0;
   }
   mKept.clear();
@@ -283,6 +293,27 @@ void Store::MeetTexts(int variable, std::vector<ZORString> texts) {
   const std::size_t count = texts.size();
   Hold(variable, {true, std::move(texts), {}, 0, count, (*this)[variable].Sort()});
   Keep(variable);
+}
+
+// A set loses the others in place, and so does its listing. A few go one by one, which is less work than a new set.
+void Store::KeepTexts(int variable, const std::vector<char>& kept) {
+  constexpr std::ptrdiff_t kFew = 16;
+  Listing& listing = *mListings[static_cast<std::size_t>(variable)];
+  if ((*this)[variable].Sort() != Sort::TextSet) {
+    std::vector<ZORString> texts = listing.texts;
+    KeepMarked(texts, kept);
+    return MeetTexts(variable, std::move(texts));
+  }
+  Edit(variable, [&](Value& value) {
+    const bool areFew = std::count(kept.begin(), kept.end(), 0) <= kFew;
+    for (std::size_t i = kept.size(); areFew && i-- > 0;) {
+      if (kept[i] == 0) value.Text().RemoveExactValue(listing.texts[i]);
+    }
+    KeepMarked(listing.texts, kept);
+    if (!areFew) value.SetTexts(listing.texts);
+  });
+  listing.count = listing.texts.size();
+  mListed[static_cast<std::size_t>(variable)] = 1;
 }
 
 void Store::MeetNumbers(int variable, std::vector<ZORLong> numbers) {

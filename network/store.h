@@ -76,6 +76,7 @@ class Store {
   void StartOperation(Operation operation);
   void Meet(int variable, const Value& outcome);
   void MeetTexts(int variable, std::vector<ZORString> texts);           // ascending; none is a contradiction
+  void KeepTexts(int variable, const std::vector<char>& kept);          // of those that List answers; at least one
   void MeetNumbers(int variable, std::vector<ZORLong> numbers);         // so are these; of an interval both ends
   void Bound(int variable, std::int64_t lowest, std::int64_t highest);  // keeps the numbers from one to the other
   void Fail(int variable);

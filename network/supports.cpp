@@ -286,17 +286,8 @@ void Supports::Meet(Column& column) {
   } else if (column.HasNone()) {
     mStore.Fail(column.variable);
   } else if (!column.HasAll() || column.listing == &column.clamped) {
-    IsText(column.listing->sort) ? MeetTexts(column) : MeetNumbers(column);
+    IsText(column.listing->sort) ? mStore.KeepTexts(column.variable, column.kept) : MeetNumbers(column);
   }
-}
-
-void Supports::MeetTexts(Column& column) {
-  std::vector<ZORString> texts;
-  texts.reserve(column.kept.size() - column.dropped);
-  for (std::size_t i = 0; i < column.kept.size(); ++i) {
-    if (column.kept[i] != 0) texts.push_back(column.listing->texts[i]);
-  }
-  mStore.MeetTexts(column.variable, std::move(texts));
 }
 
 void Supports::MeetNumbers(Column& column) {

@@ -84,7 +84,6 @@ class Supports {
 
   void Apply(const Constraint& constraint);
   void Meet(Column& column);
-  void MeetTexts(Column& column);
   void MeetNumbers(Column& column);
   void MeetFound(Column& column);
   std::size_t Inputs() const { return mColumnOf.size() - 1; }

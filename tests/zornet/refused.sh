@@ -24,7 +24,7 @@ judge() {
     "$expected") without_times "$folder/out" | cmp -s - "$folder/expected" && return ;;
     7) grep -q 'out of memory' "$folder/out" "$folder/err" && return ;;
     134) [ "$number" -lt 20 ] && grep -q bad_alloc "$folder/err" && return ;;  # before the program itself begins
-    2 | 4) grep -qiE 'memory|not found|cannot create shared object' "$folder/out" "$folder/err" && return ;;
+    2 | 4) grep -qiE 'memory|not found|cannot (create|open) shared object' "$folder/out" "$folder/err" && return ;;
   esac
   echo "allocation $number refused: exit $code" "$(head -3 "$folder/err")" >&2
   faults=1

@@ -2,6 +2,7 @@
 // asking stands in program.md.
 #include <gtest/gtest.h>
 #include <sys/wait.h>
+#include <unistd.h>
 
 #include <array>
 #include <cstdio>
@@ -36,6 +37,10 @@ std::string Quoted(const fs::path& path) {
   std::string quoted = path.string();
   quoted.insert(quoted.begin(), '\'');
   return quoted += '\'';
+}
+// Of this run, since others may test at the same time.
+fs::path OwnFolder(const std::string& name) {
+  return fs::canonical(testing::TempDir()) / (name + '-' + std::to_string(getpid()));
 }
 std::string Example(const std::string& name) { return Quoted(kExamples / (name + ".szn")); }
 Ran RunModel(const std::string& model, const std::string& arguments) {
@@ -80,7 +85,7 @@ TEST(Program, HugeModels) {
 
 // A dot that ends before it has read its graph.
 TEST(Program, PictureThatFails) {
-  const fs::path folder = fs::path(testing::TempDir()) / "zornet-dot";
+  const fs::path folder = OwnFolder("zornet-dot");
   fs::create_directories(folder);
   std::ofstream(folder / "dot") << "#!/bin/sh\nexit 1\n";
   fs::permissions(folder / "dot", fs::perms::owner_all);
@@ -95,7 +100,7 @@ TEST(Program, PictureThatFails) {
 
 // Copies of the program and of the libraries that it links find no module, unless they are told where to look.
 TEST(Program, ModuleNotFound) {
-  const fs::path root = fs::canonical(testing::TempDir()) / "zornet-alone", bin = root / "bin", lib = root / "lib";
+  const fs::path root = OwnFolder("zornet-alone"), bin = root / "bin", lib = root / "lib";
   const fs::path home = fs::path(kProgram).parent_path();
   fs::remove_all(root);
   fs::create_directories(bin);

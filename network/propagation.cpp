@@ -94,7 +94,8 @@ Status Propagation::Narrow(int constraint) {
   mStore.StartConstraint(constraint);
   const Constraint& posted = mModel.Constraints()[static_cast<std::size_t>(constraint)];
   Status status = Narrow(posted);
-  if (status != Status::Subsumed && !mStore.HasFailed() && mShapes.Narrow(posted)) status = Status::Again;
+  const bool isOpen = status != Status::Subsumed && !mStore.HasFailed();
+  if (isOpen && (mShapes.Narrow(posted) || mStore.WasFitted())) status = Status::Again;
   if (status == Status::Subsumed) {
     mStates[static_cast<std::size_t>(constraint)] = Finished;
     mFinished.push_back(constraint);

@@ -399,7 +399,10 @@ void Store::HoldShape(int variable, Shape shape) {
 // What has become listed may be narrower than the shape it had, and wider.
 void Store::FitToShape(int variable) {
   const int shape = mShapeOf[static_cast<std::size_t>(variable)];
-  if (shape != kNone && !HasFailed()) MeetShape(variable, mShapes[static_cast<std::size_t>(shape)]);
+  if (shape == kNone || HasFailed()) return;
+  const std::size_t touched = mTouched.size();
+  MeetShape(variable, mShapes[static_cast<std::size_t>(shape)]);
+  mFitted = mFitted || mTouched.size() != touched;
 }
 
 // Null when there are none. Until they come back the listing is not to be read.

@@ -70,6 +70,7 @@ class Store {
   // Changes are recorded under the constraint and operation named last.
   void StartConstraint(int constraint) {
     mConstraint = constraint;
+    mFitted = false;
     if (mKeptValues > kMostKept) ForgetListings();
     if (!mLimitsMet.empty()) ForgetLimits();
   }
@@ -100,6 +101,7 @@ class Store {
   Shape ShapeOf(int variable);                 // of a text; listed texts and nothing known have one too
   const Shape* HeldShape(int variable) const;  // of a text that is not listed; null when nothing is known of it
   void MeetShape(int variable, const Shape& shape);
+  bool WasFitted() const { return mFitted; }  // a shape took away what the constraint named last had left
 
   bool HasFailed() const { return mFailed != kNone; }
   int Failed() const { return mFailed; }  // the variable that became Nil, or kNone
@@ -186,6 +188,7 @@ class Store {
   Operation mOperation = Operation::Choice;
   int mFailed = kNone;
   int mFailedConstraint = kNone;
+  bool mFitted = false;
 };
 
 }  // namespace zornet

@@ -26,7 +26,6 @@ Propagation::Propagation(Store& store, const Limits& limits)
       mTables(store),
       mShapes(store) {
   Connect();
-  mShavings.resize(mModel.Variables().size(), 0);
   mStates.resize(mModel.Constraints().size(), Idle);
   mQueue.resize(mModel.Constraints().size());
   for (std::size_t i = 0; i < mModel.Constraints().size(); ++i) Wake(static_cast<int>(i));
@@ -143,6 +142,7 @@ void Propagation::WakeReaders(int except) {
 bool Propagation::IsShaved(int variable) {
   const Value& value = mStore[variable];
   if (value.Sort() != Sort::Interval || value.IsOne()) return false;
+  if (mShavings.empty()) mShavings.resize(mModel.Variables().size(), 0);
   unsigned& shavings = mShavings[static_cast<std::size_t>(variable)];
   if (shavings++ == 0) mShaved.push_back(variable);
   if (shavings == kMostShavings + 1) mStore.MeetLimit(Limit::Narrowings, variable, 0, kMostShavings);

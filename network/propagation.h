@@ -73,7 +73,7 @@ class Propagation {
   std::vector<std::uint32_t> mFirstReader;
 
   static constexpr unsigned kMostShavings = 4096;
-  std::vector<unsigned> mShavings;  // by variable: changes of an interval in this run
+  std::vector<unsigned> mShavings;  // by variable: changes of an interval in this run; empty before the first
   std::vector<int> mShaved;         // the variables that have some
 
   enum State : char { Idle, Waiting, Finished };

@@ -167,7 +167,7 @@ class Store {
   std::vector<Value> mFresh;
   std::vector<std::unique_ptr<Listing>> mListings;  // of the variables that were listed
   std::vector<char> mListed;                        // whether the listing is up to date
-  static constexpr std::size_t kMostKept = 1 << 16;
+  static constexpr std::size_t kMostKept = 1 << 13;
   std::vector<int> mKept;  // the variables that were listed since all listings were forgotten
   std::size_t mKeptValues = 0;
   std::vector<std::unique_ptr<Listing>> mForgotten;

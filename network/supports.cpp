@@ -248,7 +248,7 @@ void Supports::Choose(Column& column, std::size_t index) {
 }
 
 // Whether the target can take answer; where this combination gave it a value, it must be that one.
-bool Supports::Accept(std::size_t target, Answer answer) {
+bool Supports::Accept(std::size_t target, Answer&& answer) {
   Column& column = At(target);
   if (!column.IsListed()) {
     column.found.push_back(std::move(answer));

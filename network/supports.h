@@ -59,7 +59,7 @@ class Supports {
   bool TryOne(const Constraint& constraint, std::size_t target);
   bool Advance();
   void Choose(Column& column, std::size_t index);
-  bool Accept(std::size_t target, Answer answer);
+  bool Accept(std::size_t target, Answer&& answer);
   bool HasAll() const;
 
   double DrivenCost(const Constraint& constraint);

@@ -105,13 +105,12 @@ void Value::SetRange(ZORLong lowest, ZORLong highest) {
 }
 
 // The module answers one space for the bounds of a set that lists "" alone.
-ZORString Value::LowestText() const {
-  return mSort == Sort::TextSet && Text().IsEmpty() ? ZORString() : Text().GetLowerBound();
+ZORString Value::TextOfBound(ZORString bound) const {
+  return mSort == Sort::TextSet && IsLeastSomewhere(bound) && Text().IsEmpty() ? ZORString() : std::move(bound);
 }
 
-ZORString Value::HighestText() const {
-  return mSort == Sort::TextSet && Text().IsEmpty() ? ZORString() : Text().GetUpperBound();
-}
+ZORString Value::LowestText() const { return TextOfBound(Text().GetLowerBound()); }
+ZORString Value::HighestText() const { return TextOfBound(Text().GetUpperBound()); }
 
 // A text followed by a character less than the alphabet lies between that text and the next listed one, so asking from
 // there gives the next. The last text comes from the upper bound: a set never answers it as the next one.

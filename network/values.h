@@ -75,6 +75,7 @@ class Value {
 
  private:
   Value(const ZORVaDoObjectDescriptor* descriptor, zornet::Sort sort);
+  ZORString TextOfBound(ZORString bound) const;
   std::string ShowWithMax() const;
   std::string ShowEscaped() const;
 

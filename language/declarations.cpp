@@ -2,7 +2,6 @@
 #include <fmt/core.h>
 
 #include <algorithm>
-#include <functional>
 #include <iterator>
 #include <utility>
 
@@ -19,13 +18,6 @@ constexpr std::size_t kMostValues = 1 << 24;  // that named sets, files and arra
 Word::Type MemberType(Sort sort) {
   if (IsText(sort)) return Word::Text;
   return sort == Sort::Boolean ? Word::Truth : Word::Number;
-}
-
-template <class T>
-void SortUnique(std::vector<T>& values) {
-  if (std::adjacent_find(values.begin(), values.end(), std::greater_equal<>()) == values.end()) return;
-  std::sort(values.begin(), values.end());
-  values.erase(std::unique(values.begin(), values.end()), values.end());
 }
 
 }  // namespace
@@ -107,7 +99,6 @@ bool Resolver::SetIndices(const DeclarationSyntax& declaration, Named& named) {
 bool Resolver::SetType(TypeSyntax& type, Variable& variable) {
   if (type.HasName()) return SetNamedType(type.members.Words().front().token, variable);
   variable.texts = std::move(type.texts);
-  SortUnique(variable.texts);
   if (type.members.count == 0) return true;
   const std::span<const Word> members = type.members.Words();
   if (members.front().token.type == Token::Line && !Spend(members.size(), type.extent)) return false;

@@ -251,10 +251,11 @@ std::vector<std::string> Parser::TextsOf(std::span<const Word> words) {
     mViews.push_back(word.token.text);
   }
   if (mViews.size() == words.size()) {
-    std::sort(mViews.begin(), mViews.end());
+    SortUnique(mViews);
     texts.assign(mViews.begin(), mViews.end());
   } else {
     for (const Word& word : words) texts.push_back(Unescaped(word.token));
+    SortUnique(texts);
   }
   return texts;
 }

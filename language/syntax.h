@@ -1,8 +1,10 @@
 // The items of a model as they are written, before names are looked up.
 #pragma once
 
+#include <algorithm>
 #include <cstddef>
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <span>
 #include <string>
@@ -64,11 +66,19 @@ struct Word {
   Range members = {};  // of an Element its index, of a List what it holds, of Rows lists
 };
 
+// In ascending order, and each once.
+template <class T>
+void SortUnique(std::vector<T>& values) {
+  if (std::adjacent_find(values.begin(), values.end(), std::greater_equal<>()) == values.end()) return;
+  std::sort(values.begin(), values.end());
+  values.erase(std::unique(values.begin(), values.end()), values.end());
+}
+
 struct TypeSyntax {
   Sort sort = Sort::Text;
   Extent extent = {};
   Range members = {};                   // of a set; of an interval its two ends; of a named set its name
-  std::vector<std::string> texts = {};  // instead of the members, of a set in braces that holds nothing else
+  std::vector<std::string> texts = {};  // instead of the members, of a set in braces that holds nothing else; in order
 
   bool HasName() const { return members.count == 1 && members.Words().front().type == Word::Name; }
 };

@@ -186,5 +186,5 @@ void ZORString::DeleteAll(ZORString* const* texts, std::size_t count) noexcept {
 bool ZORString::KeepFreed(bool keep) {
   sKeeps = keep && kCanKeep;
   tCells.Keep(sKeeps);
-  return sKeeps;
+  return sKeeps && TextRange::IsThere();
 }

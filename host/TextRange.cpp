@@ -13,7 +13,7 @@ namespace zor {
 namespace {
 
 constinit std::mutex sMutex;  // for what follows
-bool sIsReserved = false;     // or it was tried
+bool sWasTried = false;       // to reserve it
 std::byte* sNext = nullptr;   // chunk
 std::size_t sLeft = 0;        // chunks
 Cell* sLists = nullptr;
@@ -28,6 +28,12 @@ void Chunk::Empty() {
   first = nullptr;
   fresh = reinterpret_cast<std::byte*>(this + 1);
   end = fresh + (kSize - sizeof(Chunk)) / sizeof(ZORString) * sizeof(ZORString);
+}
+
+bool TextRange::IsThere() {
+  const std::lock_guard lock(sMutex);
+  if (!std::exchange(sWasTried, true)) Reserve();
+  return sNext != nullptr;
 }
 
 void TextRange::HandOn(Cell* list, std::size_t count) {
@@ -48,9 +54,9 @@ Cell* TextRange::TakeList() {
 
 // Addresses become memory chunk by chunk.
 Chunk* TextRange::TakeChunk() {
+  if (!IsThere()) return nullptr;
   const std::lock_guard lock(sMutex);
   if (sChunks != nullptr) return std::exchange(sChunks, sChunks->next);
-  if (!std::exchange(sIsReserved, true)) Reserve();
   if (sLeft == 0 || mprotect(sNext, Chunk::kSize, PROT_READ | PROT_WRITE) != 0) return nullptr;
   auto* const chunk = new (sNext) Chunk;
   sNext += Chunk::kSize;

@@ -42,6 +42,7 @@ class TextRange {
   static bool Has(const void* memory) {
     return reinterpret_cast<std::uintptr_t>(memory) - sBegin.load(std::memory_order_relaxed) < kSize;
   }
+  static bool IsThere();  // not where the process may have only so many addresses
   static void HandOn(Cell* list, std::size_t count);
   static void HandOn(Chunk& chunk);
   static Cell* TakeList();            // null when there is none

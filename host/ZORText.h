@@ -58,9 +58,9 @@ class ZOR_EXPORT ZORString {
   static void* operator new(std::size_t, void* place) noexcept { return place; }
   static void operator delete(void* memory, std::size_t size) noexcept;
   static void DeleteAll(ZORString* const* strings, std::size_t count) noexcept;  // some may be null
-  // For programs that count or refuse allocations: new strings of the calling thread, and of threads that have had none
-  // yet, are blocks of the global operator new; or they are not any more. Answers whether memory is kept; with
-  // sanitizers it never is.
+  // For programs that count or refuse allocations: without keep, new strings of the calling thread, and of threads that
+  // have had none yet, are blocks of the global operator new. Answers whether memory is kept: never with sanitizers,
+  // nor where the process may have only so many addresses.
   static bool KeepFreed(bool keep);
 
   bool operator==(const ZORString& other) const;

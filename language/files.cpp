@@ -34,8 +34,7 @@ std::string DiskFiles::Read(const std::string& path) const {
   return text;
 }
 
-// In pieces, since some files have no end. One that is as long as expected comes in pieces as they remain, and a byte
-// more tells that it ends.
+// In pieces, since some files have no end. A file of the expected size is read with one byte more, which meets its end.
 std::string ReadText(std::istream& in, std::uintmax_t expected) {
   constexpr std::size_t kMegabyte = 1 << 20, kMostMegabytes = 256, kPiece = 1 << 16;
   std::string text;

@@ -15,7 +15,14 @@ namespace zornet {
 
 namespace {
 
-enum Classes : unsigned char { Letter = 1, Digit = 2, Mark = 4, Blank = 8, EndsRun = 16 };  // of characters
+enum Classes : unsigned char {
+  Letter = 1,
+  Digit = 2,
+  Mark = 4,
+  Blank = 8,
+  Comment = 16,
+  EndsRun = 32
+};  // of characters
 
 constexpr std::array<unsigned char, 256> kClasses = [] {
   std::array<unsigned char, 256> classes{};
@@ -26,7 +33,8 @@ constexpr std::array<unsigned char, 256> kClasses = [] {
   put("0123456789", Digit);
   put(",();:{}[]|=", Mark);
   put(" \t\n\v\f\r", Blank);
-  put("\"\n\\", EndsRun);  // of characters in a text
+  put("%/#", Comment);     // one may begin there
+  put("\"\n\\", EndsRun);  // in a text
   return classes;
 }();
 
@@ -100,7 +108,7 @@ void Lexer::SkipBlanks() {
     const char c = mText[mNext];
     if (Is(c, Blank)) {
       ++mNext;
-    } else if ((c != '%' && c != '/' && c != '#') || !SkipsComment()) {
+    } else if (!Is(c, Comment) || !SkipsComment()) {
       return;
     }
   }

@@ -47,7 +47,7 @@ Store::Store(const zornet::Types& types, const zornet::Model& model) : mTypes(ty
 const Listing& Store::List(int variable) {
   if (mListed[static_cast<std::size_t>(variable)] == 0) {
     Fill(variable, ListingOf(variable));
-    Keep(variable);
+    Remember(variable);
   }
   return *mListings[static_cast<std::size_t>(variable)];
 }
@@ -84,7 +84,8 @@ Listing& Store::ListingOf(int variable) {
   return *held;
 }
 
-void Store::Keep(int variable) {
+// The listing is good, until it is forgotten with all others.
+void Store::Remember(int variable) {
   const Listing& listing = *mListings[static_cast<std::size_t>(variable)];
   mListed[static_cast<std::size_t>(variable)] = 1;
   mKept.push_back(variable);
@@ -292,7 +293,7 @@ void Store::MeetTexts(int variable, std::vector<ZORString> texts) {
   if (!wasUndefined || mListed[static_cast<std::size_t>(variable)] != 0 || Count(variable) != texts.size()) return;
   const std::size_t count = texts.size();
   Hold(variable, {true, std::move(texts), {}, 0, count, (*this)[variable].Sort()});
-  Keep(variable);
+  Remember(variable);
 }
 
 // A set loses the others in place, and so does its listing. A few go one by one, which is less work than a new set.

@@ -143,7 +143,7 @@ class Store {
   Listing& ListingOf(int variable);
   void Fill(int variable, Listing& listing) const;
   void AddTexts(int variable, std::vector<ZORString>& texts) const;
-  void Keep(int variable);
+  void Remember(int variable);
   void Hold(int variable, Listing listing);
   void ForgetListings();
   static Measure MeasureOf(const Value& value);
